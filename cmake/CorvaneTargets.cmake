@@ -1,0 +1,30 @@
+# What every target of this repository has in common.
+
+add_library(corvane_options INTERFACE)
+target_compile_options(corvane_options INTERFACE
+  -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
+  # Brokers load provider libraries with RTLD_GLOBAL: whatever is exported can be interposed, and a
+  # unique-linkage symbol keeps the library mapped after dlclose.
+  -fvisibility=hidden $<$<COMPILE_LANGUAGE:CXX>:-fvisibility-inlines-hidden> -fno-gnu-unique)
+target_compile_definitions(corvane_options INTERFACE _FILE_OFFSET_BITS=64)
+target_include_directories(corvane_options INTERFACE ${PROJECT_SOURCE_DIR})
+
+if(CORVANE_SANITIZE)
+  target_compile_options(corvane_options INTERFACE
+    -fsanitize=${CORVANE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer -g)
+  target_link_options(corvane_options INTERFACE -fsanitize=${CORVANE_SANITIZE})
+endif()
+
+# The product's sources, compiled against one implementation of the six platform headers.
+# SEAM is the directory that holds these headers.
+function(corvane_product_objects name)
+  cmake_parse_arguments(ARG "GUARD" "SEAM" "" ${ARGN})
+  file(GLOB sources CONFIGURE_DEPENDS
+    ${PROJECT_SOURCE_DIR}/model/*.cpp ${PROJECT_SOURCE_DIR}/factory/*.cpp ${PROJECT_SOURCE_DIR}/providers/*.cpp)
+  add_library(${name} OBJECT ${sources})
+  target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
+  target_link_libraries(${name} PRIVATE corvane_options PUBLIC cmpi)
+  if(ARG_GUARD)
+    target_compile_definitions(${name} PRIVATE CORVANE_BROKER_GUARD)
+  endif()
+endfunction()
