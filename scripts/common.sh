@@ -1,0 +1,92 @@
+# What the scripts of this directory share. Sourced, not run.
+# shellcheck shell=bash disable=SC2034
+
+set -euo pipefail
+
+root=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
+logs=$root/build/logs
+jobs=$(nproc)
+failures=0
+
+# Overrides of the product that a user may have exported must not leak into what the scripts run.
+unset "${!CORVANE_@}"
+
+# CMake takes the launcher from here when it configures a build directory for the first time.
+if [[ -z ${CMAKE_CXX_COMPILER_LAUNCHER:-} ]] && command -v ccache >/dev/null; then
+  export CMAKE_CXX_COMPILER_LAUNCHER=ccache
+fi
+
+# Debian packages, by what they are needed for; docs/dependencies.md says why each is there.
+build_packages=(cmake g++ g++-multilib ninja-build nlohmann-json3-dev)
+test_packages=(googletest)
+check_packages=(clang-format clang-tidy)
+bench_packages=(dpkg-dev)
+
+die() {
+  printf 'scripts/%s: %s\n' "${0##*/}" "$*" >&2
+  exit 1
+}
+
+# The usage text of a script is its own leading comment.
+usage() { sed -n '2,/^$/{s/^# \{0,1\}//p;}' "$0"; }
+
+# step NAME COMMAND...: runs a command with its output in a log. One line when it succeeds, the whole
+# log when it fails; the caller decides whether to go on.
+step() {
+  local name=$1 log start=$SECONDS
+  shift
+  log=$logs/${name//[^A-Za-z0-9]/-}.log
+  mkdir -p "$logs"
+  printf '%-32s ' "$name"
+  if "$@" >"$log" 2>&1 </dev/null; then
+    printf 'ok %5d s\n' $((SECONDS - start))
+    return 0
+  fi
+  printf 'FAILED %d s\n\n' $((SECONDS - start))
+  cat "$log"
+  printf '\n%s failed. The log above is kept in %s\n\n' "$name" "$log"
+  failures=$((failures + 1))
+  return 1
+}
+
+# installed PACKAGE: whether dpkg has it.
+installed() { dpkg-query -W -f '${db:Status-Status}\n' "$1" 2>/dev/null | grep -qx installed; }
+
+apt_install() {
+  local as_root=()
+  ((EUID == 0)) || as_root=(sudo)
+  "${as_root[@]}" apt-get -o DPkg::Lock::Timeout=300 update &&
+    "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
+      apt-get -o DPkg::Lock::Timeout=300 -y --no-install-recommends install "$@"
+}
+
+# need PACKAGE...: installs the Debian packages that are missing; no apt call when none is.
+need() {
+  local missing=() package
+  command -v dpkg-query >/dev/null || die "no dpkg on this system; install the counterparts of: $*"
+  for package; do
+    installed "$package" || missing+=("$package")
+  done
+  ((${#missing[@]})) || return 0
+  if ((EUID != 0)) && ! command -v sudo >/dev/null; then
+    die "missing packages, and neither root nor sudo to install them: apt-get install ${missing[*]}"
+  fi
+  printf 'Missing packages: %s\n' "${missing[*]}"
+  ((EUID == 0)) || sudo -v
+  step "install packages" apt_install "${missing[@]}" ||
+    die "could not install ${missing[*]}; install them by hand and run this again"
+}
+
+# configure PRESET [-DNAME=VALUE...]
+configure() {
+  local preset=$1
+  shift
+  step "$preset: configure" env -C "$root" cmake --preset "$preset" "$@"
+}
+
+# build PRESET [TARGET...]
+build() {
+  local preset=$1
+  shift
+  step "$preset: build" cmake --build "$root/build/$preset" -j "$jobs" ${1+--target "$@"}
+}
