@@ -1,0 +1,296 @@
+#include <CPU.h>
+#include <tarn/Instrumentation.h>
+
+#include <exception>
+#include <iostream>
+#include <utility>
+
+#include "ModelEvents.h"
+
+namespace Tarn::CPUProvider {
+
+namespace {
+
+using namespace NodeLexicon;
+
+void report(bool set, const char* failure, unsigned int line, const char* function) {
+  if (!set) {
+    modelEvents.message(LevelWarning, failure, line, function);
+  }
+}
+
+/// Fills one record from the node that a cursor stands on. A value that cannot be set is reported,
+/// and the record goes on; a property that the node does not have leaves its field alone.
+template <class Record>
+class RecordFiller {
+ public:
+  RecordFiller(const Instrumentation& node, Record& record, const char* function)
+      : node_(node), record_(record), function_(function) {}
+
+  template <class Value>
+  void set(bool (Record::*setter)(Value), Value value, const char* failure,
+           unsigned int line = __builtin_LINE()) const {
+    report((record_.*setter)(std::move(value)), failure, line, function_);
+  }
+
+  template <class Value>
+  bool copy(Properties property, bool (Record::*setter)(Value), const char* failure,
+            unsigned int line = __builtin_LINE()) const {
+    Value value{};
+    if (!node_.getProperty(property, value)) {
+      return false;
+    }
+    set<Value>(setter, std::move(value), failure, line);
+    return true;
+  }
+
+  /// For counts that must not stay unset: here it is the missing property that is reported.
+  void copyCount(Properties property, bool (Record::*setter)(unsigned int), const char* failure,
+                 unsigned int line = __builtin_LINE()) const {
+    unsigned int count = 0;
+    if (!node_.getProperty(property, count)) {
+      report(false, failure, line, function_);
+      count = 0;
+    }
+    (record_.*setter)(count);
+  }
+
+ private:
+  const Instrumentation& node_;
+  Record& record_;
+  const char* function_;
+};
+
+std::string printablePath(const Instrumentation& node) {
+  return node.convertPathToString(node.getPathToNode());
+}
+
+constexpr unsigned int statusUnknown = 0;
+constexpr unsigned int statusEmptySocket = 15;
+
+bool isInUse(unsigned int status) {
+  return status != statusUnknown && status != statusEmptySocket;
+}
+
+/// A virtual machine's processor model says nothing about the hardware.
+void setFamilyAndName(const Instrumentation& node, Processor& processor, bool isVirtual, const char* function) {
+  constexpr unsigned int familyUnknown = 2;
+  const RecordFiller<Processor> fill(node, processor, function);
+
+  unsigned int family = 0;
+  if (node.getProperty(PropFamily, family)) {
+    if (isVirtual) {
+      modelEvents.message(LevelWarning, "Its a Virtual Machine set the Family as Unknown", __builtin_LINE(), function);
+      family = familyUnknown;
+    }
+    fill.set(&Processor::setFamily, family, "Failed while setting Processor Family");
+  }
+
+  std::string name;
+  if (node.getProperty(PropProcessorName, name)) {
+    if (isVirtual) {
+      modelEvents.message(LevelWarning, "Its a Virtual Machine set the Family as Unknown", __builtin_LINE(), function);
+      name = "Unknown";
+    }
+    processor.setName(std::move(name));
+  }
+}
+
+void setStates(const Instrumentation& node, Processor& processor, const char* function) {
+  const RecordFiller<Processor> fill(node, processor, function);
+  const unsigned int status = node.getNodeStatus();
+  if (status == statusUnknown) {
+    processor.setRequestedState(0);
+    return;
+  }
+  fill.set(&Processor::setCPUStatus, status, "Failed while setting CPU Status");
+  fill.set(&Processor::setEnabledState, status, "Failed while setting CPU Enabled State");
+  fill.set(&Processor::setOperationalStatus, status, "Failed while setting CPU OperationalStatus");
+  fill.set(&Processor::setHealthState, status, "Failed while setting CPU Health State");
+  fill.set(&Processor::setRequestedState, status, "Failed while setting CPU Requested State");
+}
+
+void setUniqueId(const Instrumentation& node, Processor& processor, const char* function) {
+  std::string raw;
+  if (node.getProperty(PropProcessorId, raw)) {
+    std::string uniqueId;
+    FormatUniqueId(raw, uniqueId);
+    RecordFiller<Processor>(node, processor, function)
+        .set(&Processor::setUniqueId, std::move(uniqueId), "Failed while setting CPU Unique Id");
+  }
+}
+
+void setRequestedStatesSupported(const Instrumentation& node, Processor& processor, const char* function) {
+  std::vector<unsigned int> states;
+  if (node.getProperty(PropRequestedStatesSupported, states)) {
+    report(processor.setRequestedStatesSupported(states), "Failed while setting Supported Status", __builtin_LINE(),
+           function);
+  }
+}
+
+Processor readProcessor(const Instrumentation& node, const char* function) {
+  Processor processor;
+  const RecordFiller<Processor> fill(node, processor, function);
+  const std::string path = printablePath(node);
+  fill.set(&Processor::setProcessorDeviceID, path, "Failed while setting Device ID");
+  fill.set(&Processor::setInstanceId, "NERITH:" + path, "Failed while setting Instance Id");
+  setFamilyAndName(node, processor, checkIfVirtual(), function);
+  fill.copy(PropCurrentClockSpeed, &Processor::setCurrentClockSpeed, "Failed while setting Current Clock Speed");
+  fill.copy(PropMaxClockSpeed, &Processor::setMaxClockSpeed, "Failed while setting Maximum Clock Speed");
+  fill.copy(PropExternalClockSpeed, &Processor::setExternalClockSpeed, "Failed while setting External Clock Speed");
+  setStates(node, processor, function);
+  fill.set(&Processor::setElementName, node.getNodeDescription(), "Failed while setting CPU Element Name");
+  fill.copy(PropDataWidth, &Processor::setDataWidth, "Failed while setting CPU Data Width");
+  if (!fill.copy(PropAddressWidth, &Processor::setAddressWidth, "Failed while setting CPU Address width")) {
+    fill.copy(PropDataWidth, &Processor::setAddressWidth, "Failed while setting CPU Address width");
+  }
+  fill.copy(PropStepping, &Processor::setStepping, "Failed while setting CPU Stepping");
+  setUniqueId(node, processor, function);
+  fill.copy(PropUpgradeMethod, &Processor::setUpgradeMethod, "Failed while setting CPU Upgrade method");
+  setRequestedStatesSupported(node, processor, function);
+  fill.copyCount(PropProcessorCores, &Processor::setNumberOfProcessorCores,
+                 "Failed while setting Number of Processor cores");
+  fill.copyCount(PropEnabledCores, &Processor::setNumberOfEnabledCores,
+                 "Failed while setting Number of Enabled Processor cores");
+  fill.copyCount(PropHardwareThreads, &Processor::setNumberOfHardwareThreads,
+                 "Failed while setting Number of Hardware Threads");
+  return processor;
+}
+
+Memory readMemory(const Instrumentation& node, const char* function) {
+  Memory memory;
+  const RecordFiller<Memory> fill(node, memory, function);
+  fill.set(&Memory::setMemoryDeviceID, printablePath(node), "Failed while setting Memory Device ID");
+  fill.copy(PropCacheBlockSize, &Memory::setBlockSize, "Failed while setting Cache Block size");
+  fill.copy(PropCacheConsumableBlocks, &Memory::setConsumableBlocks, "Failed while setting Cache Consumable blocks");
+  fill.copy(PropCacheNumberOfBlocks, &Memory::setNumberOfBlocks, "Failed while setting Cache Numbe of blocks");
+
+  const unsigned int status = node.getNodeStatus();
+  if (status == statusUnknown) {
+    memory.setRequestedState(0);
+  } else {
+    fill.set(&Memory::setEnabledState, status, "Failed while setting Cache Enabled State");
+    fill.set(&Memory::setOperationalStatus, status, "Failed while setting Cache OperationalStatus");
+    fill.set(&Memory::setHealthState, status, "Failed while setting Cache Health State");
+    fill.set(&Memory::setRequestedState, status, "Failed while setting Cache Requested State");
+  }
+
+  fill.set(&Memory::setElementName, node.getNodeDescription(), "Failed while setting Cache Element Name");
+  fill.copy(PropCacheAssociativity, &Memory::setCacheAssociativity, "Failed while setting Cache Associativity");
+  fill.copy(PropCacheType, &Memory::setCacheType, "Failed while setting Cache Type");
+  fill.copy(PropCacheWritePolicy, &Memory::setCacheWritePolicy, "Failed while setting Cache Write Policy");
+  fill.copy(PropCacheLevel, &Memory::setCacheLevel, "Failed while setting Cache Level");
+  fill.copy(PropCacheName, &Memory::setCacheName, "Failed while setting Cache Name");
+  return memory;
+}
+
+ProcessorCore readCore(const Instrumentation& node, const char* function) {
+  ProcessorCore core;
+  const RecordFiller<ProcessorCore> fill(node, core, function);
+  fill.set(&ProcessorCore::setInstanceID, printablePath(node), "Failed while setting Instance Id");
+  fill.set(&ProcessorCore::setElementName, node.getNodeDescription(),
+           "Failed while setting Processor Core Element Name");
+
+  const unsigned int status = node.getNodeStatus();
+  if (status == statusUnknown) {
+    core.setRequestedState(0);
+    return core;
+  }
+  fill.set(&ProcessorCore::setCoreEnabledState, status, "Failed while setting Core enabled state");
+  fill.set(&ProcessorCore::setEnabledState, status, "Failed while setting CPU Enabled State");
+  fill.set(&ProcessorCore::setOperationalStatus, status, "Failed while setting CPU OperationalStatus");
+  fill.set(&ProcessorCore::setHealthState, status, "Failed while setting CPU Health State");
+  fill.set(&ProcessorCore::setRequestedState, status, "Failed while setting CPU Core RequestedState");
+  return core;
+}
+
+}  // namespace
+
+unsigned short getProcessorInstances(std::vector<Processor>& processors) {
+  modelEvents.entering({{" processors=", &processors}});
+  unsigned short result = 1;
+  try {
+    Instrumentation node;
+    node.selectNode(NodeProcessor);
+    const bool found = static_cast<bool>(node);
+    for (; node; ++node) {
+      if (isInUse(node.getNodeStatus())) {
+        processors.push_back(readProcessor(node, __func__));
+      } else {
+        modelEvents.message(LevelWarning, "Dummy CPU Instance");
+      }
+    }
+    result = found ? 0 : 1;
+  } catch (...) {
+    modelEvents.message(LevelError, "Caught Exception");
+  }
+  modelEvents.exiting({{" processors=", &processors}});
+  return result;
+}
+
+unsigned short getMemoryInstances(std::vector<Memory>& memories) {
+  modelEvents.entering({{" memories=", &memories}});
+  unsigned short result = 1;
+  try {
+    Instrumentation node;
+    node.selectNode(NodeCacheMemory);
+    const bool found = static_cast<bool>(node);
+    for (; node; ++node) {
+      memories.push_back(readMemory(node, __func__));
+    }
+    result = found ? 0 : 1;
+  } catch (const std::exception& error) {
+    std::cerr << error.what() << std::endl;
+  }
+  modelEvents.exiting({{" memories=", &memories}});
+  return result;
+}
+
+unsigned short getProcessorCoreInstances(std::vector<ProcessorCore>& cores) {
+  modelEvents.entering({{" procCores=", &cores}});
+  unsigned short result = 1;
+  try {
+    Instrumentation node;
+    node.selectNode(NodeProcessorCore);
+    const bool found = static_cast<bool>(node);
+    for (; node; ++node) {
+      cores.push_back(readCore(node, __func__));
+    }
+    result = found ? 0 : 1;
+  } catch (...) {
+    modelEvents.message(LevelError, "Caught Exception: ");
+  }
+  modelEvents.exiting({{" procCores=", &cores}});
+  return result;
+}
+
+bool checkIfVirtual() {
+  modelEvents.entering();
+  Instrumentation system;
+  system.selectNode(NodeSystem);
+  bool isVirtual = false;
+  if (system) {
+    std::string model;
+    system.getProperty(PropSystemModel, model);
+    modelEvents.variable("model", model.c_str());
+    isVirtual = model.find("Virtual") != std::string::npos;
+    if (isVirtual) {
+      modelEvents.message(LevelWarning, "VMWARE MACHINE");
+    }
+  }
+  modelEvents.exiting();
+  return isVirtual;
+}
+
+void FormatUniqueId(std::string& in, std::string& out) {
+  modelEvents.entering();
+  for (const char character : in) {
+    if (character != ' ') {
+      const bool isLower = character >= 'a' && character <= 'z';
+      out += isLower ? static_cast<char>(character - 'a' + 'A') : character;
+    }
+  }
+  modelEvents.exiting();
+}
+
+}  // namespace Tarn::CPUProvider
