@@ -1,0 +1,16 @@
+#ifndef TARN_INVENTORY_LIVESOURCE_H
+#define TARN_INVENTORY_LIVESOURCE_H
+
+#include "platform/instrumentation/FileSystem.h"
+#include "platform/instrumentation/Tree.h"
+
+namespace Tarn::Inventory {
+
+/// The inventory that the kernel tells about below sys/ and proc/ of a root. docs/inventory.md says
+/// where every value comes from. What could not be read is left out and noted in Tree::unread.
+/// Throws InventoryError only if nothing at all tells of a processor.
+Tree readLiveInventory(FileSystem& root);
+
+}  // namespace Tarn::Inventory
+
+#endif

@@ -1,0 +1,22 @@
+#ifndef TARN_INVENTORY_PROCESSTREE_H
+#define TARN_INVENTORY_PROCESSTREE_H
+
+#include <memory>
+
+#include "platform/instrumentation/Tree.h"
+
+namespace Tarn::Inventory {
+
+/// The tree that this process's cursors walk. The first call loads it, from the source that the
+/// override CORVANE_INVENTORY or else the configuration key "inventory" names, by default "live"; later
+/// calls share it. Throws std::exception's children if it can not be loaded; the next call tries again.
+/// Safe from several threads.
+std::shared_ptr<const Tree> processTree();
+
+/// For the host and for tests: cursors made from now on walk this tree; cursors that are there keep
+/// theirs. nullptr: the next cursor loads the tree anew.
+void setProcessTree(std::shared_ptr<const Tree> tree);
+
+}  // namespace Tarn::Inventory
+
+#endif

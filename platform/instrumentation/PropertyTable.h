@@ -1,0 +1,44 @@
+#ifndef TARN_INVENTORY_PROPERTYTABLE_H
+#define TARN_INVENTORY_PROPERTYTABLE_H
+
+#include <tarn/NodeLexicon.h>
+
+#include <span>
+#include <string_view>
+
+namespace Tarn::Inventory {
+
+enum class PropertyKind { Number, Text, List };
+
+/// What is known about a property: its name in JSON, its kind, and the one type of node that has it.
+struct PropertyEntry {
+  NodeLexicon::Properties id;
+  NodeLexicon::NodeType nodeType;
+  PropertyKind kind;
+  std::string_view name;
+};
+
+/// All properties, sorted by number.
+std::span<const PropertyEntry> propertyTable();
+
+/// nullptr where there is no such property.
+const PropertyEntry* findProperty(NodeLexicon::Properties id);
+const PropertyEntry* findProperty(std::string_view name);
+
+/// "number", "text" or "list of numbers".
+std::string_view kindName(PropertyKind kind);
+
+struct NodeTypeEntry {
+  NodeLexicon::NodeType type;
+  std::string_view name;  ///< "system", "processor", "core" or "cache"
+};
+
+/// All node types.
+std::span<const NodeTypeEntry> nodeTypeTable();
+
+/// "node" for a type that there is not.
+std::string_view nodeTypeName(NodeLexicon::NodeType type);
+
+}  // namespace Tarn::Inventory
+
+#endif

@@ -1,0 +1,22 @@
+#ifndef TARN_INVENTORY_SOURCE_H
+#define TARN_INVENTORY_SOURCE_H
+
+#include <string_view>
+
+#include "platform/instrumentation/Tree.h"
+
+namespace Tarn::Inventory {
+
+/// Reads the inventory that the text names:
+///
+///     live          this machine
+///     root:DIR      a captured root directory that holds sys/ and proc/
+///     root:FILE     the same in one file (Archive.h)
+///     json:FILE     a tree written as JSON (JsonTree.h)
+///
+/// Throws InventoryError where the text names no source, or its source can not be read.
+Tree loadInventory(std::string_view specification);
+
+}  // namespace Tarn::Inventory
+
+#endif

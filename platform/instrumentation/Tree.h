@@ -1,0 +1,123 @@
+#ifndef TARN_INVENTORY_TREE_H
+#define TARN_INVENTORY_TREE_H
+
+#include <tarn/NodeLexicon.h>
+
+#include <array>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/instrumentation/CpuSet.h"
+
+namespace Tarn::Inventory {
+
+/// A node's place in the tree. Nodes stand in depth-first order: a node's descendants follow it.
+using NodeIndex = unsigned int;
+inline constexpr NodeIndex noNode = ~0U;
+
+/// Node states that the sources deliver. 0 is never delivered for something that exists.
+namespace Status {
+inline constexpr unsigned int inUse = 1;
+inline constexpr unsigned int offline = 12;
+inline constexpr unsigned int emptySocket = 15;
+inline constexpr unsigned int disabled = 16;
+inline constexpr unsigned int failed = 24;
+}  // namespace Status
+
+template <class Value>
+struct Property {
+  NodeLexicon::Properties id;
+  Value value;
+  bool operator==(const Property&) const = default;
+};
+using NumberProperty = Property<unsigned int>;
+using TextProperty = Property<std::string>;
+using ListProperty = Property<std::vector<unsigned int>>;
+
+/// A stretch of one of the tree's property tables.
+struct PropertyRange {
+  unsigned int begin = 0;
+  unsigned int end = 0;
+  bool operator==(const PropertyRange&) const = default;
+};
+
+struct Node {
+  NodeLexicon::NodeType type;
+  unsigned int status = Status::inUse;
+  NodeIndex parent = noNode;
+  NodeIndex end = 0;  ///< one past the last node below this one
+  std::string internalPath;
+  std::string description;
+  CpuSet cpus;  ///< the logical CPUs of the part, or that share the cache; empty where unknown
+  PropertyRange numbers;
+  PropertyRange texts;
+  PropertyRange lists;
+
+  /// The path as people see it.
+  std::string_view path() const { return std::string_view(internalPath).substr(1); }
+
+  bool operator==(const Node&) const = default;
+};
+
+/// Something that a source wanted to read and could not, for people.
+struct Unread {
+  std::string file;    ///< what could not be read
+  std::string reason;  ///< why
+  std::string remedy;  ///< what would make it readable
+  bool operator==(const Unread&) const = default;
+};
+
+/// The inventory: system, processors, and below each processor its cores and caches. Immutable once
+/// built (by TreeBuilder), so any number of threads may read it.
+class Tree {
+ public:
+  Tree();
+
+  std::span<const Node> nodes() const { return nodes_; }
+  const Node& node(NodeIndex index) const { return nodes_[index]; }
+
+  /// The nodes of one type in tree order, ascending. Empty for a type that the tree does not know.
+  std::span<const NodeIndex> ofType(NodeLexicon::NodeType type) const;
+
+  /// The node with this internal path, or noNode.
+  NodeIndex find(std::string_view internalPath) const;
+
+  /// The node's properties of each kind, sorted by number.
+  std::span<const NumberProperty> numbers(const Node& node) const { return stretch(numbers_, node.numbers); }
+  std::span<const TextProperty> texts(const Node& node) const { return stretch(texts_, node.texts); }
+  std::span<const ListProperty> lists(const Node& node) const { return stretch(lists_, node.lists); }
+
+  /// One property; nullptr where the node has none of that number and kind.
+  const unsigned int* number(const Node& node, NodeLexicon::Properties id) const;
+  const std::string* text(const Node& node, NodeLexicon::Properties id) const;
+  const std::vector<unsigned int>* list(const Node& node, NodeLexicon::Properties id) const;
+
+  std::span<const Unread> unread() const { return unread_; }
+
+  bool operator==(const Tree&) const = default;
+
+ private:
+  friend class TreeBuilder;
+
+  static constexpr unsigned int nodeTypes = 4;
+  static unsigned int slot(NodeLexicon::NodeType type);
+
+  template <class Value>
+  static std::span<const Value> stretch(const std::vector<Value>& table, PropertyRange range) {
+    return std::span(table).subspan(range.begin, range.end - range.begin);
+  }
+
+  std::vector<Node> nodes_;
+  std::vector<NumberProperty> numbers_;
+  std::vector<TextProperty> texts_;
+  std::vector<ListProperty> lists_;
+  std::array<std::vector<NodeIndex>, nodeTypes> byType_;
+  std::vector<NodeIndex> byPath_;  // sorted by path
+  std::vector<Unread> unread_;
+};
+
+}  // namespace Tarn::Inventory
+
+#endif
