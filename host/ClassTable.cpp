@@ -1,0 +1,249 @@
+#include "host/ClassTable.h"
+
+#include "host/broker/Names.h"
+
+#include <algorithm>
+#include <array>
+#include <iterator>
+
+namespace Corvcim {
+namespace {
+
+constexpr std::string_view cpuLibrary = "corvcpuprofileprovider";
+constexpr std::string_view systemLibrary = "corvcomputersystemprovider";
+
+constexpr std::string_view cpuGroup = "cpu";
+constexpr std::string_view systemGroup = "system";
+// The processor-cache association answers only as long as nobody collected cores in its process.
+constexpr std::string_view cacheAssociationGroup = "cpu-cache";
+
+constexpr bool key = true;
+
+constexpr PropertyDefinition computerSystemProperties[] = {
+    {"CreationClassName", CMPI_string, key, {}},
+    {"Name", CMPI_string, key, {}},
+    {"Caption", CMPI_string, false, {}},
+    {"Description", CMPI_string, false, {}},
+    {"ElementName", CMPI_string, false, {}},
+    {"Model", CMPI_string, false, {}},
+    {"Manufacturer", CMPI_string, false, {}},
+    {"EnabledState", CMPI_uint16, false, {}},
+    {"RequestedState", CMPI_uint16, false, {}},
+    {"HealthState", CMPI_uint16, false, {}},
+    {"OperationalStatus", CMPI_uint16A, false, {}},
+};
+
+constexpr PropertyDefinition processorProperties[] = {
+    {"CreationClassName", CMPI_string, key, {}},
+    {"DeviceID", CMPI_string, key, {}},
+    {"SystemCreationClassName", CMPI_string, key, {}},
+    {"SystemName", CMPI_string, key, {}},
+    {"Caption", CMPI_string, false, {}},
+    {"Description", CMPI_string, false, {}},
+    {"ElementName", CMPI_string, false, {}},
+    {"Name", CMPI_string, false, {}},
+    {"Family", CMPI_uint16, false, {}},
+    {"OtherFamilyDescription", CMPI_string, false, {}},
+    {"EnabledState", CMPI_uint16, false, {}},
+    {"RequestedState", CMPI_uint16, false, {}},
+    {"CurrentClockSpeed", CMPI_uint32, false, {}},
+    {"MaxClockSpeed", CMPI_uint32, false, {}},
+    {"ExternalBusClockSpeed", CMPI_uint32, false, {}},
+    {"CPUStatus", CMPI_uint16, false, {}},
+    {"Status", CMPI_string, false, {}},
+    {"HealthState", CMPI_uint16, false, {}},
+    {"OperationalStatus", CMPI_uint16A, false, {}},
+    {"DataWidth", CMPI_uint16, false, {}},
+    {"AddressWidth", CMPI_uint16, false, {}},
+    {"Stepping", CMPI_string, false, {}},
+    {"UniqueId", CMPI_string, false, {}},
+    {"UpgradeMethod", CMPI_uint16, false, {}},
+    {"NumberOfEnabledCores", CMPI_uint16, false, {}},
+};
+
+constexpr PropertyDefinition coreProperties[] = {
+    {"InstanceID", CMPI_string, key, {}},           {"Caption", CMPI_string, false, {}},
+    {"Description", CMPI_string, false, {}},        {"ElementName", CMPI_string, false, {}},
+    {"CoreEnabledState", CMPI_uint16, false, {}},   {"EnabledState", CMPI_uint16, false, {}},
+    {"RequestedState", CMPI_uint16, false, {}},     {"HealthState", CMPI_uint16, false, {}},
+    {"OperationalStatus", CMPI_uint16A, false, {}},
+};
+
+constexpr PropertyDefinition memoryProperties[] = {
+    {"CreationClassName", CMPI_string, key, {}},
+    {"DeviceID", CMPI_string, key, {}},
+    {"SystemCreationClassName", CMPI_string, key, {}},
+    {"SystemName", CMPI_string, key, {}},
+    {"Caption", CMPI_string, false, {}},
+    {"Description", CMPI_string, false, {}},
+    {"ElementName", CMPI_string, false, {}},
+    {"Name", CMPI_string, false, {}},
+    {"BlockSize", CMPI_uint64, false, {}},
+    {"NumberOfBlocks", CMPI_uint64, false, {}},
+    {"ConsumableBlocks", CMPI_uint64, false, {}},
+    {"EnabledState", CMPI_uint16, false, {}},
+    {"HealthState", CMPI_uint16, false, {}},
+    {"RequestedState", CMPI_uint16, false, {}},
+    {"OperationalStatus", CMPI_uint16A, false, {}},
+};
+
+constexpr PropertyDefinition capabilitiesProperties[] = {
+    {"InstanceID", CMPI_string, key, {}},
+    {"Caption", CMPI_string, false, {}},
+    {"Description", CMPI_string, false, {}},
+    {"NumberOfProcessorCores", CMPI_uint16, false, {}},
+    {"NumberOfHardwareThreads", CMPI_uint16, false, {}},
+    {"RequestedStatesSupported", CMPI_uint16A, false, {}},
+    {"ElementNameEditSupported", CMPI_boolean, false, {}},
+};
+
+constexpr PropertyDefinition processorCacheProperties[] = {
+    {"Antecedent", CMPI_ref, key, "HALDA_CPUMemory"},
+    {"Dependent", CMPI_ref, key, "HALDA_CPUProcessor"},
+    {"Level", CMPI_uint16, false, {}},
+    {"WritePolicy", CMPI_uint16, false, {}},
+    {"ReadPolicy", CMPI_uint16, false, {}},
+    {"CacheType", CMPI_uint16, false, {}},
+    {"Associativity", CMPI_uint16, false, {}},
+};
+
+constexpr PropertyDefinition coreCacheProperties[] = {
+    {"Antecedent", CMPI_ref, key, "HALDA_CPUMemory"},
+    {"Dependent", CMPI_ref, key, "HALDA_CPUProcessorCore"},
+    {"Level", CMPI_uint16, false, {}},
+    {"WritePolicy", CMPI_uint16, false, {}},
+    {"ReadPolicy", CMPI_uint16, false, {}},
+    {"CacheType", CMPI_uint16, false, {}},
+    {"Associativity", CMPI_uint16, false, {}},
+};
+
+constexpr PropertyDefinition systemDeviceProperties[] = {
+    {"GroupComponent", CMPI_ref, key, "HALDA_ComputerSystem"},
+    {"PartComponent", CMPI_ref, key, "HALDA_CPUProcessor"},
+};
+
+constexpr PropertyDefinition elementCapabilitiesProperties[] = {
+    {"ManagedElement", CMPI_ref, key, "HALDA_CPUProcessor"},
+    {"Capabilities", CMPI_ref, key, "HALDA_CPUProcessorCapabilities"},
+};
+
+constexpr PropertyDefinition concreteComponentProperties[] = {
+    {"GroupComponent", CMPI_ref, key, "HALDA_CPUProcessor"},
+    {"PartComponent", CMPI_ref, key, "HALDA_CPUProcessorCore"},
+};
+
+constexpr ClassDefinition classes[] = {
+    {"HALDA_ComputerSystem", "CIM_ComputerSystem", false, computerSystemProperties, "ComputerSystemProvider",
+     systemLibrary, systemGroup},
+    {"HALDA_CPUProcessor", "CIM_Processor", false, processorProperties, "CPUProcessorProvider", cpuLibrary, cpuGroup},
+    {"HALDA_CPUProcessorCore", "CIM_ProcessorCore", false, coreProperties, "CPUProcessorCoreProvider", cpuLibrary,
+     cpuGroup},
+    {"HALDA_CPUMemory", "CIM_Memory", false, memoryProperties, "CPUMemoryProvider", cpuLibrary, cpuGroup},
+    {"HALDA_CPUProcessorCapabilities", "CIM_ProcessorCapabilities", false, capabilitiesProperties,
+     "CPUProcessorCapProvider", cpuLibrary, cpuGroup},
+    {"HALDA_CPUSystemDevice", "CIM_SystemDevice", true, systemDeviceProperties, "CPUSystemDeviceProvider", cpuLibrary,
+     cpuGroup},
+    {"HALDA_CPUConcreteComponent", "CIM_ConcreteComponent", true, concreteComponentProperties,
+     "CPUConcreteComponentProvider", cpuLibrary, cpuGroup},
+    {"HALDA_CPUAssociatedCacheMemory", "CIM_AssociatedCacheMemory", true, processorCacheProperties,
+     "CPUAssociatedCacheMemoryProvider", cpuLibrary, cacheAssociationGroup},
+    {"HALDA_CPUCoreAssociatedCacheMemory", "CIM_AssociatedCacheMemory", true, coreCacheProperties,
+     "CPUCoreAssociatedCacheMemoryProvider", cpuLibrary, cpuGroup},
+    {"HALDA_CPUElementCapabilities", "CIM_ElementCapabilities", true, elementCapabilitiesProperties,
+     "CPUElementCapabilitiesProvider", cpuLibrary, cpuGroup},
+};
+
+struct Inheritance {
+  std::string_view name;
+  std::string_view parent;
+};
+
+// The DMTF classes above ours.
+constexpr Inheritance dmtfClasses[] = {
+    {"CIM_AssociatedCacheMemory", "CIM_AssociatedMemory"},
+    {"CIM_AssociatedMemory", "CIM_Dependency"},
+    {"CIM_Capabilities", "CIM_ManagedElement"},
+    {"CIM_ComputerSystem", "CIM_System"},
+    {"CIM_ConcreteComponent", "CIM_Component"},
+    {"CIM_EnabledLogicalElement", "CIM_LogicalElement"},
+    {"CIM_EnabledLogicalElementCapabilities", "CIM_Capabilities"},
+    {"CIM_LogicalDevice", "CIM_EnabledLogicalElement"},
+    {"CIM_LogicalElement", "CIM_ManagedSystemElement"},
+    {"CIM_ManagedSystemElement", "CIM_ManagedElement"},
+    {"CIM_Memory", "CIM_StorageExtent"},
+    {"CIM_Processor", "CIM_LogicalDevice"},
+    {"CIM_ProcessorCapabilities", "CIM_EnabledLogicalElementCapabilities"},
+    {"CIM_ProcessorCore", "CIM_EnabledLogicalElement"},
+    {"CIM_StorageExtent", "CIM_LogicalDevice"},
+    {"CIM_System", "CIM_EnabledLogicalElement"},
+    {"CIM_SystemComponent", "CIM_Component"},
+    {"CIM_SystemDevice", "CIM_SystemComponent"},
+};
+
+constexpr std::size_t endsOfAnAssociation = 2;
+
+}  // namespace
+
+std::span<const ClassDefinition> classDefinitions() {
+  return classes;
+}
+
+const ClassDefinition* findClass(std::string_view name) {
+  const auto* found =
+      std::ranges::find_if(classes, [&](const ClassDefinition& each) { return sameName(each.name, name); });
+  return found == std::end(classes) ? nullptr : found;
+}
+
+const PropertyDefinition* findProperty(const ClassDefinition& definition, std::string_view name) {
+  const auto found = std::ranges::find_if(definition.properties,
+                                          [&](const PropertyDefinition& each) { return sameName(each.name, name); });
+  return found == definition.properties.end() ? nullptr : &*found;
+}
+
+std::string_view parentOf(std::string_view name) {
+  if (const ClassDefinition* definition = findClass(name)) {
+    return definition->parent;
+  }
+  const auto* found =
+      std::ranges::find_if(dmtfClasses, [&](const Inheritance& each) { return sameName(each.name, name); });
+  return found == std::end(dmtfClasses) ? std::string_view{} : found->parent;
+}
+
+bool isA(std::string_view name, std::string_view ancestor) {
+  for (std::string_view each = name; !each.empty(); each = parentOf(each)) {
+    if (sameName(each, ancestor)) {
+      return true;
+    }
+  }
+  return false;
+}
+
+std::vector<const ClassDefinition*> classesServing(std::string_view name) {
+  std::vector<const ClassDefinition*> result;
+  for (const ClassDefinition& each : classes) {
+    if (isA(each.name, name)) {
+      result.push_back(&each);
+    }
+  }
+  return result;
+}
+
+std::vector<const ClassDefinition*> associationsOf(std::string_view source) {
+  std::vector<const ClassDefinition*> result;
+  for (const ClassDefinition& each : classes) {
+    const auto ends = referenceEnds(each);
+    if (std::ranges::any_of(ends, [&](const PropertyDefinition& end) {
+          return isA(source, end.referenceClass) || isA(end.referenceClass, source);
+        })) {
+      result.push_back(&each);
+    }
+  }
+  return result;
+}
+
+std::span<const PropertyDefinition> referenceEnds(const ClassDefinition& association) {
+  return association.association ? association.properties.first(endsOfAnAssociation)
+                                 : std::span<const PropertyDefinition>{};
+}
+
+}  // namespace Corvcim
