@@ -2,26 +2,18 @@
 
 #include <algorithm>
 
+#include "platform/common/Ascii.h"
+
 namespace Tarn::Locale {
 namespace {
 
-bool isLower(char c) {
-  return c >= 'a' && c <= 'z';
-}
-bool isUpper(char c) {
-  return c >= 'A' && c <= 'Z';
-}
-bool isLetter(char c) {
-  return isLower(c) || isUpper(c);
-}
+using Common::isDigit;
+using Common::isLetter;
+using Common::lower;
+using Common::upper;
+
 bool isLetterOrDigit(char c) {
-  return isLetter(c) || (c >= '0' && c <= '9');
-}
-char lower(char c) {
-  return isUpper(c) ? static_cast<char>(c - 'A' + 'a') : c;
-}
-char upper(char c) {
-  return isLower(c) ? static_cast<char>(c - 'a' + 'A') : c;
+  return isLetter(c) || isDigit(c);
 }
 
 // By the registry of language tags: a language has two or three letters, a script four, a region two

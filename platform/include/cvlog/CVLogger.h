@@ -1,23 +1,53 @@
 #ifndef CVLOG_CVLOGGER_H
 #define CVLOG_CVLOGGER_H
 
+#include <atomic>
+#include <limits>
 #include <string>
 
 namespace CVLog {
 
-/// The agent's logger: two sinks, each with a level threshold and a destination of its own.
+/// The agent's logger: two sinks, log and trace, each with a level threshold and a destination of its own.
 ///
-/// Both calls are safe from several threads and throw nothing. A message that its sink does not want
-/// costs one comparison.
+/// Levels rise with importance; a sink takes the messages that reach its threshold. Both are configured
+/// with the first message, never at load. All calls are safe from several threads, throw nothing and do
+/// not wait but for the destination's own write. A message that its sink does not take costs one comparison.
 class CVLogger {
  public:
   /// Delivers one message to the log sink. `extra`, `extraLength` and `reserved` are kept for the
   /// agent's binary attachments and are not used.
   static void logLevelMessage(const char* function, const char* file, int line, const std::string& component, int level,
-                              char* extra, int extraLength, int reserved, const std::string& text);
+                              char* /*extra*/, int /*extraLength*/, int /*reserved*/, const std::string& text) {
+    if (logTakes(level)) [[unlikely]] {
+      deliverToLog(function, file, line, component, level, text);
+    }
+  }
   /// Delivers one message to the trace sink; the arguments are those of logLevelMessage.
   static void traceLevelMessage(const char* function, const char* file, int line, const std::string& component,
-                                int level, char* extra, int extraLength, int reserved, const std::string& text);
+                                int level, char* /*extra*/, int /*extraLength*/, int /*reserved*/,
+                                const std::string& text) {
+    if (traceTakes(level)) [[unlikely]] {
+      deliverToTrace(function, file, line, component, level, text);
+    }
+  }
+
+  /// Whether a message of this level can get anywhere, for callers whose text is costly to make.
+  /// True, too, before the first message.
+  static bool logTakes(int level) { return level >= logThreshold_.load(std::memory_order_relaxed); }
+  static bool traceTakes(int level) { return level >= traceThreshold_.load(std::memory_order_relaxed); }
+
+ private:
+  friend class Logger;
+
+  static void deliverToLog(const char* function, const char* file, int line, const std::string& component, int level,
+                           const std::string& text);
+  static void deliverToTrace(const char* function, const char* file, int line, const std::string& component, int level,
+                             const std::string& text);
+
+  // Until the configuration is read every message passes, so that the first one has it read.
+  static constexpr int kNotConfigured = std::numeric_limits<int>::min();
+  static inline std::atomic<int> logThreshold_{kNotConfigured};
+  static inline std::atomic<int> traceThreshold_{kNotConfigured};
 };
 
 }  // namespace CVLog

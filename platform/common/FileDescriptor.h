@@ -1,0 +1,34 @@
+#ifndef CORVANE_PLATFORM_COMMON_FILEDESCRIPTOR_H
+#define CORVANE_PLATFORM_COMMON_FILEDESCRIPTOR_H
+
+#include <unistd.h>
+
+#include <utility>
+
+namespace Tarn::Common {
+
+/// Owns a file descriptor; -1 is none.
+class FileDescriptor {
+ public:
+  explicit FileDescriptor(int number = -1) : number_(number) {}
+  FileDescriptor(FileDescriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
+  FileDescriptor& operator=(FileDescriptor&& other) noexcept {
+    std::swap(number_, other.number_);
+    return *this;
+  }
+  ~FileDescriptor() {
+    if (number_ >= 0) {
+      close(number_);
+    }
+  }
+
+  explicit operator bool() const { return number_ >= 0; }
+  [[nodiscard]] int number() const { return number_; }
+
+ private:
+  int number_;
+};
+
+}  // namespace Tarn::Common
+
+#endif

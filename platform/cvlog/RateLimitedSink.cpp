@@ -1,0 +1,49 @@
+#include "platform/cvlog/RateLimitedSink.h"
+
+#include <string>
+#include <utility>
+
+#include "platform/cvlog/Level.h"
+
+namespace CVLog {
+
+using std::chrono::minutes;
+using std::chrono::system_clock;
+
+RateLimitedSink::RateLimitedSink(std::unique_ptr<Sink> target, unsigned perMinute)
+    : target_(std::move(target)), perMinute_(perMinute) {}
+
+void RateLimitedSink::write(const Message& message) {
+  const Verdict verdict = judge(message.time);
+  if (verdict.droppedBefore != 0) {
+    const std::string text = std::to_string(verdict.droppedBefore) + " messages were dropped; the limit is " +
+                             std::to_string(perMinute_) + " a minute";
+    target_->write({.time = message.time,
+                    .level = kLevelWarning,
+                    .component = "Corvane.Logger",
+                    .function = __func__,
+                    .file = "RateLimitedSink.cpp",
+                    .line = __LINE__,
+                    .text = text});
+  }
+  if (verdict.passes) {
+    target_->write(message);
+  }
+}
+
+RateLimitedSink::Verdict RateLimitedSink::judge(system_clock::time_point time) {
+  const std::lock_guard lock(mutex_);
+  // A clock that was set back starts a new minute, too.
+  if (time >= minuteStart_ + minutes(1) || time < minuteStart_) {
+    minuteStart_ = time;
+    passed_ = 0;
+  }
+  if (passed_ >= perMinute_) {
+    ++dropped_;
+    return {.passes = false, .droppedBefore = 0};
+  }
+  ++passed_;
+  return {.passes = true, .droppedBefore = std::exchange(dropped_, 0U)};
+}
+
+}  // namespace CVLog

@@ -1,0 +1,38 @@
+#ifndef CORVANE_PLATFORM_CVLOG_RATELIMITEDSINK_H
+#define CORVANE_PLATFORM_CVLOG_RATELIMITEDSINK_H
+
+#include <memory>
+#include <mutex>
+
+#include "platform/cvlog/Sink.h"
+
+namespace CVLog {
+
+/// Passes on so many messages a minute and drops the rest. The first message of a later minute is
+/// preceded by a note that says how many were dropped.
+class RateLimitedSink final : public Sink {
+ public:
+  RateLimitedSink(std::unique_ptr<Sink> target, unsigned perMinute);
+
+  void write(const Message& message) override;
+
+ private:
+  /// What becomes of one message.
+  struct Verdict {
+    bool passes;
+    unsigned droppedBefore;
+  };
+  Verdict judge(std::chrono::system_clock::time_point time);
+
+  const std::unique_ptr<Sink> target_;
+  const unsigned perMinute_;
+
+  std::mutex mutex_;  // guards what follows, never held while writing
+  std::chrono::system_clock::time_point minuteStart_;
+  unsigned passed_ = 0;
+  unsigned dropped_ = 0;
+};
+
+}  // namespace CVLog
+
+#endif

@@ -1,0 +1,60 @@
+#ifndef CORVANE_PLATFORM_CVLOG_SETTINGS_H
+#define CORVANE_PLATFORM_CVLOG_SETTINGS_H
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/common/Configuration.h"
+#include "platform/cvlog/Level.h"
+
+namespace CVLog {
+
+enum class DestinationKind { kNone, kStandardError, kSystemLog, kFile };
+
+struct Destination {
+  DestinationKind kind = DestinationKind::kNone;
+  std::string path;  ///< of a file
+
+  friend bool operator==(const Destination&, const Destination&) = default;
+};
+
+/// What one sink takes and where it goes.
+struct SinkSettings {
+  int level = kLevelDebug;  ///< the lowest level that is taken
+  Destination destination;
+  unsigned perMinute = 0;  ///< messages; 0 is no limit
+
+  friend bool operator==(const SinkSettings&, const SinkSettings&) = default;
+};
+
+// The system log belongs to the whole machine; a provider that fails all the time must not fill it.
+inline constexpr unsigned kSystemLogPerMinute = 60;
+
+/// Errors go to the system log.
+inline SinkSettings defaultLog() {
+  return {.level = kLevelError, .destination = {DestinationKind::kSystemLog, {}}, .perMinute = kSystemLogPerMinute};
+}
+/// Nothing is traced; a trace that only has a destination takes everything.
+inline SinkSettings defaultTrace() {
+  return {};
+}
+
+struct Settings {
+  SinkSettings log = defaultLog();
+  SinkSettings trace = defaultTrace();
+  std::vector<Tarn::Common::ConfigurationProblem> problems;
+};
+
+/// The settings that the configuration file and the two overrides (the values of CORVANE_LOG and
+/// CORVANE_TRACE) make. A value that cannot be understood is noted and the one it would have replaced stays.
+Settings makeSettings(const Tarn::Common::Configuration& file, const std::optional<std::string>& logOverride,
+                      const std::optional<std::string>& traceOverride);
+
+/// "none", "stderr", "syslog" or "file:PATH" with a path that is not empty.
+std::optional<Destination> parseDestination(std::string_view text);
+
+}  // namespace CVLog
+
+#endif
