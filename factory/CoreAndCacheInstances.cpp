@@ -1,0 +1,69 @@
+#include <CPUObjFactory.h>
+
+#include "InstanceBuilder.h"
+
+namespace Tarn::CPUProvider {
+
+namespace {
+
+using Core = ProcessorCore;
+
+constexpr Property<Core> coreProperties[] = {
+    {"Caption", "Caption", localized, L"MSGID_CPU_PROC_CORE_CAPTION"},
+    {"Description", "Description", localized, L"MSGID_CPU_PROC_CORE_DESCRIPTION"},
+    {"ElementName", "ElementName", chars<&Core::getElementName>},
+    {"CoreEnabledState", "CoreEnabledState", uint16<&Core::getCoreEnabledState>},
+    {"EnabledState", "EnabledState", uint16<&Core::getEnabledState>},
+    {"RequestedState", "RequestedState", uint16<&Core::getRequestedState>},
+    {"HealthState", "HealthState", uint16<&Core::getHealthState>},
+    {"OperationalStatus", "OperationalStatus", uint16Array<&Core::getOperationalStatus>},
+};
+
+constexpr Property<Memory> memoryProperties[] = {
+    {"Caption", "Caption", localized, L"MSGID_CPU_MEMORY_CAPTION"},
+    {"Description", "Description", localized, L"MSGID_CPU_MEMORY_DESCRIPTION"},
+    {"ElementName", "ElementName", chars<&Memory::getElementName>},
+    {"Name", "Name", chars<&Memory::getCacheName>},
+    {"BlockSize", "BlockSize", uint64<&Memory::getBlockSize>},
+    {"NumberOfBlocks", "NumberOfBlocks", uint64<&Memory::getNumberOfBlocks>},
+    {"ConsumableBlocks", "ConsumableBlocks", uint64<&Memory::getConsumableBlocks>},
+    {"EnabledState", "EnabledState", uint16<&Memory::getEnabledState>},
+    {"HealthState", "HealthState", uint16<&Memory::getHealthState>},
+    {"RequestedState", "RequestedState", uint16<&Memory::getRequestedState>},
+    {"OperationalStatus", "OperationalStatus", uint16Array<&Memory::getOperationalStatus>},
+};
+
+constexpr InstanceClass<Core> coreInstances{
+    cpuProcessorCoreClass, KeyStyle::InstanceId, &Core::getInstanceID, coreProperties,
+    ArrayFailure{"Create Array for Property OperationalStatus failed.", LevelError, true}};
+
+constexpr InstanceClass<Memory> memoryInstances{
+    cpuMemoryClass, KeyStyle::Device, &Memory::getMemoryDeviceID, memoryProperties,
+    ArrayFailure{"Create Array for Property OperationalStatus failed.", LevelError, false}};
+
+}  // namespace
+
+CMPIInstance* CPUObjFactory::makeCPUProcCoreInstance(const CMPIBroker* broker, const CMPIObjectPath* ref,
+                                                     ProcessorCore procCore, const char** properties, bool isObjPath,
+                                                     CMPIStatus* rc) {
+  const ParameterList parameters{{" broker=", broker},       {" ref=", ref},
+                                 {" procCore=", &procCore},  {" properties=", properties},
+                                 {" isObjPath=", isObjPath}, {" rc=", rc}};
+  factoryEvents.entering(parameters);
+  CMPIInstance* instance = makeInstance(coreInstances, broker, ref, procCore, properties, isObjPath, rc);
+  factoryEvents.exiting(parameters);
+  return instance;
+}
+
+CMPIInstance* CPUObjFactory::makeCPUMemoryInstance(const CMPIBroker* broker, const CMPIObjectPath* ref, Memory cpuMem,
+                                                   const char** properties, bool isObjPath, CMPIStatus* rc) {
+  const ParameterList parameters{{" broker=", broker},       {" ref=", ref},
+                                 {" cpuMem=", &cpuMem},      {" properties=", properties},
+                                 {" isObjPath=", isObjPath}, {" rc=", rc}};
+  factoryEvents.entering(parameters);
+  CMPIInstance* instance = makeInstance(memoryInstances, broker, ref, cpuMem, properties, isObjPath, rc);
+  factoryEvents.exiting(parameters);
+  return instance;
+}
+
+}  // namespace Tarn::CPUProvider

@@ -1,0 +1,50 @@
+#ifndef TARN_CMPIOBJECTS_H
+#define TARN_CMPIOBJECTS_H
+
+#include <cmpidt.h>
+#include <cmpift.h>
+#include <cmpimacs.h>
+
+#include <tarn/Common.h>
+
+/// The few things that are said again and again about CMPI objects. A broker may answer NULL
+/// wherever it answers an object; nothing here dereferences it.
+namespace Tarn::CPUProvider {
+
+/// Brokers also say "no object" with one that has no handle.
+template <class Object>
+bool isNull(const Object* object) {
+  return object == nullptr || object->hdl == nullptr;
+}
+
+/// The text, "" for NULL. It lives as long as the string.
+inline const char* charsOf(const CMPIString* string, CMPIStatus* rc = nullptr) {
+  const char* chars = isNull(string) ? nullptr : CMGetCharsPtr(string, rc);
+  return chars != nullptr ? chars : "";
+}
+
+inline const char* namespaceOf(const CMPIObjectPath* path, CMPIStatus* rc = nullptr) {
+  return charsOf(CMGetNameSpace(path, rc));
+}
+
+inline const char* classNameOf(const CMPIObjectPath* path, CMPIStatus* rc = nullptr) {
+  return charsOf(CMGetClassName(path, rc));
+}
+
+/// Gives a path the namespace of another and this system's host name.
+inline void stampPath(CMPIObjectPath* path, const CMPIObjectPath* ref) {
+  CMSetNameSpace(path, namespaceOf(ref));
+  CMSetHostname(path, getSystemName().c_str());
+}
+
+/// Sets a failure with a message of the broker's making; without a broker there is no message.
+inline void setFailure(const CMPIBroker* broker, CMPIStatus* rc, const char* message) {
+  if (rc != nullptr) {
+    rc->rc = CMPI_RC_ERR_FAILED;
+    rc->msg = broker != nullptr ? CMNewString(broker, message, nullptr) : nullptr;
+  }
+}
+
+}  // namespace Tarn::CPUProvider
+
+#endif
