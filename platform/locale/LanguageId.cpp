@@ -58,9 +58,4 @@ std::string normalizedLanguageId(std::string_view id) {
   }
 }
 
-std::string_view parentLanguage(std::string_view id) {
-  const std::size_t end = id.rfind('_');
-  return end == std::string_view::npos ? std::string_view() : id.substr(0, end);
-}
-
 }  // namespace Tarn::Locale

@@ -1,0 +1,46 @@
+#include "platform/locale/Catalogue.h"
+
+namespace Tarn::Locale {
+namespace {
+
+constexpr std::wstring_view kLastLanguage = L"en";
+
+std::wstring_view parentOf(std::wstring_view language) {
+  const std::size_t end = language.rfind(L'_');
+  return end == std::wstring_view::npos ? std::wstring_view() : language.substr(0, end);
+}
+
+const Catalogue* findCatalogue(int number, std::wstring_view language) {
+  const std::span<const Catalogue> all = catalogues();
+  const auto found = std::find_if(all.begin(), all.end(), [&](const Catalogue& catalogue) {
+    return catalogue.number == number && catalogue.language == language;
+  });
+  return found == all.end() ? nullptr : &*found;
+}
+
+std::optional<std::wstring_view> findHere(int number, std::wstring_view language, std::wstring_view id) {
+  const Catalogue* catalogue = findCatalogue(number, language);
+  if (catalogue == nullptr) {
+    return std::nullopt;
+  }
+  const auto found =
+      std::lower_bound(catalogue->messages.begin(), catalogue->messages.end(), id,
+                       [](const Message& message, std::wstring_view wanted) { return message.id < wanted; });
+  if (found == catalogue->messages.end() || found->id != id || found->text.empty()) {
+    return std::nullopt;
+  }
+  return found->text;
+}
+
+}  // namespace
+
+std::optional<std::wstring_view> findMessage(int number, std::wstring_view language, std::wstring_view id) {
+  for (; !language.empty(); language = parentOf(language)) {
+    if (const auto text = findHere(number, language, id)) {
+      return text;
+    }
+  }
+  return findHere(number, kLastLanguage, id);
+}
+
+}  // namespace Tarn::Locale

@@ -1,0 +1,67 @@
+#include <cvlog/CVLogger.h>
+#include <tarn/Locale.h>
+
+#include <optional>
+#include <string_view>
+
+#include "platform/common/Configuration.h"
+#include "platform/common/Environment.h"
+#include "platform/locale/LanguageId.h"
+#include "platform/locale/ResourceLibrary.h"
+
+namespace Tarn::Locale {
+namespace {
+
+using Common::Setting;
+
+// The language where no other is asked for.
+constexpr std::string_view kDefaultLanguage = "en";
+constexpr int kLevelError = 6000;
+
+std::optional<Setting> wantedLanguage() {
+  constexpr const char* kOverride = "CORVANE_LANGUAGE";
+  if (const auto value = Common::environmentOverride(kOverride)) {
+    return Setting{*value, kOverride};
+  }
+  if (const Setting* setting = Common::configuration().find("language")) {
+    return *setting;
+  }
+  return std::nullopt;
+}
+
+void reportUnknown(const Setting& setting) {
+  const std::string text = "Configuration: " + setting.where + ": \"" + setting.value +
+                           "\" does not count: expected a language id such as de or de_AT";
+  CVLog::CVLogger::logLevelMessage(__func__, "Locale.cpp", __LINE__, "Corvane.Locale", kLevelError, nullptr, 0, 0,
+                                   text);
+  CVLog::CVLogger::traceLevelMessage(__func__, "Locale.cpp", __LINE__, "Corvane.Locale", kLevelError, nullptr, 0, 0,
+                                     text);
+}
+
+std::string languageOfThisProcess() {
+  if (const std::optional<Setting> wanted = wantedLanguage()) {
+    const std::string id = normalizedLanguageId(wanted->value);
+    if (!id.empty()) {
+      return id;
+    }
+    reportUnknown(*wanted);
+  }
+  return std::string(kDefaultLanguage);
+}
+
+}  // namespace
+
+std::string getLanguageId() {
+  static const std::string language = languageOfThisProcess();
+  return language;
+}
+
+std::wstring getResourceLibrary(int number, const std::string& languageId) {
+  const std::string language = normalizedLanguageId(languageId);
+  std::wstring library = std::to_wstring(number) + kLibrarySeparator;
+  const std::string_view wanted = language.empty() ? kDefaultLanguage : language;
+  library.append(wanted.begin(), wanted.end());
+  return library;
+}
+
+}  // namespace Tarn::Locale
