@@ -1,0 +1,89 @@
+#ifndef TARN_PROVIDERFRAME_H
+#define TARN_PROVIDERFRAME_H
+
+#include <CPUClassNames.h>
+#include <CPUObjFactory.h>
+#include <CmpiObjects.h>
+#include <Trace.h>
+
+#include <string>
+#include <vector>
+
+#include "BrokerGuard.h"
+
+/// What every provider file is made of: its tables' version, the operations it refuses, and the
+/// steps that operations have in common.
+namespace Tarn::CPUProvider {
+
+/// ftVersion and miVersion of every function table.
+inline constexpr int interfaceVersion = 200;
+
+/// Marks what the broker looks up by name.
+#define CORVANE_EXPORTED extern "C" __attribute__((visibility("default")))
+
+inline CMPIStatus succeeded() {
+  return {CMPI_RC_OK, nullptr};
+}
+inline CMPIStatus notSupported() {
+  return {CMPI_RC_ERR_NOT_SUPPORTED, nullptr};
+}
+
+/// Defines the operations that every provider answers in the same way: nothing is cleaned up before
+/// the library is unloaded, and the inventory is read-only. Only the preprocessor can give each file
+/// functions of its own names.
+#define CORVANE_REFUSED_OPERATIONS(prefix)                                                                            \
+  CMPIStatus prefix##_Cleanup(CMPIInstanceMI*, const CMPIContext*, CMPIBoolean) {                                     \
+    return succeeded();                                                                                               \
+  }                                                                                                                   \
+  CMPIStatus prefix##_CreateInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*,   \
+                                     const CMPIInstance*) {                                                           \
+    return notSupported();                                                                                            \
+  }                                                                                                                   \
+  CMPIStatus prefix##_ModifyInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*,   \
+                                     const CMPIInstance*, const char**) {                                             \
+    return notSupported();                                                                                            \
+  }                                                                                                                   \
+  CMPIStatus prefix##_DeleteInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*) { \
+    return notSupported();                                                                                            \
+  }                                                                                                                   \
+  CMPIStatus prefix##_ExecQuery(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*,        \
+                                const char*, const char*) {                                                           \
+    return notSupported();                                                                                            \
+  }
+
+using Instances = std::vector<CMPIInstance*>;
+using Paths = std::vector<CMPIObjectPath*>;
+
+/// The text of a string key; NULL when the path does not have it or it is no string.
+inline CMPIString* stringKey(const CMPIObjectPath* path, const char* name, CMPIStatus* status = nullptr) {
+  const CMPIData key = CMGetKey(path, name, status);
+  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
+  if (key.type != CMPI_string || (key.state & noValue) != 0 || isNull(key.value.string)) {
+    return nullptr;
+  }
+  return key.value.string;
+}
+
+/// Results are counted in 16 bits.
+template <class Element>
+unsigned short countOf(const std::vector<Element>& elements) {
+  return static_cast<unsigned short>(elements.size());
+}
+
+inline void deliver(const CMPIResult* result, const Instances& instances) {
+  const unsigned short count = countOf(instances);
+  for (unsigned short i = 0; i < count; ++i) {
+    CMReturnInstance(result, instances.at(i));
+  }
+}
+
+inline void deliver(const CMPIResult* result, const Paths& paths) {
+  const unsigned short count = countOf(paths);
+  for (unsigned short i = 0; i < count; ++i) {
+    CMReturnObjectPath(result, paths.at(i));
+  }
+}
+
+}  // namespace Tarn::CPUProvider
+
+#endif
