@@ -50,7 +50,7 @@ std::string normalizedLanguageId(std::string_view id) {
     if (!isPart(part, isFirst)) {
       return {};
     }
-    normalized += (isFirst ? "" : "_") + normalizedPart(part, isFirst);
+    normalized.append(isFirst ? "" : "_").append(normalizedPart(part, isFirst));
     if (end == std::string_view::npos) {
       return normalized;
     }
