@@ -1,0 +1,94 @@
+#include "bench/Machines.h"
+
+#include "platform/instrumentation/TreeBuilder.h"
+
+namespace Corvane::Bench {
+namespace {
+
+using namespace Tarn::NodeLexicon;
+using Tarn::Inventory::TreeBuilder;
+
+struct CacheKind {
+  const char* level;
+  unsigned int levelCode;
+  unsigned int type;
+  unsigned int blocks;
+  unsigned int associativity;
+  const char* name;
+};
+
+constexpr CacheKind sharedCache = {"L3", 5, 3, 524288, 6, "L3 unified cache"};
+constexpr CacheKind coreCaches[] = {
+    {"L1d", 3, 2, 512, 5, "L1 data cache"},
+    {"L1i", 3, 1, 512, 5, "L1 instruction cache"},
+    {"L2", 4, 3, 16384, 6, "L2 unified cache"},
+};
+
+void addCache(TreeBuilder& builder, const CacheKind& kind, unsigned int processor, unsigned int core) {
+  builder.cache(cachePath(processor, kind.level, core))
+      .description(kind.name)
+      .number(PropCacheAssociativity, kind.associativity)
+      .number(PropCacheType, kind.type)
+      .number(PropCacheLevel, kind.levelCode)
+      .number(PropCacheBlockSize, 64)
+      .number(PropCacheWritePolicy, 1)
+      .number(PropCacheConsumableBlocks, kind.blocks)
+      .number(PropCacheNumberOfBlocks, kind.blocks)
+      .text(PropCacheName, kind.level);
+}
+
+void addProcessor(TreeBuilder& builder, unsigned int processor, unsigned int cores) {
+  builder.processor(processorPath(processor))
+      .description("Processor in socket " + std::to_string(processor))
+      .number(PropDataWidth, 64)
+      .number(PropAddressWidth, 64)
+      .number(PropExternalClockSpeed, 100)
+      .number(PropMaxClockSpeed, 4000)
+      .number(PropCurrentClockSpeed, 2600)
+      .number(PropHardwareThreads, 2 * cores)
+      .number(PropEnabledCores, cores)
+      .number(PropProcessorCores, cores)
+      .number(PropFamily, 179)
+      .number(PropUpgradeMethod, 6)
+      .text(PropProcessorId, "57 06 05 00 FF FB EB BF")
+      .text(PropStepping, "7")
+      .text(PropProcessorName, "Server Processor 8480 at 2.60 GHz")
+      .list(PropRequestedStatesSupported, {1});
+}
+
+std::string path(unsigned int processor, const std::string& part) {
+  std::string result = processorPath(processor);
+  return part.empty() ? result : result += "." + part;
+}
+
+}  // namespace
+
+std::string processorPath(unsigned int processor) {
+  return "P" + std::to_string(processor);
+}
+
+std::string corePath(unsigned int processor, unsigned int core) {
+  return path(processor, "C" + std::to_string(core));
+}
+
+std::string cachePath(unsigned int processor, const char* level, unsigned int core) {
+  return path(processor, std::string(level) + "." + std::to_string(core));
+}
+
+Tarn::Inventory::Tree makeMachine(const MachineSize& size) {
+  TreeBuilder builder;
+  builder.system().text(PropSystemModel, "PowerBox 9000");
+  for (unsigned int processor = 0; processor < size.processors; ++processor) {
+    addProcessor(builder, processor, size.coresEach);
+    for (unsigned int core = 0; core < size.coresEach; ++core) {
+      builder.core(corePath(processor, core)).description("Core " + std::to_string(core));
+      for (const CacheKind& kind : coreCaches) {
+        addCache(builder, kind, processor, core);
+      }
+    }
+    addCache(builder, sharedCache, processor, 0);
+  }
+  return builder.build();
+}
+
+}  // namespace Corvane::Bench
