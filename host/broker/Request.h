@@ -44,7 +44,13 @@ class Request {
   // What was returned so far, with this status.
   [[nodiscard]] Response response(const CMPIStatus& status) const;
 
+  // Lets the calling thread, which has no request, work for this one until it detaches; false if it has one.
+  static bool attach(Request* request);
+  static void detach();
+
  private:
+  friend class Broker;  // walks the chain of requests
+
   Broker& broker_;
   Request* previous_;
   std::unique_ptr<Arena> arena_;
