@@ -7,6 +7,9 @@
 
 #include <tarn/Common.h>
 
+#include <algorithm>
+#include <string_view>
+
 /// The few things that are said again and again about CMPI objects. A broker may answer NULL
 /// wherever it answers an object; nothing here dereferences it.
 namespace Tarn::CPUProvider {
@@ -29,6 +32,13 @@ inline const char* namespaceOf(const CMPIObjectPath* path, CMPIStatus* rc = null
 
 inline const char* classNameOf(const CMPIObjectPath* path, CMPIStatus* rc = nullptr) {
   return charsOf(CMGetClassName(path, rc));
+}
+
+/// Class names compare without regard to case (ASCII).
+inline bool equalIgnoringCase(std::string_view left, std::string_view right) {
+  const auto lower = [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; };
+  return std::equal(left.begin(), left.end(), right.begin(), right.end(),
+                    [&](char l, char r) { return lower(l) == lower(r); });
 }
 
 /// Gives a path the namespace of another and this system's host name.

@@ -51,6 +51,12 @@ inline CMPIStatus notSupported() {
     return notSupported();                                                                                            \
   }
 
+/// The same for the second table of an association provider.
+#define CORVANE_ASSOCIATION_CLEANUP(prefix)                                                     \
+  CMPIStatus prefix##_AssociationCleanup(CMPIAssociationMI*, const CMPIContext*, CMPIBoolean) { \
+    return succeeded();                                                                         \
+  }
+
 using Instances = std::vector<CMPIInstance*>;
 using Paths = std::vector<CMPIObjectPath*>;
 

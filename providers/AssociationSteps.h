@@ -1,0 +1,252 @@
+#ifndef TARN_ASSOCIATIONSTEPS_H
+#define TARN_ASSOCIATIONSTEPS_H
+
+#include <iterator>
+#include <span>
+#include <string_view>
+
+#include "ProviderFrame.h"
+
+/// The steps that association operations are made of. What an operation does with them, and in which
+/// order, stands in the provider's own file.
+namespace Tarn::CPUProvider {
+
+/// One end of an association: the reference's name and the class that it refers to.
+struct Reference {
+  const char* name;
+  const char* objectClass;
+};
+
+/// An association class and the provider that serves it.
+struct Association {
+  const EventLog& events;
+  const CMPIBroker* const& broker;
+  const char* className;
+  Reference first;
+  Reference second;
+};
+
+/// The elements that the 16-bit count of results reaches.
+template <class Element>
+std::span<Element> counted(std::vector<Element>& elements) {
+  return std::span(elements).first(countOf(elements));
+}
+
+/// Fails the request, with the same words for the client and for the log.
+inline void fail(const Association& association, CMPIStatus* status, const char* text,
+                 unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
+  setFailure(association.broker, status, text);
+  association.events.message(LevelError, text, line, function);
+}
+
+/// Fails the request with words of their own for the client and for the log.
+struct FailureTexts {
+  const char* status;
+  const char* log;
+};
+
+inline void fail(const Association& association, CMPIStatus* status, const FailureTexts& texts,
+                 unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
+  if (texts.status != nullptr) {
+    setFailure(association.broker, status, texts.status);
+  }
+  association.events.message(LevelError, texts.log, line, function);
+}
+
+/// Whether GetInstance was asked for nothing in particular, which fails.
+inline bool lacksKeys(const Association& association, const CMPIObjectPath* cop, CMPIStatus* status,
+                      unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
+  if (CMGetKeyCount(cop, nullptr) != 0) {
+    return false;
+  }
+  fail(association, status, "At least one key should be passed", line, function);
+  return true;
+}
+
+/// An element's own object path; NULL for an element that could not be built.
+inline CMPIObjectPath* pathOf(const CMPIInstance* element) {
+  return isNull(element) ? nullptr : CMGetObjectPath(element, nullptr);
+}
+
+/// An empty path of the association class, in the namespace of `cop`; NULL when the broker has none.
+inline CMPIObjectPath* newAssociationPath(const Association& association, const CMPIObjectPath* cop) {
+  CMPIObjectPath* path = CMNewObjectPath(association.broker, namespaceOf(cop), association.className, nullptr);
+  if (!isNull(path)) {
+    stampPath(path, cop);
+  }
+  return path;
+}
+
+inline void setEnds(const Association& association, CMPIInstance* instance, const CMPIObjectPath* first,
+                    const CMPIObjectPath* second) {
+  CMSetProperty(instance, association.first.name, &first, CMPI_ref);
+  CMSetProperty(instance, association.second.name, &second, CMPI_ref);
+}
+
+inline void addEnds(const Association& association, CMPIObjectPath* path, const CMPIObjectPath* first,
+                    const CMPIObjectPath* second) {
+  CMAddKey(path, association.first.name, &first, CMPI_ref);
+  CMAddKey(path, association.second.name, &second, CMPI_ref);
+}
+
+/// What a walk over all pairs says where it fails; a NULL status text leaves the status alone.
+struct WalkTexts {
+  const char* noPaths;
+  FailureTexts nullNear;
+  const char* noRelated;
+  FailureTexts nullFar;
+};
+
+/// The near ends of a walk: all object paths of one class, and the key that leads on from them.
+struct NearEnds {
+  unsigned short (CPUObjFactory::*allPaths)(const CMPIBroker*, const CMPIObjectPath*, Paths&, CMPIStatus*);
+  unsigned short (CPUObjFactory::*expected)() const;
+  const char* key;
+};
+
+/// Walks over every near end and, from its key, every element that `related` finds for it. Hands both
+/// paths to `link`, until that returns false. False when the walk did not reach its end.
+template <class Related, class Link>
+bool forEachPair(const Association& association, CPUObjFactory* factory, const CMPIObjectPath* cop, CMPIStatus* status,
+                 const NearEnds& nearEnds, const WalkTexts& texts, Related related, Link link,
+                 unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
+  Paths nearPaths;
+  nearPaths.reserve((factory->*nearEnds.expected)());
+  if ((factory->*nearEnds.allPaths)(association.broker, cop, nearPaths, status) != 0) {
+    association.events.message(LevelError, texts.noPaths, line, function);
+    return false;
+  }
+  for (CMPIObjectPath* near : counted(nearPaths)) {
+    if (isNull(near)) {
+      fail(association, status, texts.nullNear, line, function);
+      return false;
+    }
+    stampPath(near, cop);
+    Instances elements;
+    if (related(stringKey(near, nearEnds.key), elements) != 0) {
+      association.events.message(LevelError, texts.noRelated, line, function);
+      return false;
+    }
+    for (const CMPIInstance* element : counted(elements)) {
+      if (isNull(element)) {
+        continue;
+      }
+      CMPIObjectPath* far = pathOf(element);
+      if (isNull(far)) {
+        fail(association, status, texts.nullFar, line, function);
+        return false;
+      }
+      if (!link(near, far)) {
+        return false;
+      }
+    }
+  }
+  return true;
+}
+
+/// The way from a request's object to the elements of one target class.
+struct Direction {
+  const char* targetClass;
+  const char* sourceKey;
+  unsigned short (CPUObjFactory::*expected)() const;
+  unsigned short (CPUObjFactory::*navigate)(const CMPIBroker*, const CMPIObjectPath*, CMPIString*, const char**, bool,
+                                            Instances&, CMPIStatus*);
+};
+
+/// What an association request looks for, and how much of it.
+struct Search {
+  CPUObjFactory* factory;
+  const CMPIObjectPath* cop;
+  const CMPIObjectPath* target;
+  const char** properties;
+  bool isObjPath;
+  CMPIStatus* status;
+};
+
+/// Finds the elements at the far end; none for a target class that neither direction leads to. False,
+/// and the direction's own text logged, when the navigation failed.
+inline bool findRelated(const Association& association, const Search& search, const Direction (&directions)[2],
+                        const char* const (&failures)[2], Instances& related, unsigned int line = __builtin_LINE(),
+                        const char* function = __builtin_FUNCTION()) {
+  const std::string_view targetClass = classNameOf(search.target);
+  for (std::size_t i = 0; i < std::size(directions); ++i) {
+    const Direction& direction = directions[i];
+    if (targetClass != direction.targetClass) {
+      continue;
+    }
+    related.reserve((search.factory->*direction.expected)());
+    if ((search.factory->*direction.navigate)(association.broker, search.target,
+                                              stringKey(search.cop, direction.sourceKey), search.properties,
+                                              search.isObjPath, related, search.status) != 0) {
+      association.events.message(LevelError, failures[i], line, function);
+      return false;
+    }
+  }
+  return true;
+}
+
+/// The association of two objects on its own path; what the broker answers when it cannot make it.
+inline CMPIInstance* newAssociation(const Association& association, const CMPIObjectPath* path,
+                                    const CMPIObjectPath* first, const CMPIObjectPath* second, const char** properties,
+                                    const char** filterKeys) {
+  CMPIInstance* instance = CMNewInstance(association.broker, path, nullptr);
+  if (!isNull(instance)) {
+    CMSetPropertyFilter(instance, properties, filterKeys);
+    setEnds(association, instance, first, second);
+  }
+  return instance;
+}
+
+/// The association between the object that a request starts from and an element of the target class,
+/// on the template path. With `filterKeys` the property list filters it. NULL when the broker has none.
+inline CMPIInstance* newReference(const Association& association, const CMPIObjectPath* templatePath,
+                                  const CMPIObjectPath* source, const CMPIObjectPath* far, const CMPIObjectPath* target,
+                                  const char** properties = nullptr, const char** filterKeys = nullptr) {
+  CMPIInstance* instance = CMNewInstance(association.broker, templatePath, nullptr);
+  if (isNull(instance)) {
+    return nullptr;
+  }
+  if (filterKeys != nullptr) {
+    CMSetPropertyFilter(instance, properties, filterKeys);
+  }
+  const bool farIsFirst = std::string_view(classNameOf(target)) == association.first.objectClass;
+  setEnds(association, instance, farIsFirst ? far : source, farIsFirst ? source : far);
+  return instance;
+}
+
+/// Delivers the first instance whose path `matches`; instances that could not be built do not count.
+template <class Matches>
+void deliverMatch(const CMPIResult* result, Instances& instances, Matches matches) {
+  for (CMPIInstance* instance : counted(instances)) {
+    CMPIObjectPath* path = pathOf(instance);
+    if (!isNull(path) && matches(path)) {
+      CMReturnInstance(result, instance);
+      return;
+    }
+  }
+}
+
+/// Delivers the elements' own paths.
+inline void deliverPathsOf(const CMPIResult* result, Instances& elements) {
+  for (const CMPIInstance* element : counted(elements)) {
+    const CMPIObjectPath* path = pathOf(element);
+    if (!isNull(path)) {
+      CMReturnObjectPath(result, path);
+    }
+  }
+}
+
+/// The same, each in the namespace of `cop` and with this system's host name.
+inline void deliverStampedPathsOf(const CMPIResult* result, Instances& elements, const CMPIObjectPath* cop) {
+  for (const CMPIInstance* element : counted(elements)) {
+    CMPIObjectPath* path = pathOf(element);
+    if (!isNull(path)) {
+      stampPath(path, cop);
+      CMReturnObjectPath(result, path);
+    }
+  }
+}
+
+}  // namespace Tarn::CPUProvider
+
+#endif
