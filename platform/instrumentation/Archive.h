@@ -1,10 +1,10 @@
-#ifndef TARN_INVENTORY_ARCHIVE_H
-#define TARN_INVENTORY_ARCHIVE_H
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_ARCHIVE_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_ARCHIVE_H
 
 #include <string>
 #include <string_view>
 
-#include "platform/instrumentation/FileSystem.h"
+#include "platform/instrumentation/MemoryFileSystem.h"
 
 namespace Tarn::Inventory {
 

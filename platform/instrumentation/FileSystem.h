@@ -1,7 +1,6 @@
-#ifndef TARN_INVENTORY_FILESYSTEM_H
-#define TARN_INVENTORY_FILESYSTEM_H
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_FILESYSTEM_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_FILESYSTEM_H
 
-#include <map>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -42,59 +41,6 @@ class FileSystem {
 /// The file system below a directory: "/" for the machine's own, else a captured root.
 /// Throws InventoryError if the directory can not be opened.
 std::unique_ptr<FileSystem> openDirectory(const std::string& directory);
-
-/// Files in memory, for tests and captures.
-class MemoryFileSystem final : public FileSystem {
- public:
-  struct Entry {
-    std::string contents;
-    FileError error = 0;  ///< what an attempt to read it gives
-  };
-  using Files = std::map<std::string, Entry, std::less<>>;
-
-  MemoryFileSystem() = default;
-  explicit MemoryFileSystem(Files files) : files_(std::move(files)) {}
-
-  void add(std::string path, std::string contents) { files_[std::move(path)] = {std::move(contents), 0}; }
-  void fail(std::string path, FileError error) { files_[std::move(path)] = {{}, error}; }
-  void remove(std::string_view prefix);  ///< every file whose path begins so
-
-  const Files& files() const { return files_; }
-
-  FileError read(const char* path, std::string& contents) override;
-  FileError list(const char* directory, std::vector<std::string>& names) override;
-  std::unique_ptr<FileSystem> below(const char* directory) override;
-  std::string nameOf(std::string_view path) const override;
-
- private:
-  Files files_;
-};
-
-/// Passes everything on and keeps what was asked for, in order: the list of files that a source reads,
-/// and a capture of them that gives the source the same answers.
-class RecordingFileSystem final : public FileSystem {
- public:
-  struct Record {
-    std::vector<std::string> opened;  ///< paths that were read, failed attempts included
-    MemoryFileSystem::Files files;    ///< what was found in them
-  };
-
-  RecordingFileSystem(FileSystem& target, Record& record) : RecordingFileSystem(target, record, {}) {}
-
-  FileError read(const char* path, std::string& contents) override;
-  FileError list(const char* directory, std::vector<std::string>& names) override;
-  std::unique_ptr<FileSystem> below(const char* directory) override;
-  std::string nameOf(std::string_view path) const override;
-
- private:
-  RecordingFileSystem(FileSystem& target, Record& record, std::string prefix)
-      : target_(target), record_(record), prefix_(std::move(prefix)) {}
-
-  std::unique_ptr<FileSystem> owned_;
-  FileSystem& target_;
-  Record& record_;
-  std::string prefix_;
-};
 
 }  // namespace Tarn::Inventory
 

@@ -1,5 +1,5 @@
-#ifndef TARN_INVENTORY_LIVESOURCE_H
-#define TARN_INVENTORY_LIVESOURCE_H
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_LIVESOURCE_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_LIVESOURCE_H
 
 #include "platform/instrumentation/FileSystem.h"
 #include "platform/instrumentation/Tree.h"

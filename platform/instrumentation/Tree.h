@@ -1,9 +1,10 @@
-#ifndef TARN_INVENTORY_TREE_H
-#define TARN_INVENTORY_TREE_H
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_TREE_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_TREE_H
 
 #include <tarn/NodeLexicon.h>
 
 #include <array>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -44,7 +45,7 @@ struct PropertyRange {
 };
 
 struct Node {
-  NodeLexicon::NodeType type;
+  NodeLexicon::NodeType type = NodeLexicon::NodeSystem;
   unsigned int status = Status::inUse;
   NodeIndex parent = noNode;
   NodeIndex end = 0;  ///< one past the last node below this one
@@ -73,8 +74,6 @@ struct Unread {
 /// built (by TreeBuilder), so any number of threads may read it.
 class Tree {
  public:
-  Tree();
-
   std::span<const Node> nodes() const { return nodes_; }
   const Node& node(NodeIndex index) const { return nodes_[index]; }
 
@@ -102,7 +101,7 @@ class Tree {
   friend class TreeBuilder;
 
   static constexpr unsigned int nodeTypes = 4;
-  static unsigned int slot(NodeLexicon::NodeType type);
+  static std::optional<unsigned int> slot(NodeLexicon::NodeType type);
 
   template <class Value>
   static std::span<const Value> stretch(const std::vector<Value>& table, PropertyRange range) {

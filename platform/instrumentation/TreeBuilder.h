@@ -1,5 +1,5 @@
-#ifndef TARN_INVENTORY_TREEBUILDER_H
-#define TARN_INVENTORY_TREEBUILDER_H
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_TREEBUILDER_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_TREEBUILDER_H
 
 #include <string>
 #include <string_view>
@@ -51,7 +51,6 @@ class TreeBuilder {
 
  private:
   Node& last();
-  void finishNode();
 
   Tree tree_;
   NodeIndex system_ = noNode;

@@ -1,0 +1,68 @@
+#include "platform/instrumentation/SystemModel.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+#include "platform/instrumentation/CpuIdentity.h"
+
+namespace Tarn::Inventory {
+
+namespace {
+
+constexpr std::string_view virtualMachine = "Virtual Machine";
+
+// What firmware vendors leave in a field that they did not fill in. Sorted.
+constexpr std::array placeholders = {
+    std::string_view("Default string"),
+    std::string_view("None"),
+    std::string_view("Not Applicable"),
+    std::string_view("Not Specified"),
+    std::string_view("O.E.M."),
+    std::string_view("System Product Name"),
+    std::string_view("To Be Filled By O.E.M."),
+    std::string_view("To be filled by O.E.M."),
+    std::string_view("Undefined"),
+};
+static_assert(std::ranges::is_sorted(placeholders));
+
+// The model that emulators give their device tree.
+constexpr std::string_view emulatedBoard = "linux,dummy-virt";
+
+std::string deviceTreeModel(Machine& machine) {
+  std::string model(machine.root().text("proc/device-tree/model").value_or(std::string_view()));
+  return model == emulatedBoard ? model + " (" + std::string(virtualMachine) + ')' : model;
+}
+
+// Without firmware that names a model the hypervisor is all that is known of the machine.
+std::string hypervisorModel(Machine& machine) {
+  const std::string type(machine.root().text("sys/hypervisor/type").value_or(std::string_view()));
+  if (!type.empty()) {
+    return std::string(virtualMachine) + " (" + type + ')';
+  }
+  const CpuInfo& info = machine.cpuInfo();
+  const bool isVirtual = !info.cpus().empty() && identifyCpu(info, info.cpus().first()).hypervisor;
+  return std::string(isVirtual ? virtualMachine : std::string_view());
+}
+
+}  // namespace
+
+std::string readSystemModel(Machine& machine) {
+  const std::string product(machine.root().text("sys/class/dmi/id/product_name").value_or(std::string_view()));
+  if (!product.empty() && !std::ranges::binary_search(placeholders, product)) {
+    return product;
+  }
+  const bool unreadable = machine.root().error() != 0;
+  const std::string file = machine.root().fileName();
+  const std::string reason = describeError(machine.root().error());
+  std::string model = deviceTreeModel(machine);
+  if (model.empty()) {
+    if (unreadable) {
+      machine.unread().add(file, reason, "it is there on machines whose firmware has DMI tables");
+    }
+    model = hypervisorModel(machine);
+  }
+  return model;
+}
+
+}  // namespace Tarn::Inventory
