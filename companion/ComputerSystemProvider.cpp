@@ -1,0 +1,155 @@
+// The management interface that a broker calls for HALDA_ComputerSystem. Requests may run in
+// parallel: nothing is kept between them but the broker's own handle.
+
+#include <cmpift.h>
+#include <cmpimacs.h>
+#include <strings.h>
+
+#include <atomic>
+#include <exception>
+#include <string>
+
+#include "companion/ComputerSystem.h"
+#include "companion/ComputerSystemInstance.h"
+
+namespace Tarn::ComputerSystemProvider {
+namespace {
+
+std::atomic<const CMPIBroker*> registeredBroker = nullptr;
+
+CMPIStatus statusOf(CMPIrc code, const std::string& text) {
+  CMPIStatus status;
+  CMSetStatusWithChars(registeredBroker.load(), &status, code, text.c_str());
+  return status;
+}
+
+/// A broker survives no exception: it becomes a status here.
+template <class Operation>
+CMPIStatus answer(Operation operation) {
+  try {
+    return operation(registeredBroker.load());
+  } catch (const std::exception& error) {
+    return statusOf(CMPI_RC_ERR_FAILED, std::string(className) + ": " + error.what());
+  } catch (...) {
+    return statusOf(CMPI_RC_ERR_FAILED, std::string(className) + ": unknown exception");
+  }
+}
+
+/// A string key's text; NULL where the path has no such key or it is no string.
+const char* keyText(const CMPIObjectPath* path, const char* name) {
+  CMPIStatus status = {CMPI_RC_OK, nullptr};
+  const CMPIData key = CMGetKey(path, name, &status);
+  if (status.rc != CMPI_RC_OK || key.type != CMPI_string || key.value.string == nullptr) {
+    return nullptr;
+  }
+  return CMGetCharPtr(key.value.string);
+}
+
+CMPIStatus checkKeys(const CMPIObjectPath* path, const ComputerSystem& system) {
+  const char* name = keyText(path, "Name");
+  const char* creationClass = keyText(path, "CreationClassName");
+  if (name == nullptr || creationClass == nullptr) {
+    return statusOf(CMPI_RC_ERR_INVALID_PARAMETER,
+                    std::string(className) + ": the path needs the keys CreationClassName and Name");
+  }
+  if (strcasecmp(creationClass, className) != 0 || system.name != name) {
+    return statusOf(CMPI_RC_ERR_NOT_FOUND, std::string(className) + ": no system with CreationClassName \"" +
+                                               creationClass + "\" and Name \"" + name + "\"; this machine is \"" +
+                                               system.name + "\"");
+  }
+  return {CMPI_RC_OK, nullptr};
+}
+
+CMPIStatus cleanup(CMPIInstanceMI*, const CMPIContext*, CMPIBoolean) {
+  return {CMPI_RC_OK, nullptr};
+}
+
+CMPIStatus enumInstanceNames(CMPIInstanceMI*, const CMPIContext*, const CMPIResult* result,
+                             const CMPIObjectPath* request) {
+  return answer([&](const CMPIBroker* broker) {
+    CMPIStatus status = {CMPI_RC_OK, nullptr};
+    const CMPIObjectPath* path = makePath(broker, request, readComputerSystem(), &status);
+    if (path != nullptr) {
+      CMReturnObjectPath(result, path);
+      CMReturnDone(result);
+    }
+    return status;
+  });
+}
+
+CMPIStatus enumInstances(CMPIInstanceMI*, const CMPIContext*, const CMPIResult* result, const CMPIObjectPath* request,
+                         const char** properties) {
+  return answer([&](const CMPIBroker* broker) {
+    CMPIStatus status = {CMPI_RC_OK, nullptr};
+    const CMPIInstance* instance = makeInstance(broker, request, readComputerSystem(), properties, &status);
+    if (instance != nullptr) {
+      CMReturnInstance(result, instance);
+      CMReturnDone(result);
+    }
+    return status;
+  });
+}
+
+CMPIStatus getInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult* result, const CMPIObjectPath* request,
+                       const char** properties) {
+  return answer([&](const CMPIBroker* broker) {
+    const ComputerSystem system = readComputerSystem();
+    CMPIStatus status = checkKeys(request, system);
+    if (status.rc != CMPI_RC_OK) {
+      return status;
+    }
+    const CMPIInstance* instance = makeInstance(broker, request, system, properties, &status);
+    if (instance != nullptr) {
+      CMReturnInstance(result, instance);
+      CMReturnDone(result);
+    }
+    return status;
+  });
+}
+
+constexpr CMPIStatus notSupported = {CMPI_RC_ERR_NOT_SUPPORTED, nullptr};
+
+CMPIStatus createInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*,
+                          const CMPIInstance*) {
+  return notSupported;
+}
+
+CMPIStatus modifyInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*,
+                          const CMPIInstance*, const char**) {
+  return notSupported;
+}
+
+CMPIStatus deleteInstance(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*) {
+  return notSupported;
+}
+
+CMPIStatus execQuery(CMPIInstanceMI*, const CMPIContext*, const CMPIResult*, const CMPIObjectPath*, const char*,
+                     const char*) {
+  return notSupported;
+}
+
+constexpr CMPIInstanceMIFT functions = {200,
+                                        200,
+                                        "instanceCorvaneComputerSystemProvider",
+                                        cleanup,
+                                        enumInstanceNames,
+                                        enumInstances,
+                                        getInstance,
+                                        createInstance,
+                                        modifyInstance,
+                                        deleteInstance,
+                                        execQuery};
+
+}  // namespace
+}  // namespace Tarn::ComputerSystemProvider
+
+extern "C" __attribute__((visibility("default"))) CMPIInstanceMI* CorvaneComputerSystemProvider_Create_InstanceMI(
+    const CMPIBroker* broker, const CMPIContext*, CMPIStatus* status) {
+  using namespace Tarn::ComputerSystemProvider;
+  static CMPIInstanceMI mi = {nullptr, &functions};
+  registeredBroker.store(broker);
+  if (status != nullptr) {
+    *status = {CMPI_RC_OK, nullptr};
+  }
+  return &mi;
+}

@@ -1,0 +1,74 @@
+#include "host/cli/Commands.h"
+
+#include <stdlib.h>  // setenv
+
+#include <tarn/Common.h>
+
+#include "host/broker/Dispatcher.h"
+#include "host/cli/ClassList.h"
+#include "host/cli/InventoryText.h"
+#include "host/cli/Libraries.h"
+#include "host/cli/Operations.h"
+#include "host/cli/Overview.h"
+#include "host/cli/Topology.h"
+#include "host/cli/TreeDot.h"
+#include "host/cli/TreeSvg.h"
+#include "host/cli/TreeText.h"
+#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/ProcessTree.h"
+
+namespace Corvcim {
+namespace {
+
+/// The libraries read these when they are loaded, and so does this program's own inventory.
+void setEnvironment(const Options& options) {
+  if (!options.inventory.empty()) {
+    setenv("CORVANE_INVENTORY", options.inventory.c_str(), 1);
+  }
+  const bool isForPrograms = options.format == Format::Mof || options.format == Format::Json;
+  if (isForPrograms) {
+    setenv("CORVANE_LANGUAGE", "en", 1);
+  } else if (!options.language.empty()) {
+    setenv("CORVANE_LANGUAGE", options.language.c_str(), 1);
+  }
+}
+
+std::string inventoryOutput(Format format) {
+  const auto tree = Tarn::Inventory::processTree();
+  return format == Format::Json ? Tarn::Inventory::writeJson(*tree) : writeInventoryText(*tree);
+}
+
+std::string treeOutput(Format format, std::size_t width) {
+  const Topology topology = readTopology(*Tarn::Inventory::processTree(), Tarn::getSystemName());
+  switch (format) {
+    case Format::Svg:
+      return drawTreeSvg(topology);
+    case Format::Dot:
+      return drawTreeDot(topology);
+    default:
+      return drawTreeText(topology, width);
+  }
+}
+
+}  // namespace
+
+Outcome runCommand(const Options& options, std::size_t width) {
+  setEnvironment(options);
+  switch (options.verb->verb) {
+    case Verb::Classes:
+      return {writeClassList(options.format), {}};
+    case Verb::Inventory:
+      return {inventoryOutput(options.format), {}};
+    case Verb::Tree:
+      return {treeOutput(options.format, width), {}};
+    default:
+      break;
+  }
+  Dispatcher dispatcher(libraryFiles(options));
+  if (options.verb->verb == Verb::Overview) {
+    return showOverview(dispatcher, options.nameSpace);
+  }
+  return performOperation(dispatcher, options);
+}
+
+}  // namespace Corvcim

@@ -1,0 +1,26 @@
+#ifndef HOST_CLI_COMMANDS_H
+#define HOST_CLI_COMMANDS_H
+
+#include <cstddef>
+#include <string>
+#include <vector>
+
+#include "host/cli/Options.h"
+
+namespace Corvcim {
+
+/// What a command has to say: what it found for standard output, and one line for standard error
+/// about each thing that failed.
+struct Outcome {
+  std::string output;
+  std::vector<std::string> errors;
+};
+
+/// Runs the command. Sets CORVANE_INVENTORY and CORVANE_LANGUAGE in this process as the options ask.
+/// `width` is the terminal's, 0 where output goes elsewhere. Throws std::exception's children with a
+/// one-line text where nothing could be done at all.
+Outcome runCommand(const Options& options, std::size_t width);
+
+}  // namespace Corvcim
+
+#endif

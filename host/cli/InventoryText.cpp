@@ -1,0 +1,98 @@
+#include "host/cli/InventoryText.h"
+
+#include <algorithm>
+#include <utility>
+#include <vector>
+
+#include "host/cli/Text.h"
+#include "host/cli/Topology.h"
+#include "platform/instrumentation/PropertyTable.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::Node;
+using Tarn::Inventory::NodeIndex;
+using Tarn::Inventory::Tree;
+
+std::string listText(const std::vector<unsigned int>& numbers) {
+  std::string text;
+  for (const unsigned int number : numbers) {
+    text += (text.empty() ? "" : ", ") + std::to_string(number);
+  }
+  return text.empty() ? "(none)" : text;
+}
+
+std::string propertyName(Tarn::NodeLexicon::Properties id) {
+  const Tarn::Inventory::PropertyEntry* entry = Tarn::Inventory::findProperty(id);
+  return entry == nullptr ? "property " + std::to_string(id) : std::string(entry->name);
+}
+
+using Rows = std::vector<std::pair<std::string, std::string>>;
+
+Rows rowsOf(const Tree& tree, const Node& node) {
+  Rows rows;
+  if (!node.description.empty()) {
+    rows.emplace_back("description", toPrintable(node.description));
+  }
+  if (!node.cpus.empty()) {
+    rows.emplace_back("cpus", node.cpus.toList());
+  }
+  for (const auto& property : tree.texts(node)) {
+    rows.emplace_back(propertyName(property.id), toPrintable(property.value));
+  }
+  for (const auto& property : tree.numbers(node)) {
+    rows.emplace_back(propertyName(property.id), std::to_string(property.value));
+  }
+  for (const auto& property : tree.lists(node)) {
+    rows.emplace_back(propertyName(property.id), listText(property.value));
+  }
+  return rows;
+}
+
+std::size_t depthOf(const Tree& tree, const Node& node) {
+  return node.parent == Tarn::Inventory::noNode ? 0 : 1 + depthOf(tree, tree.node(node.parent));
+}
+
+std::string nodeText(const Tree& tree, const Node& node) {
+  const std::string indent(2 * depthOf(tree, node), ' ');
+  const std::string state = stateNote(node.status);
+  std::string text = indent + std::string(Tarn::Inventory::nodeTypeName(node.type)) + ' ' + std::string(node.path()) +
+                     (state.empty() ? "" : " (" + state + ')') + '\n';
+  const Rows rows = rowsOf(tree, node);
+  std::size_t width = 0;
+  for (const auto& [name, value] : rows) {
+    width = std::max(width, columns(name));
+  }
+  for (const auto& [name, value] : rows) {
+    text += indent + "    " + padRight(name, width) + "  " + value + '\n';
+  }
+  return text;
+}
+
+}  // namespace
+
+std::string writeInventoryText(const Tree& tree) {
+  std::string text;
+  for (const Node& node : tree.nodes()) {
+    text += nodeText(tree, node);
+  }
+  const std::string unread = writeUnread(tree.unread());
+  return unread.empty() ? text : text + '\n' + unread;
+}
+
+std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread) {
+  if (unread.empty()) {
+    return "";
+  }
+  std::string text = "Not read:\n";
+  for (const Tarn::Inventory::Unread& entry : unread) {
+    text += "  " + toPrintable(entry.file) + ": " + toPrintable(entry.reason) + '\n';
+    if (!entry.remedy.empty()) {
+      text += "    " + toPrintable(entry.remedy) + '\n';
+    }
+  }
+  return text;
+}
+
+}  // namespace Corvcim

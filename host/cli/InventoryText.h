@@ -1,0 +1,19 @@
+#ifndef HOST_CLI_INVENTORYTEXT_H
+#define HOST_CLI_INVENTORYTEXT_H
+
+#include <span>
+#include <string>
+
+#include "platform/instrumentation/Tree.h"
+
+namespace Corvcim {
+
+/// The inventory for people: every node with its state and its properties, and what could not be read.
+std::string writeInventoryText(const Tarn::Inventory::Tree& tree);
+
+/// What could not be read, why, and what would make it readable, under a heading; empty for nothing.
+std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread);
+
+}  // namespace Corvcim
+
+#endif

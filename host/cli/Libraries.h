@@ -1,0 +1,28 @@
+#ifndef HOST_CLI_LIBRARIES_H
+#define HOST_CLI_LIBRARIES_H
+
+#include <functional>
+#include <map>
+#include <string>
+#include <string_view>
+
+#include "host/cli/Options.h"
+
+namespace Corvcim {
+
+inline constexpr std::string_view providerLibraryName = "corvcpuprofileprovider";
+inline constexpr std::string_view companionLibraryName = "corvcomputersystemprovider";
+
+/// The file of the library with that base name which belongs to this program: below ../lib of the
+/// program's own directory, where a build tree has it, or where the package installs it. Empty where
+/// there is none.
+std::string findLibrary(std::string_view baseName);
+
+/// The files for the dispatcher: what the options name, else what findLibrary finds. A companion that
+/// is not there is left out. Throws std::runtime_error, which says where it looked, if there is no
+/// provider library.
+std::map<std::string, std::string, std::less<>> libraryFiles(const Options& options);
+
+}  // namespace Corvcim
+
+#endif

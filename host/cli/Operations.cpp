@@ -1,0 +1,139 @@
+#include "host/cli/Operations.h"
+
+#include <stdexcept>
+#include <utility>
+
+#include "host/cli/ResultWriter.h"
+#include "platform/instrumentation/ProcessTree.h"
+
+namespace Corvcim {
+namespace {
+
+std::optional<std::string> unlessEmpty(const std::string& text) {
+  return text.empty() ? std::nullopt : std::optional(text);
+}
+
+OperationKind kindOf(Verb verb) {
+  switch (verb) {
+    case Verb::EnumerateInstanceNames:
+      return OperationKind::EnumerateInstanceNames;
+    case Verb::GetInstance:
+      return OperationKind::GetInstance;
+    case Verb::Associators:
+      return OperationKind::Associators;
+    case Verb::AssociatorNames:
+      return OperationKind::AssociatorNames;
+    case Verb::References:
+      return OperationKind::References;
+    case Verb::ReferenceNames:
+      return OperationKind::ReferenceNames;
+    default:
+      return OperationKind::EnumerateInstances;
+  }
+}
+
+bool isEnumeration(OperationKind kind) {
+  return kind == OperationKind::EnumerateInstances || kind == OperationKind::EnumerateInstanceNames;
+}
+
+bool givesPaths(OperationKind kind) {
+  return kind == OperationKind::EnumerateInstanceNames || kind == OperationKind::AssociatorNames ||
+         kind == OperationKind::ReferenceNames;
+}
+
+/// A reference's result class is the association; wbemcli's users give it by either option.
+AssociationFilter filterOf(OperationKind kind, const AssociationOptions& options) {
+  AssociationFilter filter;
+  filter.role = unlessEmpty(options.role);
+  if (kind == OperationKind::References || kind == OperationKind::ReferenceNames) {
+    filter.resultClass = unlessEmpty(options.associationClass);
+    return filter;
+  }
+  filter.assocClass = unlessEmpty(options.associationClass);
+  filter.resultClass = unlessEmpty(options.resultClass);
+  filter.resultRole = unlessEmpty(options.resultRole);
+  return filter;
+}
+
+Operation operationOf(const Options& options) {
+  Operation operation;
+  operation.kind = kindOf(options.verb->verb);
+  operation.path = ObjectPath::parse(options.target);
+  if (operation.path.nameSpace.empty()) {
+    operation.path.nameSpace = options.nameSpace;
+  }
+  if (isEnumeration(operation.kind) && !operation.path.keys.empty()) {
+    throw std::runtime_error("this is the path of an instance, and " + std::string(options.verb->name) +
+                             " takes a class; ask for the instance with gi");
+  }
+  if (!isEnumeration(operation.kind) && operation.path.keys.empty()) {
+    throw std::runtime_error("this is a class, and " + std::string(options.verb->name) +
+                             " takes the path of an instance; ein lists the paths of a class");
+  }
+  if (options.hasPropertyList) {
+    operation.properties = options.properties;
+  }
+  operation.filter = filterOf(operation.kind, options.association);
+  return operation;
+}
+
+std::string write(Format format, const Operation& operation, const Response& response) {
+  if (givesPaths(operation.kind)) {
+    return writePaths(format, response.paths);
+  }
+  if (operation.kind == OperationKind::GetInstance && response.instances.size() == 1) {
+    return writeInstance(format, response.instances.front(), operation.properties);
+  }
+  return writeInstances(format, response.instances, operation.properties);
+}
+
+bool isEmpty(const Response& response) {
+  return response.instances.empty() && response.paths.empty();
+}
+
+}  // namespace
+
+std::string describeStatus(CMPIrc rc, const std::optional<std::string>& message) {
+  constexpr std::string_view cmpiPrefix = "CMPI_RC_";
+  std::string name = statusName(rc);
+  if (name.starts_with(cmpiPrefix)) {
+    name.replace(0, cmpiPrefix.size(), "CIM_");
+  }
+  return message && !message->empty() ? name + ": " + *message : name;
+}
+
+std::optional<std::string> inventoryError() {
+  try {
+    Tarn::Inventory::processTree();
+    return std::nullopt;
+  } catch (const std::exception& error) {
+    return error.what();
+  }
+}
+
+Outcome performOperation(Dispatcher& dispatcher, const Options& options) {
+  const std::string what = std::string(options.verb->name) + ' ' + options.target + ": ";
+  Outcome outcome;
+  try {
+    const Operation operation = operationOf(options);
+    const Answer answer = dispatcher.perform(operation);
+    if (answer.response.ok()) {
+      outcome.output = write(options.format, operation, answer.response);
+    } else if (answer.failures.empty()) {
+      outcome.errors.push_back(what + describeStatus(answer.response.rc, answer.response.message));
+    }
+    for (const ClassFailure& failure : answer.failures) {
+      outcome.errors.push_back(what + failure.className + ": " + describeStatus(failure.rc, failure.message));
+    }
+    if (isEmpty(answer.response)) {
+      if (const std::optional<std::string> error = inventoryError()) {
+        outcome.errors.push_back(what + *error);
+      }
+    }
+  } catch (const std::exception& error) {
+    outcome.errors.push_back(what + error.what());
+  }
+  return outcome;
+}
+
+}  // namespace Corvcim

@@ -1,0 +1,214 @@
+#include "host/cli/Options.h"
+
+#include <algorithm>
+#include <optional>
+#include <string_view>
+
+namespace Corvcim {
+namespace {
+
+using std::string_view_literals::operator""sv;
+
+std::string quoted(std::string_view text) {
+  return "'" + std::string(text) + "'";
+}
+
+std::string usageLine(const VerbSyntax& verb) {
+  std::string line = "usage: corvcim [OPTION...] " + std::string(verb.name);
+  if (!verb.operands.empty()) {
+    line += ' ' + std::string(verb.operands);
+  }
+  return line;
+}
+
+[[noreturn]] void fail(const std::string& text) {
+  throw UsageError(text + "; see 'corvcim --help'");
+}
+
+[[noreturn]] void fail(const VerbSyntax& verb, const std::string& text) {
+  throw UsageError(std::string(verb.name) + ": " + text + "; " + usageLine(verb));
+}
+
+/// An option: its spellings, and what it does with its value. An option without a value is given "".
+struct Option {
+  std::string_view longName;
+  std::string_view shortName;
+  bool hasValue;
+  bool isAssociation;
+  void (*apply)(Options& options, const std::string& value);
+};
+
+void setFormat(Options& options, const std::string& name) {
+  constexpr Format all[] = {Format::Text, Format::Mof, Format::Json, Format::Svg, Format::Dot};
+  const auto* const found = std::ranges::find(all, std::string_view(name), formatName);
+  if (found == std::end(all)) {
+    fail("unknown output format " + quoted(name) + ": it can be " + formatList(all));
+  }
+  options.format = *found;
+}
+
+void setNameSpace(Options& options, const std::string& name) {
+  if (name.empty()) {
+    fail("the namespace is empty");
+  }
+  options.nameSpace = name;
+}
+
+constexpr Option optionTable[] = {
+    {"--library", "-l", true, false, [](Options& o, const std::string& value) { o.library = value; }},
+    {"--companion", "", true, false, [](Options& o, const std::string& value) { o.companion = value; }},
+    {"--inventory", "-i", true, false, [](Options& o, const std::string& value) { o.inventory = value; }},
+    {"--language", "", true, false, [](Options& o, const std::string& value) { o.language = value; }},
+    {"--namespace", "-n", true, false, setNameSpace},
+    {"--output", "-o", true, false, setFormat},
+    {"--help", "-h", false, false, [](Options& o, const std::string&) { o.wantsHelp = true; }},
+    {"--version", "-V", false, false, [](Options& o, const std::string&) { o.wantsVersion = true; }},
+    {"", "-ac", true, true, [](Options& o, const std::string& value) { o.association.associationClass = value; }},
+    {"", "-arc", true, true, [](Options& o, const std::string& value) { o.association.resultClass = value; }},
+    {"", "-ar", true, true, [](Options& o, const std::string& value) { o.association.role = value; }},
+    {"", "-arr", true, true, [](Options& o, const std::string& value) { o.association.resultRole = value; }},
+};
+
+/// An argument that was recognised as an option, with the value that was glued to it, if any.
+struct Match {
+  const Option* option;
+  std::optional<std::string> value;
+};
+
+/// Takes --name, --name=value, -x, -xvalue and the words -ac, -arc, -ar, -arr.
+Match matchOption(std::string_view argument) {
+  const std::size_t equals = argument.starts_with("--") ? argument.find('=') : std::string_view::npos;
+  const std::string_view name = argument.substr(0, equals);
+  for (const Option& option : optionTable) {
+    if (name != option.longName && name != option.shortName) {
+      continue;
+    }
+    if (equals == std::string_view::npos) {
+      return {&option, std::nullopt};
+    }
+    return {&option, std::string(argument.substr(equals + 1))};
+  }
+  for (const Option& option : optionTable) {
+    if (option.shortName.size() == 2 && option.hasValue && argument.starts_with(option.shortName)) {
+      return {&option, std::string(argument.substr(2))};
+    }
+  }
+  fail("unknown option " + quoted(argument));
+}
+
+bool isOption(std::string_view argument) {
+  return argument.size() > 1 && argument.front() == '-';
+}
+
+std::vector<std::string> splitAtCommas(std::string_view list) {
+  std::vector<std::string> names;
+  while (!list.empty()) {
+    const std::size_t comma = list.find(',');
+    const std::string_view name = list.substr(0, comma);
+    if (!name.empty()) {
+      names.emplace_back(name);
+    }
+    list = comma == std::string_view::npos ? ""sv : list.substr(comma + 1);
+  }
+  return names;
+}
+
+/// The words that are no options: the verb and its operands.
+void takeOperands(Options& options, const std::vector<std::string>& operands) {
+  if (operands.empty()) {
+    return;
+  }
+  const VerbSyntax* verb = findVerb(operands.front());
+  if (verb == nullptr) {
+    fail("unknown verb " + quoted(operands.front()));
+  }
+  options.verb = verb;
+  const std::size_t count = operands.size() - 1;
+  if (options.wantsHelp) {
+    return;
+  }
+  if (count < verb->minimumOperands) {
+    fail(*verb, std::string(verb->operands.substr(0, verb->operands.find(' '))) + " is missing");
+  }
+  if (count > verb->maximumOperands) {
+    fail(*verb, "unexpected argument " + quoted(operands[verb->maximumOperands + 1]));
+  }
+  if (count >= 1) {
+    options.target = operands[1];
+  }
+  if (count >= 2) {
+    options.hasPropertyList = true;
+    options.properties = splitAtCommas(operands[2]);
+  }
+}
+
+void checkCombination(const Options& options, const std::string& associationOption) {
+  if (options.wantsHelp || options.wantsVersion) {
+    return;
+  }
+  const VerbSyntax& verb = *options.verb;
+  const std::string name = verb.name.empty() ? "the overview" : std::string(verb.name);
+  if (!associationOption.empty() && !verb.isAssociation) {
+    fail(name + " takes no option " + quoted(associationOption) + ": it belongs to ai, ain, ri and rin");
+  }
+  if (std::ranges::find(verb.formats, options.format) == verb.formats.end()) {
+    fail(name + " has no output format " + quoted(formatName(options.format)) + ": it can be " +
+         formatList(verb.formats));
+  }
+}
+
+/// wbemcli narrows references by -arc; here -ac says the same, for it is the association's class.
+void settleReferenceOptions(Options& options) {
+  if (options.verb->verb != Verb::References && options.verb->verb != Verb::ReferenceNames) {
+    return;
+  }
+  AssociationOptions& association = options.association;
+  if (!association.resultRole.empty()) {
+    fail(*options.verb, "no option '-arr': a reference has no far end");
+  }
+  if (!association.associationClass.empty() && !association.resultClass.empty()) {
+    fail(*options.verb, "'-ac' and '-arc' both name the association class");
+  }
+  if (association.associationClass.empty()) {
+    association.associationClass.swap(association.resultClass);
+  }
+}
+
+}  // namespace
+
+Options parseOptions(std::span<const char* const> arguments) {
+  Options options;
+  std::vector<std::string> operands;
+  std::string associationOption;
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    const std::string_view argument = arguments[i];
+    if (argument == "--") {
+      operands.insert(operands.end(), arguments.begin() + static_cast<std::ptrdiff_t>(i) + 1, arguments.end());
+      break;
+    }
+    if (!isOption(argument)) {
+      operands.emplace_back(argument);
+      continue;
+    }
+    Match match = matchOption(argument);
+    if (match.option->hasValue && !match.value) {
+      if (i + 1 == arguments.size()) {
+        fail("option " + quoted(argument) + " needs a value");
+      }
+      match.value = arguments[++i];
+    }
+    if (!match.option->hasValue && match.value) {
+      fail("option " + quoted(match.option->longName) + " takes no value");
+    }
+    if (match.option->isAssociation) {
+      associationOption = argument;
+    }
+    match.option->apply(options, match.value.value_or(""));
+  }
+  takeOperands(options, operands);
+  checkCombination(options, associationOption);
+  settleReferenceOptions(options);
+  return options;
+}
+
+}  // namespace Corvcim

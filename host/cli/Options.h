@@ -1,0 +1,51 @@
+#ifndef HOST_CLI_OPTIONS_H
+#define HOST_CLI_OPTIONS_H
+
+#include <span>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "host/cli/Verbs.h"
+
+namespace Corvcim {
+
+/// What an association request is narrowed to. An empty text narrows nothing.
+struct AssociationOptions {
+  std::string associationClass;
+  std::string resultClass;
+  std::string role;
+  std::string resultRole;
+};
+
+/// One command line, understood.
+struct Options {
+  std::string library;    ///< the provider library; empty: the one that belongs to this program
+  std::string companion;  ///< the library with HALDA_ComputerSystem; empty: the one beside it
+  std::string inventory;  ///< as CORVANE_INVENTORY takes it; empty: as the environment says
+  std::string language;   ///< as CORVANE_LANGUAGE takes it; empty: as the environment says
+  std::string nameSpace = "root/cimv2";
+  Format format = Format::Text;
+  const VerbSyntax* verb = &overviewSyntax();
+  std::string target;  ///< the class or the path; empty for verbs without one
+  bool hasPropertyList = false;
+  std::vector<std::string> properties;  ///< an empty list selects the keys alone
+  AssociationOptions association;
+  bool wantsHelp = false;
+  bool wantsVersion = false;
+};
+
+/// A command line that can not be understood; what() is one line that says what is wrong and how it
+/// is written.
+class UsageError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+/// Understands the arguments after the program's name. Options may stand before or after the verb;
+/// "--" ends them. Throws UsageError.
+Options parseOptions(std::span<const char* const> arguments);
+
+}  // namespace Corvcim
+
+#endif

@@ -1,0 +1,25 @@
+#ifndef HOST_CLI_STANDARDSTREAMS_H
+#define HOST_CLI_STANDARDSTREAMS_H
+
+#include <cstddef>
+#include <string_view>
+
+namespace Corvcim {
+
+/// Occupies the descriptors 0 to 2 where the caller closed them, so that no file opened later takes
+/// their place. What is written to a closed one fails as before.
+void occupyStandardStreams();
+
+/// The width of the terminal on standard output; 0 if that is no terminal.
+std::size_t terminalWidth();
+
+/// Writes to standard output, and has it all on its way when it returns. A reader that went away ends
+/// the program quietly, as SIGPIPE does. Throws std::runtime_error if the output can not be written.
+void writeOutput(std::string_view text);
+
+/// Writes "corvcim: TEXT" as one line to standard error.
+void writeError(std::string_view text);
+
+}  // namespace Corvcim
+
+#endif

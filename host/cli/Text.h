@@ -1,0 +1,31 @@
+#ifndef HOST_CLI_TEXT_H
+#define HOST_CLI_TEXT_H
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace Corvcim {
+
+/// The text in valid UTF-8: every byte that belongs to no character becomes U+FFFD.
+std::string toValidUtf8(std::string_view text);
+
+/// The text for a terminal's line: valid UTF-8, and control characters as escapes (\n, \t, \x1B), so
+/// that a name in the inventory can not move the cursor.
+std::string toPrintable(std::string_view text);
+
+/// The columns that valid UTF-8 takes; every character counts as one.
+std::size_t columns(std::string_view text);
+
+/// Valid UTF-8, filled with blanks on the right up to that many columns.
+std::string padRight(std::string text, std::size_t width);
+
+/// Valid UTF-8, shortened at the end to at most that many columns; what was cut shows as "…".
+std::string shorten(const std::string& text, std::size_t width);
+
+/// "1 core", "2 cores".
+std::string counted(std::size_t count, std::string_view noun);
+
+}  // namespace Corvcim
+
+#endif

@@ -1,0 +1,82 @@
+#include "host/cli/Usage.h"
+
+#include "host/cli/Text.h"
+
+namespace Corvcim {
+namespace {
+
+constexpr std::string_view introduction =
+    "Usage: corvcim [OPTION...] [VERB [ARGUMENT...]]\n"
+    "\n"
+    "Loads the CPU provider library as a CIM broker does and asks it about this\n"
+    "machine's processors. Without a verb: one screen about them.\n"
+    "\n"
+    "Verbs:\n";
+
+constexpr std::string_view optionHelp =
+    "\n"
+    "Options:\n"
+    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc) or json:FILE\n"
+    "  -o, --output FORMAT     text, mof or json; for tree: text, svg or dot\n"
+    "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
+    "  -l, --library FILE      the provider library\n"
+    "      --companion FILE    the library with HALDA_ComputerSystem\n"
+    "      --language ID       language of captions and descriptions, such as de_AT\n"
+    "  -h, --help              this help; after a verb: the help of that verb\n"
+    "  -V, --version           the version\n";
+
+constexpr std::string_view associationHelp =
+    "\n"
+    "Options for ai, ain, ri and rin:\n"
+    "  -ac CLASS               association class\n"
+    "  -arc CLASS              class of the result\n"
+    "  -ar ROLE                role of PATH in the association\n"
+    "  -arr ROLE               role of the result (ai and ain)\n";
+
+constexpr std::string_view ending =
+    "\n"
+    "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong.\n"
+    "\n"
+    "Examples:\n"
+    "  corvcim ei HALDA_CPUProcessor DeviceID,Name,MaxClockSpeed\n"
+    "  corvcim -o json ei root/cimv2:HALDA_CPUMemory\n"
+    "  corvcim tree -o svg > machine.svg\n";
+
+}  // namespace
+
+std::string programHelp() {
+  std::string text(introduction);
+  for (const VerbSyntax& verb : verbs()) {
+    std::string call(verb.name);
+    if (!verb.operands.empty()) {
+      call += ' ' + std::string(verb.operands);
+    }
+    text += "  " + padRight(call, 24) + std::string(verb.summary) + '\n';
+  }
+  text += optionHelp;
+  text += associationHelp;
+  text += ending;
+  return text;
+}
+
+std::string verbHelp(const VerbSyntax& verb) {
+  std::string text = "Usage: corvcim [OPTION...] " + std::string(verb.name);
+  if (!verb.operands.empty()) {
+    text += ' ' + std::string(verb.operands);
+  }
+  text += "\n\nShows " + std::string(verb.summary) + ".\n";
+  text += "Output: " + formatList(verb.formats) + ".\n";
+  if (!verb.details.empty()) {
+    text += '\n' + std::string(verb.details);
+  }
+  if (verb.isAssociation) {
+    text += associationHelp;
+  }
+  return text;
+}
+
+std::string versionText() {
+  return "corvcim " CORVCIM_VERSION "\n";
+}
+
+}  // namespace Corvcim

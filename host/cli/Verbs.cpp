@@ -1,0 +1,93 @@
+#include "host/cli/Verbs.h"
+
+namespace Corvcim {
+namespace {
+
+constexpr Format textOnly[] = {Format::Text};
+constexpr Format dataFormats[] = {Format::Text, Format::Mof, Format::Json};
+constexpr Format plainFormats[] = {Format::Text, Format::Json};
+constexpr Format drawingFormats[] = {Format::Text, Format::Svg, Format::Dot};
+
+constexpr std::string_view pathDetails =
+    "PATH is an object path such as\n"
+    "  root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"0-0\"\n"
+    "as ein prints it; the namespace may be left out.\n";
+
+constexpr std::string_view classDetails =
+    "CLASS is a class name, with or without a namespace before it (root/cimv2:HALDA_CPUMemory).\n";
+
+constexpr std::string_view associatorDetails =
+    "PATH is an object path as ein prints it; the namespace may be left out.\n"
+    "Without -ac every association class that PATH's class takes part in is asked.\n";
+
+constexpr std::string_view referenceDetails =
+    "PATH is an object path as ein prints it; the namespace may be left out.\n"
+    "Without -arc (or -ac) every association class that PATH's class takes part in is asked.\n";
+
+constexpr VerbSyntax overview = {"", Verb::Overview, "", 0, 0, "one screen about the processors", textOnly, false, ""};
+
+constexpr VerbSyntax syntaxes[] = {
+    {"classes", Verb::Classes, "", 0, 0, "the classes that can be asked, with their keys", plainFormats, false, ""},
+    {"ei", Verb::EnumerateInstances, "CLASS [PROPERTY,...]", 1, 2, "every instance of a class", dataFormats, false,
+     classDetails},
+    {"ein", Verb::EnumerateInstanceNames, "CLASS", 1, 1, "the paths of every instance", dataFormats, false,
+     classDetails},
+    {"gi", Verb::GetInstance, "PATH [PROPERTY,...]", 1, 2, "one instance", dataFormats, false, pathDetails},
+    {"ai", Verb::Associators, "PATH [PROPERTY,...]", 1, 2, "the instances associated with one", dataFormats, true,
+     associatorDetails},
+    {"ain", Verb::AssociatorNames, "PATH", 1, 1, "the paths of those", dataFormats, true, associatorDetails},
+    {"ri", Verb::References, "PATH [PROPERTY,...]", 1, 2, "the associations that refer to an instance", dataFormats,
+     true, referenceDetails},
+    {"rin", Verb::ReferenceNames, "PATH", 1, 1, "the paths of those", dataFormats, true, referenceDetails},
+    {"inventory", Verb::Inventory, "", 0, 0,
+     "the inventory that the library reads; -o json writes a file for json:FILE", plainFormats, false, ""},
+    {"tree", Verb::Tree, "", 0, 0, "system, processors, cores and caches as a drawing", drawingFormats, false,
+     "Caches stand above the cores that share them, as the inventory tells it.\n"},
+};
+
+}  // namespace
+
+std::span<const VerbSyntax> verbs() {
+  return syntaxes;
+}
+
+const VerbSyntax* findVerb(std::string_view name) {
+  for (const VerbSyntax& syntax : syntaxes) {
+    if (syntax.name == name) {
+      return &syntax;
+    }
+  }
+  return nullptr;
+}
+
+const VerbSyntax& overviewSyntax() {
+  return overview;
+}
+
+std::string_view formatName(Format format) {
+  switch (format) {
+    case Format::Text:
+      return "text";
+    case Format::Mof:
+      return "mof";
+    case Format::Json:
+      return "json";
+    case Format::Svg:
+      return "svg";
+    case Format::Dot:
+      return "dot";
+  }
+  return "";
+}
+
+std::string formatList(std::span<const Format> formats) {
+  std::string list;
+  for (std::size_t i = 0; i < formats.size(); ++i) {
+    const bool isLast = i + 1 == formats.size();
+    list += i == 0 ? "" : isLast ? " or " : ", ";
+    list += formatName(formats[i]);
+  }
+  return list;
+}
+
+}  // namespace Corvcim

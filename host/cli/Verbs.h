@@ -1,0 +1,55 @@
+#ifndef HOST_CLI_VERBS_H
+#define HOST_CLI_VERBS_H
+
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace Corvcim {
+
+enum class Verb {
+  Overview,
+  Classes,
+  EnumerateInstances,
+  EnumerateInstanceNames,
+  GetInstance,
+  Associators,
+  AssociatorNames,
+  References,
+  ReferenceNames,
+  Inventory,
+  Tree
+};
+
+enum class Format { Text, Mof, Json, Svg, Dot };
+
+/// What the command line may say after one verb, and what its help says.
+struct VerbSyntax {
+  std::string_view name;
+  Verb verb;
+  std::string_view operands;  ///< as the usage line names them
+  unsigned minimumOperands;
+  unsigned maximumOperands;
+  std::string_view summary;
+  std::span<const Format> formats;  ///< the output formats that the verb knows
+  bool isAssociation;               ///< takes the options that name ends and classes
+  std::string_view details;         ///< further paragraphs of the verb's own help
+};
+
+/// All verbs, in the order in which the help lists them. Overview has no name and is not listed.
+std::span<const VerbSyntax> verbs();
+
+/// The verb of that name, or NULL.
+const VerbSyntax* findVerb(std::string_view name);
+
+/// The syntax of `corvcim` without a verb.
+const VerbSyntax& overviewSyntax();
+
+std::string_view formatName(Format format);
+
+/// The names of the formats, as a sentence lists them: "text, mof or json".
+std::string formatList(std::span<const Format> formats);
+
+}  // namespace Corvcim
+
+#endif
