@@ -9,6 +9,16 @@ using Tarn::CPUProvider::Processor;
 
 namespace {
 
+template <auto get>
+std::string readText(Processor& processor) {
+  return (processor.*get)();
+}
+
+template <auto get>
+unsigned int readNumber(Processor& processor) {
+  return (processor.*get)();
+}
+
 // Plain numbers: what goes in comes out, cut to 16 bits where the field has 16.
 
 struct NumberCase {
@@ -18,53 +28,41 @@ struct NumberCase {
   bool is16Bit;
 };
 
-#define NUMBER(NAME, IS_16_BIT)                                                                                       \
-  {                                                                                                                   \
-#NAME, &Processor::set##NAME, [](Processor & processor) -> unsigned int { return processor.get##NAME(); },        \
-                                                                                                            IS_16_BIT \
-  }
-
 const NumberCase numbers[] = {
-    NUMBER(MaxClockSpeed, false),
-    NUMBER(CurrentClockSpeed, false),
-    NUMBER(ExternalClockSpeed, false),
-    NUMBER(CPUStatus, true),
-    NUMBER(DataWidth, true),
-    NUMBER(AddressWidth, true),
-    NUMBER(UpgradeMethod, true),
-    NUMBER(NumberOfProcessorCores, true),
-    NUMBER(NumberOfEnabledCores, true),
-    NUMBER(NumberOfHardwareThreads, true),
-    NUMBER(Family, true),
+    {"MaxClockSpeed", &Processor::setMaxClockSpeed, readNumber<&Processor::getMaxClockSpeed>, false},
+    {"CurrentClockSpeed", &Processor::setCurrentClockSpeed, readNumber<&Processor::getCurrentClockSpeed>, false},
+    {"ExternalClockSpeed", &Processor::setExternalClockSpeed, readNumber<&Processor::getExternalClockSpeed>, false},
+    {"CPUStatus", &Processor::setCPUStatus, readNumber<&Processor::getCPUStatus>, true},
+    {"DataWidth", &Processor::setDataWidth, readNumber<&Processor::getDataWidth>, true},
+    {"AddressWidth", &Processor::setAddressWidth, readNumber<&Processor::getAddressWidth>, true},
+    {"UpgradeMethod", &Processor::setUpgradeMethod, readNumber<&Processor::getUpgradeMethod>, true},
+    {"NumberOfProcessorCores", &Processor::setNumberOfProcessorCores, readNumber<&Processor::getNumberOfProcessorCores>,
+     true},
+    {"NumberOfEnabledCores", &Processor::setNumberOfEnabledCores, readNumber<&Processor::getNumberOfEnabledCores>,
+     true},
+    {"NumberOfHardwareThreads", &Processor::setNumberOfHardwareThreads,
+     readNumber<&Processor::getNumberOfHardwareThreads>, true},
+    {"Family", &Processor::setFamily, readNumber<&Processor::getFamily>, true},
 };
-
-#undef NUMBER
 
 struct TextCase {
   const char* name;
   bool (Processor::*set)(std::string);
-  std::string (*get)(const Processor&);
+  std::string (*get)(Processor&);
   bool isStripped;  // by the getter
   bool mayBeEmpty;  // without the setter saying so
 };
 
-#define TEXT(NAME, IS_STRIPPED, MAY_BE_EMPTY)                                                                    \
-  {                                                                                                              \
-#NAME, &Processor::set##NAME, [](const Processor& processor) { return processor.get##NAME(); }, IS_STRIPPED, \
-                                                                                                 MAY_BE_EMPTY    \
-  }
-
 const TextCase textCases[] = {
-    TEXT(ProcessorDeviceID, true, false),
-    TEXT(InstanceId, true, false),
-    TEXT(ElementName, true, false),
-    TEXT(Name, false, true),
-    TEXT(UniqueId, false, false),
-    TEXT(Stepping, false, false),
-    TEXT(OtherFamilyDescription, false, false),
+    {"ProcessorDeviceID", &Processor::setProcessorDeviceID, readText<&Processor::getProcessorDeviceID>, true, false},
+    {"InstanceId", &Processor::setInstanceId, readText<&Processor::getInstanceId>, true, false},
+    {"ElementName", &Processor::setElementName, readText<&Processor::getElementName>, true, false},
+    {"Name", &Processor::setName, readText<&Processor::getName>, false, true},
+    {"UniqueId", &Processor::setUniqueId, readText<&Processor::getUniqueId>, false, false},
+    {"Stepping", &Processor::setStepping, readText<&Processor::getStepping>, false, false},
+    {"OtherFamilyDescription", &Processor::setOtherFamilyDescription, readText<&Processor::getOtherFamilyDescription>,
+     false, false},
 };
-
-#undef TEXT
 
 }  // namespace
 
