@@ -9,13 +9,13 @@ namespace CVLog {
 
 /// One message on its way to a sink. The views live as long as the call that delivers it.
 struct Message {
-  std::chrono::system_clock::time_point time;
+  std::chrono::system_clock::time_point time{};
   int level = 0;
-  std::string_view component;
-  std::string_view function;
-  std::string_view file;
+  std::string_view component{};
+  std::string_view function{};
+  std::string_view file{};
   int line = 0;
-  std::string_view text;
+  std::string_view text{};
 };
 
 /// The message as one line without its end:

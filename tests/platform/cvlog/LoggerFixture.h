@@ -1,0 +1,51 @@
+#ifndef CORVANE_TESTS_PLATFORM_CVLOG_LOGGERFIXTURE_H
+#define CORVANE_TESTS_PLATFORM_CVLOG_LOGGERFIXTURE_H
+
+#include <cvlog/CVLogger.h>
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <regex>
+#include <string>
+
+/// A process whose logger nobody has configured yet, and whose configuration file is the test's.
+class LoggerProcess : public testing::Test {
+ protected:
+  LoggerProcess() {
+    std::filesystem::create_directories(directory_);
+    unsetenv("CORVANE_LOG");
+    unsetenv("CORVANE_TRACE");
+    configure("");
+  }
+  ~LoggerProcess() override { std::filesystem::remove_all(directory_); }
+
+  [[nodiscard]] std::string path(const std::string& name) const { return directory_ + "/" + name; }
+
+  void configure(const std::string& text) const {
+    std::ofstream(path("corvane.conf")) << text;
+    setenv("CORVANE_CONFIG", path("corvane.conf").c_str(), 1);
+  }
+
+  static void log(int level, const std::string& text) {
+    CVLog::CVLogger::logLevelMessage("function", "file.cpp", 12, "Corvane.Test", level, nullptr, 0, 0, text);
+  }
+  static void trace(int level, const std::string& text) {
+    CVLog::CVLogger::traceLevelMessage("function", "file.cpp", 12, "Corvane.Test", level, nullptr, 0, 0, text);
+  }
+
+  /// The file's content with TIME in place of each line's time.
+  [[nodiscard]] std::string content(const std::string& name) const {
+    std::ifstream file(path(name));
+    const std::string text(std::istreambuf_iterator<char>(file), {});
+    static const std::regex time(R"((^|\n)\d{4}-\d{2}-\d{2}T\d{2}:\d{2}:\d{2}\.\d{3}Z )");
+    return std::regex_replace(text, time, "$1TIME ");
+  }
+
+  std::string directory_ = testing::TempDir() + "logger_" + std::to_string(getpid());
+};
+
+#endif

@@ -1,0 +1,111 @@
+#include "platform/cvlog/Settings.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <optional>
+#include <string>
+
+namespace {
+
+using CVLog::defaultLog;
+using CVLog::defaultTrace;
+using CVLog::Destination;
+using CVLog::DestinationKind;
+using CVLog::makeSettings;
+using CVLog::parseDestination;
+using CVLog::Settings;
+using CVLog::SinkSettings;
+using Tarn::Common::Configuration;
+using Tarn::Common::ConfigurationProblem;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+const Destination kFileX = {DestinationKind::kFile, "/x:y"};
+
+Settings fromFile(const std::string& text) {
+  return makeSettings(Configuration::parse(text, "corvane.conf"), std::nullopt, std::nullopt);
+}
+
+TEST(LogSettings, SendErrorsToTheSystemLogByDefault) {
+  const Settings settings = fromFile("");
+  EXPECT_EQ(settings.log,
+            (SinkSettings{.level = 6000, .destination = {DestinationKind::kSystemLog, {}}, .perMinute = 60}));
+  EXPECT_EQ(settings.trace, (SinkSettings{.level = 3000, .destination = {DestinationKind::kNone, {}}, .perMinute = 0}));
+  EXPECT_THAT(settings.problems, IsEmpty());
+}
+
+TEST(LogSettings, ComeFromTheFile) {
+  const Settings settings = fromFile(
+      "log.level = warning\nlog.destination = file:/x:y\nlog.rate = 5\n"
+      "trace.level = 4000\ntrace.destination = stderr\n");
+  EXPECT_EQ(settings.log, (SinkSettings{.level = 5000, .destination = kFileX, .perMinute = 5}));
+  EXPECT_EQ(settings.trace,
+            (SinkSettings{.level = 4000, .destination = {DestinationKind::kStandardError, {}}, .perMinute = 0}));
+  EXPECT_THAT(settings.problems, IsEmpty());
+}
+
+TEST(LogSettings, LimitTheSystemLogUnlessTheyAreToldNotTo) {
+  EXPECT_EQ(fromFile("trace.destination = syslog\n").trace.perMinute, 60U);
+  EXPECT_EQ(fromFile("trace.destination = syslog\ntrace.rate = 0\n").trace.perMinute, 0U);
+  EXPECT_EQ(fromFile("log.destination = stderr\n").log.perMinute, 0U);
+}
+
+TEST(LogSettings, OverridesComeBeforeTheFile) {
+  const Configuration file = Configuration::parse("log.level = info\nlog.destination = none\n", "corvane.conf");
+  const Settings settings = makeSettings(file, "debug:stderr", "6000:file:/x:y");
+  EXPECT_EQ(settings.log,
+            (SinkSettings{.level = 3000, .destination = {DestinationKind::kStandardError, {}}, .perMinute = 0}));
+  EXPECT_EQ(settings.trace, (SinkSettings{.level = 6000, .destination = kFileX, .perMinute = 0}));
+  EXPECT_THAT(settings.problems, IsEmpty());
+}
+
+TEST(LogSettings, BrokenValuesAreNamedAndTheRestCounts) {
+  const Settings settings =
+      fromFile("log.level = loud\nlog.destination = file:\ntrace.rate = -1\ntrace.level = error\n");
+  SinkSettings errorsOnly = defaultTrace();
+  errorsOnly.level = 6000;
+  EXPECT_EQ(settings.log, defaultLog());
+  EXPECT_EQ(settings.trace, errorsOnly);
+  EXPECT_THAT(
+      settings.problems,
+      ElementsAre(
+          ConfigurationProblem{"corvane.conf:1",
+                               "\"loud\" does not count: expected error, warning, info, debug or a number"},
+          ConfigurationProblem{"corvane.conf:2",
+                               "\"file:\" does not count: expected none, stderr, syslog or file:PATH"},
+          ConfigurationProblem{"corvane.conf:3",
+                               "\"-1\" does not count: expected a number of messages a minute, 0 for no limit"}));
+}
+
+TEST(LogSettings, BrokenOverridesLeaveTheFileInForce) {
+  const Configuration file = Configuration::parse("log.level = info\n", "corvane.conf");
+  for (const char* broken : {"debug", "debug:", "debug:printer", "loud:stderr", ":stderr", "stderr"}) {
+    const Settings settings = makeSettings(file, broken, std::nullopt);
+    EXPECT_EQ(settings.log.level, 4000) << broken;
+    EXPECT_THAT(
+        settings.problems,
+        ElementsAre(ConfigurationProblem{
+            "CORVANE_LOG", '"' + std::string(broken) +
+                               "\" does not count: expected LEVEL:DESTINATION, where LEVEL is error, warning, "
+                               "info, debug or a number and DESTINATION is none, stderr, syslog or file:PATH"}));
+  }
+}
+
+TEST(LogSettings, ProblemsOfTheFileAreKept) {
+  EXPECT_THAT(fromFile("nonsense\n").problems,
+              ElementsAre(ConfigurationProblem{"corvane.conf:1",
+                                               "expected \"key = value\" but there is no \"=\"; the line is ignored"}));
+}
+
+TEST(LogSettings, DestinationsAreTheseAndNoOthers) {
+  EXPECT_EQ(parseDestination("none"), (Destination{DestinationKind::kNone, {}}));
+  EXPECT_EQ(parseDestination("stderr"), (Destination{DestinationKind::kStandardError, {}}));
+  EXPECT_EQ(parseDestination("syslog"), (Destination{DestinationKind::kSystemLog, {}}));
+  EXPECT_EQ(parseDestination("file:/x:y"), kFileX);
+  for (const char* text : {"", "stdout", "None", "file", "file:", "/x"}) {
+    EXPECT_EQ(parseDestination(text), std::nullopt) << text;
+  }
+}
+
+}  // namespace
