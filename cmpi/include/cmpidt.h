@@ -208,6 +208,8 @@ typedef enum _CMPIErrorSeverity {
 
 typedef enum _CMPIErrorSrcFormat { CMPIErrSrcUnknown = 0, CMPIErrSrcOther = 1, CIMObjectHandle = 2 } CMPIErrorSrcFormat;
 
+/* The causes are those of the alarm standards and opaque here: a code passes through as it is. Only
+ * its width counts, which the one enumerator fixes. */
 typedef enum _CMPIErrorProbableCause { ErrorProbCauseUnknown = 0 } CMPIErrorProbableCause;
 
 /* Encapsulated objects: a handle of the broker's and its table of operations (cmpift.h). */
