@@ -81,7 +81,7 @@ class ArchiveReader {
   }
 
   FileError errorOf(std::string_view name) const {
-    const auto found = std::ranges::find(errorNames, name, &ErrorName::name);
+    const auto* const found = std::ranges::find(errorNames, name, &ErrorName::name);
     if (found == errorNames.end()) {
       refuse("unknown error " + std::string(name), "use EACCES, EINVAL, EIO, ENOENT, ENXIO or EPERM");
     }
@@ -96,7 +96,7 @@ class ArchiveReader {
 };
 
 std::string_view nameOfError(FileError error) {
-  const auto found = std::ranges::find(errorNames, error, &ErrorName::error);
+  const auto* const found = std::ranges::find(errorNames, error, &ErrorName::error);
   return found == errorNames.end() ? "EIO" : found->name;
 }
 

@@ -128,7 +128,7 @@ std::span<const ArmPart> armParts() {
 
 const ArmPart* findArmPart(unsigned int implementer, unsigned int part) {
   const std::pair wanted(implementer, part);
-  const auto found = std::ranges::lower_bound(parts, wanted, {}, keyOf);
+  const auto* const found = std::ranges::lower_bound(parts, wanted, {}, keyOf);
   return found == parts.end() || keyOf(*found) != wanted ? nullptr : &*found;
 }
 

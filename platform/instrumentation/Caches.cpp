@@ -64,7 +64,7 @@ class CacheReader {
       // While a CPU is offline most kernels have nothing to say about its caches.
       if (index == 0 && online.contains(cpu)) {
         machine_.noteUnreadOfCpu(cpu, "cache",
-                                 "mount sysfs on /sys, readable for this process; "
+                                 "mount sysfs on /sys; "
                                  "some virtual machines have no such directory");
       }
     }

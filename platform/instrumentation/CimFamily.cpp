@@ -185,9 +185,9 @@ unsigned int cimFamily(std::string_view vendor, std::string_view name, int famil
     return std::tuple(row.brand.size(), row.family != any, row.model != any);
   };
   const FamilyRow* best = nullptr;
-  for (const FamilyRow& row : std::ranges::equal_range(rows, vendor, {}, &FamilyRow::vendor)) {
-    const bool matches =
-        plain.find(row.brand) != std::string::npos && fits(row.family, family) && fits(row.model, model);
+  for (const FamilyRow& row : rows) {
+    const bool matches = row.vendor == vendor && plain.find(row.brand) != std::string::npos &&
+                         fits(row.family, family) && fits(row.model, model);
     if (matches && (best == nullptr || weight(row) > weight(*best))) {
       best = &row;
     }

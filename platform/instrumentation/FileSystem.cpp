@@ -36,7 +36,7 @@ constexpr std::array errorTexts = {
 }  // namespace
 
 std::string describeError(FileError error) {
-  const auto found = std::ranges::find(errorTexts, error, &ErrorText::error);
+  const auto* const found = std::ranges::find(errorTexts, error, &ErrorText::error);
   return found == errorTexts.end() ? "system error " + std::to_string(error) : std::string(found->text);
 }
 

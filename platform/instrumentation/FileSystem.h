@@ -20,7 +20,9 @@ class FileSystem {
  public:
   FileSystem() = default;
   FileSystem(const FileSystem&) = delete;
+  FileSystem(FileSystem&&) = delete;
   FileSystem& operator=(const FileSystem&) = delete;
+  FileSystem& operator=(FileSystem&&) = delete;
   virtual ~FileSystem() = default;
 
   /// Reads a whole file into `contents`, which is a buffer to be used again and again; it is empty

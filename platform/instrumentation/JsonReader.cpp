@@ -19,6 +19,12 @@ using namespace NodeLexicon;
 constexpr const char* whatFailed = "can not read the inventory";
 constexpr const char* whatToDo = "correct the file; the format is described in docs/inventory.md";
 
+// The parser's messages begin with a tag for programmers, in brackets.
+std::string withoutTag(const std::string& message) {
+  const std::size_t end = message.find("] ");
+  return end == std::string::npos ? message : message.substr(end + 2);
+}
+
 // The parser keeps the last of two members with one name; here that is a mistake to be told.
 class DuplicateCheck {
  public:
@@ -235,7 +241,7 @@ Tree readJson(std::string_view text, const std::string& name) {
     const Json document = Json::parse(text, DuplicateCheck());
     return Reader(name).read(document);
   } catch (const Json::exception& error) {
-    throw InventoryError(whatFailed, name, std::string("it is not JSON: ") + error.what(), whatToDo);
+    throw InventoryError(whatFailed, name, "it is not JSON: " + withoutTag(error.what()), whatToDo);
   } catch (const std::invalid_argument& refused) {
     throw InventoryError(whatFailed, name, refused.what(), whatToDo);
   }

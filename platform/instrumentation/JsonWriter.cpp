@@ -41,7 +41,7 @@ class Writer {
 
  private:
   // The nodes of a stretch, each with what is below it; the list's brackets are the caller's.
-  void writeNodes(NodeIndex begin, NodeIndex end, unsigned int depth) {
+  void writeNodes(NodeIndex begin, NodeIndex end, std::size_t depth) {
     if (begin == end) {
       return;
     }

@@ -22,14 +22,16 @@ class Machine {
   const CpuInfo& cpuInfo() const { return cpuInfo_; }
   UnreadLog& unread() { return unread_; }
 
-  /// Notes that the last call to `attributes` could not read its file.
-  void noteUnread(const Attributes& attributes, std::string remedy);
+  /// Notes that a file could not be read. The remedy is for a file that is not there or not usable; for
+  /// one that this process may not read there is only one.
+  void noteUnread(const std::string& file, FileError error, const std::string& remedy);
 
   /// Notes that what stands at cpuN/`suffix` could not be read, for the reason of the last call to cpus().
-  void noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, std::string remedy);
+  void noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, const std::string& remedy);
 
   /// As above, for another reason.
-  void noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, std::string reason, std::string remedy);
+  void noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, const std::string& reason,
+                       const std::string& remedy);
 
  private:
   std::unique_ptr<FileSystem> cpuDirectory_;

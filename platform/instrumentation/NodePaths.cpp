@@ -25,8 +25,8 @@ std::vector<std::string> choose(std::vector<Choice> choices) {
   std::ranges::sort(taken);
   std::vector<std::string> paths;
   for (Choice& choice : choices) {
-    const auto same = std::ranges::equal_range(taken, choice.preferred);
-    const bool good = !choice.preferred.empty() && choice.preferred.size() <= longestPath && same.size() == 1;
+    const auto [first, last] = std::equal_range(taken.begin(), taken.end(), choice.preferred);
+    const bool good = !choice.preferred.empty() && choice.preferred.size() <= longestPath && last - first == 1;
     paths.push_back(std::move(good ? choice.preferred : choice.byCpu));
   }
   return paths;

@@ -46,7 +46,7 @@ constexpr std::array types = {
 
 template <class Key>
 const PropertyEntry* findBy(Key PropertyEntry::*member, const Key& wanted) {
-  const auto found = std::ranges::find(properties, wanted, member);
+  const auto* const found = std::ranges::find(properties, wanted, member);
   return found == properties.end() ? nullptr : &*found;
 }
 
@@ -81,7 +81,7 @@ std::span<const NodeTypeEntry> nodeTypeTable() {
 }
 
 std::string_view nodeTypeName(NodeType type) {
-  const auto found = std::ranges::find(types, type, &NodeTypeEntry::type);
+  const auto* const found = std::ranges::find(types, type, &NodeTypeEntry::type);
   return found == types.end() ? "node" : found->name;
 }
 

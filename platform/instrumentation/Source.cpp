@@ -67,8 +67,9 @@ Tree loadInventory(std::string_view specification) {
   const std::size_t colon = specification.find(':');
   const std::string_view name = specification.substr(0, colon);
   const std::string location(colon == std::string_view::npos ? std::string_view() : specification.substr(colon + 1));
-  const auto scheme = std::ranges::find(schemes, name, &Scheme::name);
-  if (scheme == schemes.end() || scheme->hasLocation == location.empty()) {
+  const auto* const scheme = std::ranges::find(schemes, name, &Scheme::name);
+  if (scheme == schemes.end() || scheme->hasLocation != (colon != std::string_view::npos) ||
+      (scheme->hasLocation && location.empty())) {
     throw InventoryError(
         "can not read the inventory", '"' + std::string(specification) + '"', "it names no source of an inventory",
         "set CORVANE_INVENTORY, or inventory in the configuration, to live, root:DIRECTORY or json:FILE");

@@ -48,21 +48,20 @@ std::string hypervisorModel(Machine& machine) {
 }  // namespace
 
 std::string readSystemModel(Machine& machine) {
-  const std::string product(machine.root().text("sys/class/dmi/id/product_name").value_or(std::string_view()));
+  std::string product(machine.root().text("sys/class/dmi/id/product_name").value_or(std::string_view()));
   if (!product.empty() && !std::ranges::binary_search(placeholders, product)) {
     return product;
   }
-  const bool unreadable = machine.root().error() != 0;
   const std::string file = machine.root().fileName();
-  const std::string reason = describeError(machine.root().error());
+  const FileError error = machine.root().error();
   std::string model = deviceTreeModel(machine);
-  if (model.empty()) {
-    if (unreadable) {
-      machine.unread().add(file, reason, "it is there on machines whose firmware has DMI tables");
-    }
-    model = hypervisorModel(machine);
+  if (!model.empty()) {
+    return model;
   }
-  return model;
+  if (error != 0) {
+    machine.noteUnread(file, error, "it is there on machines whose firmware has DMI tables");
+  }
+  return hypervisorModel(machine);
 }
 
 }  // namespace Tarn::Inventory

@@ -10,7 +10,7 @@ namespace Tarn::Inventory {
 
 namespace {
 
-constexpr const char* mountSys = "mount sysfs on /sys, readable for this process";
+constexpr const char* mountSys = "mount sysfs on /sys";
 
 /// What the kernel tells of one CPU's place.
 struct CpuPlace {
@@ -54,7 +54,7 @@ class TopologyReader {
     topology_.present = readPresent();
     std::optional<CpuSet> online = cpus_.list("online");
     if (!online) {
-      machine_.noteUnread(cpus_, mountSys);
+      machine_.noteUnread(cpus_.fileName(), cpus_.error(), mountSys);
       online = machine_.cpuInfo().cpus().empty() ? topology_.present : machine_.cpuInfo().cpus();
     }
     topology_.online = *std::move(online);
@@ -65,7 +65,7 @@ class TopologyReader {
     if (std::optional<CpuSet> present = cpus_.list("present"); present && !present->empty()) {
       return *std::move(present);
     }
-    machine_.noteUnread(cpus_, mountSys);
+    machine_.noteUnread(cpus_.fileName(), cpus_.error(), mountSys);
     CpuSet present = machine_.cpuInfo().cpus();
     std::vector<std::string> names;
     machine_.root().files().list("sys/devices/system/cpu", names);

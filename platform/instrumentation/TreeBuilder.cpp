@@ -142,7 +142,7 @@ TreeBuilder& TreeBuilder::list(Properties id, std::vector<unsigned int> value) {
   return *this;
 }
 
-TreeBuilder& TreeBuilder::unread(Unread entry) {
+TreeBuilder& TreeBuilder::unread(const Unread& entry) {
   tree_.unread_.push_back({validUtf8(entry.file), validUtf8(entry.reason), validUtf8(entry.remedy)});
   return *this;
 }

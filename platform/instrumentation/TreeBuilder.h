@@ -44,7 +44,7 @@ class TreeBuilder {
   TreeBuilder& list(NodeLexicon::Properties id, std::vector<unsigned int> value);
 
   /// Reports something that the source could not read.
-  TreeBuilder& unread(Unread entry);
+  TreeBuilder& unread(const Unread& entry);
 
   /// The tree; the builder is empty afterwards.
   Tree build();
