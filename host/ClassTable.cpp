@@ -133,7 +133,7 @@ constexpr PropertyDefinition concreteComponentProperties[] = {
 };
 
 constexpr ClassDefinition classes[] = {
-    {"HALDA_ComputerSystem", "CIM_ComputerSystem", false, computerSystemProperties, "ComputerSystemProvider",
+    {"HALDA_ComputerSystem", "CIM_ComputerSystem", false, computerSystemProperties, "CorvaneComputerSystemProvider",
      systemLibrary, systemGroup},
     {"HALDA_CPUProcessor", "CIM_Processor", false, processorProperties, "CPUProcessorProvider", cpuLibrary, cpuGroup},
     {"HALDA_CPUProcessorCore", "CIM_ProcessorCore", false, coreProperties, "CPUProcessorCoreProvider", cpuLibrary,
