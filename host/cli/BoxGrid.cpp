@@ -48,17 +48,24 @@ std::vector<std::span<Box>> rowsOf(std::vector<Box>& boxes, int maxWidth) {
   return rows;
 }
 
-void placeRow(std::span<Box> row, int top) {
+bool isContainer(const Box& box) {
+  return box.style == Box::Style::Processor || box.style == Box::Style::SharedCache;
+}
+
+void placeRow(std::span<Box> row, Corner corner) {
   const int height = std::ranges::max_element(row, {}, &Box::height)->height;
-  int left = boxPadding;
   for (Box& box : row) {
-    box.x = left;
-    box.y = top;
-    if (box.style == Box::Style::Processor || box.style == Box::Style::SharedCache) {
+    box.x = corner.x;
+    box.y = corner.y;
+    if (isContainer(box)) {
       box.height = height;
     }
-    left += box.width + boxGap;
+    corner.x += box.width + boxGap;
   }
+}
+
+bool isAloneInRow(const Box& box, const std::vector<Box>& others) {
+  return std::ranges::none_of(others, [&](const Box& other) { return &other != &box && other.y == box.y; });
 }
 
 }  // namespace
@@ -111,15 +118,24 @@ std::size_t columnsFor(std::size_t count, std::size_t limit) {
   return best;
 }
 
-void arrange(Box& parent, std::vector<Box> boxes, int top, int maxWidth) {
-  int bottom = top;
+void arrange(Box& parent, std::vector<Box> boxes, Corner corner, int maxWidth) {
+  int bottom = corner.y;
   for (const std::span<Box> row : rowsOf(boxes, maxWidth)) {
-    placeRow(row, bottom);
+    placeRow(row, {corner.x, bottom});
     bottom += std::ranges::max_element(row, {}, &Box::height)->height + boxGap;
-    parent.width = std::max(parent.width, takenWidth(row) + 2 * boxPadding);
+    parent.width = std::max(parent.width, takenWidth(row) + 2 * corner.x);
   }
-  parent.height = std::max(parent.height, bottom - (boxes.empty() ? 0 : boxGap) + boxPadding);
+  parent.height = std::max(parent.height, bottom - (boxes.empty() ? 0 : boxGap) + corner.x);
   std::ranges::move(boxes, std::back_inserter(parent.inner));
+}
+
+void stretch(Box& box, int width) {
+  box.width = width;
+  for (Box& inner : box.inner) {
+    const bool isHeader = inner.style == Box::Style::CacheBar && isContainer(box);
+    const bool canGrow = isHeader || (isContainer(inner) && isAloneInRow(inner, box.inner));
+    stretch(inner, canGrow ? width - 2 * inner.x : inner.width);
+  }
 }
 
 }  // namespace Corvcim

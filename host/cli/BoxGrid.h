@@ -24,9 +24,21 @@ std::string fitText(TextStyle style, const std::string& text, int width);
 /// gaps in the last row.
 std::size_t columnsFor(std::size_t count, std::size_t limit);
 
-/// Puts the boxes into `parent`, in rows below `top`, not wider than `maxWidth` where one box alone is
-/// not, and makes the parent large enough for them. Boxes around others reach down to their row's end.
-void arrange(Box& parent, std::vector<Box> boxes, int top, int maxWidth);
+/// Where the first of several boxes goes, from the corner of the box around them. The distance from
+/// the left is kept on the right and below as well.
+struct Corner {
+  int x;
+  int y;
+};
+
+/// Puts the boxes into `parent`, in rows from the corner on, not wider than `maxWidth` where one box
+/// alone is not, and makes the parent large enough for them. Boxes around others reach down to their
+/// row's end.
+void arrange(Box& parent, std::vector<Box> boxes, Corner corner, int maxWidth);
+
+/// Makes the box that wide. Boxes around others that have a row for themselves, and the bars on top of
+/// them, become as wide as there is room.
+void stretch(Box& box, int width);
 
 }  // namespace Corvcim
 

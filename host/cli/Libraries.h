@@ -13,9 +13,8 @@ namespace Corvcim {
 inline constexpr std::string_view providerLibraryName = "corvcpuprofileprovider";
 inline constexpr std::string_view companionLibraryName = "corvcomputersystemprovider";
 
-/// The file of the library with that base name which belongs to this program: below ../lib of the
-/// program's own directory, where a build tree has it, or where the package installs it. Empty where
-/// there is none.
+/// The file of the library with that base name which belongs to this program, in the build tree or
+/// where the package installs it. Empty where there is none.
 std::string findLibrary(std::string_view baseName);
 
 /// The files for the dispatcher: what the options name, else what findLibrary finds. A companion that

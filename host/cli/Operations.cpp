@@ -3,6 +3,7 @@
 #include <stdexcept>
 #include <utility>
 
+#include "host/broker/Names.h"
 #include "host/cli/ResultWriter.h"
 #include "platform/instrumentation/ProcessTree.h"
 
@@ -123,7 +124,10 @@ Outcome performOperation(Dispatcher& dispatcher, const Options& options) {
       outcome.errors.push_back(what + describeStatus(answer.response.rc, answer.response.message));
     }
     for (const ClassFailure& failure : answer.failures) {
-      outcome.errors.push_back(what + failure.className + ": " + describeStatus(failure.rc, failure.message));
+      // An operation on one class has said already which one it is.
+      const std::string className =
+          sameName(failure.className, operation.path.className) ? "" : failure.className + ": ";
+      outcome.errors.push_back(what + className + describeStatus(failure.rc, failure.message));
     }
     if (isEmpty(answer.response)) {
       if (const std::optional<std::string> error = inventoryError()) {

@@ -62,8 +62,10 @@ std::string coreText(const OverviewProcessor& overview) {
   const std::optional<std::uint64_t> threads = numberOf(overview.capabilities, "NumberOfHardwareThreads");
   const std::uint64_t enabled = numberOf(overview.processor, "NumberOfEnabledCores").value_or(0);
   const bool allEnabled = cores && *cores == enabled;
-  return listed({cores ? counted(*cores, "core") + (allEnabled ? " enabled" : "") : "",
-                 allEnabled || enabled == 0 ? "" : std::to_string(enabled) + " enabled",
+  return listed({cores ? counted(*cores, "core") : "",
+                 allEnabled && enabled > 1 ? "all enabled"
+                 : enabled == 0            ? ""
+                                           : std::to_string(enabled) + " enabled",
                  threads ? counted(*threads, "thread") : ""});
 }
 

@@ -152,7 +152,7 @@ class Nesting {
 
 void sortFromOutside(std::vector<CacheNode>& caches) {
   std::ranges::stable_sort(caches, [](const CacheNode& left, const CacheNode& right) {
-    return std::pair(left.depth, left.unit.name) > std::pair(right.depth, right.unit.name);
+    return left.depth != right.depth ? left.depth > right.depth : left.unit.name < right.unit.name;
   });
 }
 
@@ -221,13 +221,13 @@ TopologyProcessor readProcessor(const Tree& tree, NodeIndex index) {
   return processor;
 }
 
-void collectCores(const TopologyPart& part, std::vector<const TopologyPart*>& cores) {
-  if (part.isCore()) {
-    cores.push_back(&part);
-    return;
-  }
-  for (const TopologyPart& inner : part.parts) {
-    collectCores(inner, cores);
+void collectCores(std::span<const TopologyPart> parts, std::vector<const TopologyPart*>& cores) {
+  for (const TopologyPart& part : parts) {
+    if (part.isCore()) {
+      cores.push_back(&part);
+    } else {
+      collectCores(part.parts, cores);
+    }
   }
 }
 
@@ -253,6 +253,13 @@ std::string stateNote(unsigned int status) {
     default:
       return "status " + std::to_string(status);
   }
+}
+
+std::string cpuListText(const CpuSet& cpus) {
+  if (cpus.empty()) {
+    return "";
+  }
+  return (cpus.count() == 1 ? "CPU " : "CPUs ") + cpus.toList();
 }
 
 std::string labelsOf(std::span<const CacheUnit> caches) {
@@ -324,16 +331,19 @@ Topology readTopology(const Tree& tree, std::string_view systemName) {
   return topology;
 }
 
-bool hasSameShape(const TopologyPart& left, const TopologyPart& right) {
-  return left.caches == right.caches && left.status == right.status && left.cpus.count() == right.cpus.count() &&
-         std::ranges::equal(left.parts, right.parts, hasSameShape);
+bool hasSameShape(const TopologyPart& left, const TopologyPart& right, States states) {
+  return left.caches == right.caches && (states == States::Ignored || left.status == right.status) &&
+         left.cpus.count() == right.cpus.count() &&
+         std::ranges::equal(left.parts, right.parts, [states](const TopologyPart& one, const TopologyPart& other) {
+           return hasSameShape(one, other, states);
+         });
 }
 
-std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts) {
+std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts, States states) {
   std::vector<PartRun> runs;
   while (!parts.empty()) {
     std::size_t length = 1;
-    while (length < parts.size() && hasSameShape(parts.front(), parts[length])) {
+    while (length < parts.size() && hasSameShape(parts.front(), parts[length], states)) {
       ++length;
     }
     runs.push_back(parts.first(length));
@@ -342,9 +352,9 @@ std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts) {
   return runs;
 }
 
-std::vector<const TopologyPart*> coresOf(const TopologyPart& part) {
+std::vector<const TopologyPart*> coresOf(std::span<const TopologyPart> parts) {
   std::vector<const TopologyPart*> cores;
-  collectCores(part, cores);
+  collectCores(parts, cores);
   return cores;
 }
 

@@ -63,6 +63,9 @@ Topology readTopology(const Tarn::Inventory::Tree& tree, std::string_view system
 /// What a node's status means in a drawing: "offline", "disabled"; empty for a part in use.
 std::string stateNote(unsigned int status);
 
+/// "CPU 3", "CPUs 0-3,8"; empty for no CPU.
+std::string cpuListText(const Tarn::Inventory::CpuSet& cpus);
+
 /// "L2 2 MiB, L1d 48 KiB, L1i 32 KiB", with the states of those that are not in use; equal neighbours
 /// are counted: "4 × L2 1 MiB".
 std::string labelsOf(std::span<const CacheUnit> caches);
@@ -73,18 +76,21 @@ std::vector<std::string> factsOf(const TopologyProcessor& processor);
 /// "PowerBox 300 · 2 processors · 128 cores · 256 threads".
 std::string summaryOf(const Topology& topology);
 
+/// Whether the states of cores count when shapes are compared.
+enum class States { Count, Ignored };
+
 /// Whether two parts look the same: the same caches, the same number of CPUs and the same states all
 /// the way down. Names and numbers of cores and CPUs do not count.
-bool hasSameShape(const TopologyPart& left, const TopologyPart& right);
+bool hasSameShape(const TopologyPart& left, const TopologyPart& right, States states = States::Count);
 
 /// Neighbours of one shape.
 using PartRun = std::span<const TopologyPart>;
 
 /// The parts, cut into runs of the same shape.
-std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts);
+std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts, States states = States::Count);
 
-/// All cores below (or being) the part, in order.
-std::vector<const TopologyPart*> coresOf(const TopologyPart& part);
+/// All cores among and below the parts, in order.
+std::vector<const TopologyPart*> coresOf(std::span<const TopologyPart> parts);
 
 }  // namespace Corvcim
 

@@ -47,7 +47,7 @@ class Graph {
         "  graph [rankdir=LR, ranksep=0.4, nodesep=0.12, bgcolor=white, fontname=\"Helvetica\"];\n"
         "  node [shape=box, style=\"filled,rounded\", fontname=\"Helvetica\", fontsize=11, color=\"#5b6770\", "
         "margin=\"0.12,0.06\"];\n"
-        "  edge [arrowhead=none, color=\"#5b6770\"];\n";
+        "  edge [arrowhead=none, tailport=e, headport=w, color=\"#5b6770\"];\n";
     add(system);
     text_ += "}\n";
     return std::move(text_);

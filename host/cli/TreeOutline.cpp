@@ -25,16 +25,9 @@ void addState(OutlineItem& item, unsigned int status) {
   addDetail(item, stateNote(status));
 }
 
-std::string cpuText(const CpuSet& cpus) {
-  if (cpus.empty()) {
-    return "";
-  }
-  return (cpus.count() == 1 ? "CPU " : "CPUs ") + cpus.toList();
-}
-
 OutlineItem coreItem(const TopologyPart& core) {
   OutlineItem item = {Kind::Core, "core " + core.corePath, {}, true, {}};
-  addDetail(item, cpuText(core.cpus));
+  addDetail(item, cpuListText(core.cpus));
   addDetail(item, labelsOf(core.caches));
   addState(item, core.status);
   return item;
@@ -61,7 +54,7 @@ OutlineItem coreRunItem(PartRun run) {
   const TopologyPart& first = run.front();
   const std::string label = counted(run.size(), "core") + ' ' + first.corePath + " to " + run.back().corePath;
   OutlineItem item = {Kind::Core, label, {}, true, {}};
-  addDetail(item, cpuText(cpusOf(run)));
+  addDetail(item, cpuListText(cpusOf(run)));
   addDetail(item, eachHas(first));
   addState(item, first.status);
   return item;
@@ -109,8 +102,7 @@ OutlineItem processorItem(const TopologyProcessor& processor, bool isCompact) {
   item.isInUse = processor.status == Tarn::Inventory::Status::inUse;
   item.below = partItems(processor.parts, isCompact);
   if (!processor.otherCaches.empty()) {
-    item.below.push_back(
-        {Kind::Note, labelsOf(processor.otherCaches), {"the inventory does not say which cores share it"}, true, {}});
+    item.below.push_back({Kind::Note, labelsOf(processor.otherCaches), {"sharing not known"}, true, {}});
   }
   return item;
 }
