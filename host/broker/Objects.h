@@ -28,8 +28,8 @@ extern const CMPIArgsFT argsOperations;
 extern const CMPIResultFT resultOperations;
 extern const CMPIDateTimeFT dateTimeOperations;
 
-// What stands behind the { hdl, ft } record that a provider sees. Derived is the class whose address
-// the handle holds.
+// What stands behind the { hdl, ft } record that a provider sees. The handle holds the address of this
+// part of a Derived.
 template <class RecordType, class Derived>
 class Encapsulated : public Object {
  public:
@@ -37,14 +37,15 @@ class Encapsulated : public Object {
 
   // NULL for a NULL record and for one without a handle.
   static Derived* of(const Record* record) {
-    return record == nullptr ? nullptr : static_cast<Derived*>(const_cast<void*>(record->hdl));
+    auto* const part = record == nullptr ? nullptr : static_cast<Encapsulated*>(const_cast<void*>(record->hdl));
+    return static_cast<Derived*>(part);
   }
 
   [[nodiscard]] Record* record() { return &record_; }
 
  protected:
   template <class Table>
-  explicit Encapsulated(const Table& table) : record_{static_cast<Derived*>(this), &table} {}
+  explicit Encapsulated(const Table& table) : record_{this, &table} {}
 
  private:
   Record record_;
