@@ -30,12 +30,12 @@ std::string nameList(bool associations) {
 
 Response unknownClass(std::string_view name) {
   return failure(CMPI_RC_ERR_INVALID_CLASS,
-                 "no class " + quoted(name) + " is served here; there are " + nameList(false));
+                 "no class " + quotedText(name) + " is served here; there are " + nameList(false));
 }
 
 Response unknownAssociation(std::string_view name) {
   return failure(CMPI_RC_ERR_INVALID_PARAMETER,
-                 "no association class " + quoted(name) + " is served here; there are " + nameList(true));
+                 "no association class " + quotedText(name) + " is served here; there are " + nameList(true));
 }
 
 ObjectPath withClass(ObjectPath path, const ClassDefinition& definition) {

@@ -265,7 +265,7 @@ class Parser {
 }  // namespace
 
 PathSyntaxError::PathSyntaxError(std::string_view text, std::size_t offset, std::string_view reason)
-    : std::runtime_error("object path " + quoted(text) + ", column " + std::to_string(offset + 1) + ": " +
+    : std::runtime_error("object path " + quotedText(text) + ", column " + std::to_string(offset + 1) + ": " +
                          std::string(reason)),
       offset_(offset) {}
 

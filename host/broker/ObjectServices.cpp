@@ -100,7 +100,7 @@ CMPIDateTime* newDateTimeFromChars(const CMPIBroker* handle, const char* text, C
   const std::optional<DateTime> value = text != nullptr ? DateTime::parse(text) : std::nullopt;
   if (!value) {
     return call.refuse(status, CMPI_RC_ERR_INVALID_PARAMETER,
-                       "newDateTimeFromChars: " + quoted(text != nullptr ? text : "NULL") + " is no CIM date-time");
+                       "newDateTimeFromChars: " + quotedText(text != nullptr ? text : "NULL") + " is no CIM date-time");
   }
   return call.object<DateTimeObject>(status, *value);
 }

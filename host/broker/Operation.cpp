@@ -70,7 +70,7 @@ std::string statusName(CMPIrc rc) {
 std::ostream& operator<<(std::ostream& stream, const Response& response) {
   stream << statusName(response.rc);
   if (response.message) {
-    stream << ' ' << quoted(*response.message);
+    stream << ' ' << quotedText(*response.message);
   }
   stream << ", done " << response.doneCalls << " times\n";
   for (const Instance& each : response.instances) {

@@ -134,10 +134,10 @@ std::string Value::text() const {
                         [](std::uint64_t value) { return std::to_string(value); },
                         [](std::int64_t value) { return std::to_string(value); },
                         [](double value) { return realText(value); },
-                        [](const std::string& value) { return quoted(value); },
+                        [](const std::string& value) { return quotedText(value); },
                         [](const std::vector<Value>& values) { return listText(values); },
-                        [](const PathPointer& path) { return quoted(path->text()); },
-                        [](const InstancePointer& instance) { return quoted(instance->text()); },
+                        [](const PathPointer& path) { return quotedText(path->text()); },
+                        [](const InstancePointer& instance) { return quotedText(instance->text()); },
                     },
                     data_);
 }
@@ -188,7 +188,7 @@ std::string typeName(CMPIType type) {
   return "0x" + std::string(digits.data(), result.ptr);
 }
 
-std::string quoted(std::string_view text) {
+std::string quotedText(std::string_view text) {
   constexpr std::string_view hexDigits = "0123456789abcdef";
   constexpr unsigned char firstPrintable = 0x20;
   std::string result = "\"";

@@ -101,7 +101,7 @@ void assignValue(std::vector<NamedValue>& values, std::string_view name, Value v
 [[nodiscard]] std::string typeName(CMPIType type);
 
 // `text` in double quotes, with backslash, quote and control characters escaped as MOF does.
-[[nodiscard]] std::string quoted(std::string_view text);
+[[nodiscard]] std::string quotedText(std::string_view text);
 
 }  // namespace Corvcim
 
