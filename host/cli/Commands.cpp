@@ -64,11 +64,12 @@ Outcome runCommand(const Options& options, std::size_t width) {
     default:
       break;
   }
-  Dispatcher dispatcher(libraryFiles(options));
+  const LibraryFiles files = libraryFiles(options);
   if (options.verb->verb == Verb::Overview) {
+    Dispatcher dispatcher(files);
     return showOverview(dispatcher, options.nameSpace);
   }
-  return performOperation(dispatcher, options);
+  return performOperation(files, options);
 }
 
 }  // namespace Corvcim

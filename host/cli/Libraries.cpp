@@ -54,8 +54,8 @@ std::string findLibrary(std::string_view baseName) {
   return "";
 }
 
-std::map<std::string, std::string, std::less<>> libraryFiles(const Options& options) {
-  std::map<std::string, std::string, std::less<>> files;
+LibraryFiles libraryFiles(const Options& options) {
+  LibraryFiles files;
   std::string provider = options.library.empty() ? findLibrary(providerLibraryName) : options.library;
   if (provider.empty()) {
     throw std::runtime_error(

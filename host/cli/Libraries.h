@@ -10,6 +10,9 @@
 
 namespace Corvcim {
 
+/// Files by the base name of the library, as the dispatcher takes them.
+using LibraryFiles = std::map<std::string, std::string, std::less<>>;
+
 inline constexpr std::string_view providerLibraryName = "corvcpuprofileprovider";
 inline constexpr std::string_view companionLibraryName = "corvcomputersystemprovider";
 
@@ -17,10 +20,10 @@ inline constexpr std::string_view companionLibraryName = "corvcomputersystemprov
 /// where the package installs it. Empty where there is none.
 std::string findLibrary(std::string_view baseName);
 
-/// The files for the dispatcher: what the options name, else what findLibrary finds. A companion that
+/// The files of both libraries: what the options name, else what findLibrary finds. A companion that
 /// is not there is left out. Throws std::runtime_error, which says where it looked, if there is no
 /// provider library.
-std::map<std::string, std::string, std::less<>> libraryFiles(const Options& options);
+LibraryFiles libraryFiles(const Options& options);
 
 }  // namespace Corvcim
 

@@ -3,7 +3,9 @@
 #include <stdexcept>
 #include <utility>
 
+#include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
+#include "host/cli/DirectEnumeration.h"
 #include "host/cli/ResultWriter.h"
 #include "platform/instrumentation/ProcessTree.h"
 
@@ -88,6 +90,15 @@ std::string write(Format format, const Operation& operation, const Response& res
   return writeInstances(format, response.instances, operation.properties);
 }
 
+Answer ask(const LibraryFiles& files, const Operation& operation) {
+  if (const ClassDefinition* definition = directClass(operation)) {
+    if (std::optional<Response> response = enumerateDirectly(files, *definition, operation)) {
+      return {std::move(*response), {}};
+    }
+  }
+  return Dispatcher(files).perform(operation);
+}
+
 bool isEmpty(const Response& response) {
   return response.instances.empty() && response.paths.empty();
 }
@@ -112,12 +123,12 @@ std::optional<std::string> inventoryError() {
   }
 }
 
-Outcome performOperation(Dispatcher& dispatcher, const Options& options) {
+Outcome performOperation(const LibraryFiles& files, const Options& options) {
   const std::string what = std::string(options.verb->name) + ' ' + options.target + ": ";
   Outcome outcome;
   try {
     const Operation operation = operationOf(options);
-    const Answer answer = dispatcher.perform(operation);
+    const Answer answer = ask(files, operation);
     if (answer.response.ok()) {
       outcome.output = write(options.format, operation, answer.response);
     } else if (answer.failures.empty()) {

@@ -5,14 +5,15 @@
 #include <string>
 #include <string_view>
 
-#include "host/broker/Dispatcher.h"
+#include "host/broker/Operation.h"
 #include "host/cli/Commands.h"
+#include "host/cli/Libraries.h"
 #include "host/cli/Options.h"
 
 namespace Corvcim {
 
 /// The verbs that ask providers: ei, ein, gi, ai, ain, ri, rin.
-Outcome performOperation(Dispatcher& dispatcher, const Options& options);
+Outcome performOperation(const LibraryFiles& files, const Options& options);
 
 /// "CIM_ERR_NOT_FOUND: no such processor", the status as users of CIM know it.
 std::string describeStatus(CMPIrc rc, const std::optional<std::string>& message);

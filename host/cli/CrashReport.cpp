@@ -1,0 +1,50 @@
+#include "host/cli/CrashReport.h"
+
+#include <unistd.h>
+
+#include <array>
+#include <csignal>
+#include <cstddef>
+#include <cstdlib>
+
+namespace Corvcim {
+namespace {
+
+constexpr std::array signals = {SIGSEGV, SIGBUS, SIGILL, SIGFPE, SIGABRT};
+
+// What the handler may touch: made before, not changed while it can run.
+std::array<char, 512> message;
+std::size_t length = 0;
+std::array<struct sigaction, signals.size()> previous;
+
+void append(std::string_view text) {
+  constexpr std::size_t roomForLineEnd = 1;
+  length += text.copy(message.data() + length, message.size() - roomForLineEnd - length);
+}
+
+void report(int) {
+  [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, message.data(), length);
+  _exit(EXIT_FAILURE);
+}
+
+}  // namespace
+
+CrashReport::CrashReport(std::string_view text) {
+  length = 0;
+  append("corvcim: ");
+  append(text);
+  message[length++] = '\n';
+  struct sigaction action = {};
+  action.sa_handler = report;
+  for (std::size_t i = 0; i < signals.size(); ++i) {
+    sigaction(signals[i], &action, &previous[i]);
+  }
+}
+
+CrashReport::~CrashReport() {
+  for (std::size_t i = 0; i < signals.size(); ++i) {
+    sigaction(signals[i], &previous[i], nullptr);
+  }
+}
+
+}  // namespace Corvcim
