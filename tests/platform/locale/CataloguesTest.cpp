@@ -32,7 +32,9 @@ std::set<std::string> idsOf(const std::map<std::string, std::string>& texts) {
   return ids;
 }
 
-const std::set<std::string> kIds = {"MSGID_CPU_PROCESSOR_CAPTION",
+const std::set<std::string> kIds = {"MSGID_COMPUTER_SYSTEM_CAPTION",
+                                    "MSGID_COMPUTER_SYSTEM_DESCRIPTION",
+                                    "MSGID_CPU_PROCESSOR_CAPTION",
                                     "MSGID_CPU_PROCESSOR_DESCRIPTION",
                                     "MSGID_CPU_PROC_CAPABILITIES_CAPTION",
                                     "MSGID_CPU_PROC_CAPABILITIES_DESCRIPTION",
