@@ -151,6 +151,9 @@ void checkCombination(const Options& options, const std::string& associationOpti
   if (!associationOption.empty() && !verb.isAssociation) {
     fail(name + " takes no option " + quoted(associationOption) + ": it belongs to ai, ain, ri and rin");
   }
+  if (!options.language.empty() && (options.format == Format::Mof || options.format == Format::Json)) {
+    fail("'--language' is for text: mof and json are the same in every language");
+  }
   if (std::ranges::find(verb.formats, options.format) == verb.formats.end()) {
     fail(name + " has no output format " + quoted(formatName(options.format)) + ": it can be " +
          formatList(verb.formats));

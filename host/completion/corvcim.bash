@@ -1,0 +1,74 @@
+# bash completion for corvcim                                              -*- shell-script -*-
+
+# Puts the words that begin like the current one into COMPREPLY.
+_corvcim_offer() {
+  mapfile -t COMPREPLY < <(compgen -W "$*" -- "$current")
+}
+
+_corvcim_classes() {
+  _corvcim_offer "$("${COMP_WORDS[0]}" classes 2>/dev/null | awk 'NR > 1 { print $1 }')"
+}
+
+# A file after a word such as json:, which bash takes for a word of its own.
+_corvcim_files() {
+  compopt -o filenames
+  mapfile -t COMPREPLY < <(compgen -f -- "$1")
+}
+
+_corvcim_inventory() {
+  # Bash splits words at colons: "json:FILE" comes as "json", ":", "FILE".
+  if [[ $current == : ]]; then
+    _corvcim_files ""
+  elif [[ ${COMP_WORDS[COMP_CWORD - 1]} == : ]]; then
+    _corvcim_files "$current"
+  else
+    _corvcim_offer "live root: json:"
+    compopt -o nospace
+  fi
+}
+
+_corvcim() {
+  local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
+  local verbs="classes ei ein gi ai ain ri rin inventory tree"
+  local options="--inventory --output --namespace --library --companion --language --help --version"
+
+  for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
+    [[ " $verbs " == *" $word "* ]] && verb=$word
+  done
+  [[ $previous == : ]] && previous=${COMP_WORDS[COMP_CWORD - 3]}
+  [[ $current == : ]] && previous=${COMP_WORDS[COMP_CWORD - 2]}
+
+  case $previous in
+    -i | --inventory) _corvcim_inventory && return ;;
+    -o | --output)
+      case $verb in
+        tree) _corvcim_offer "text svg dot" ;;
+        classes | inventory) _corvcim_offer "text json" ;;
+        *) _corvcim_offer "text mof json svg dot" ;;
+      esac
+      return
+      ;;
+    -l | --library | --companion) _corvcim_files "$current" && return ;;
+    -n | --namespace) _corvcim_offer "root/cimv2" && return ;;
+    --language) _corvcim_offer "en de" && return ;;
+    -ac | -arc) _corvcim_classes && return ;;
+    -ar | -arr)
+      _corvcim_offer "Antecedent Dependent GroupComponent PartComponent ManagedElement Capabilities"
+      return
+      ;;
+  esac
+
+  if [[ $current == -* ]]; then
+    case $verb in
+      ai | ain) options+=" -ac -arc -ar -arr" ;;
+      ri | rin) options+=" -ac -arc -ar" ;;
+    esac
+    _corvcim_offer "$options"
+  elif [[ -z $verb ]]; then
+    _corvcim_offer "$verbs"
+  elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin) ]]; then
+    _corvcim_classes
+  fi
+}
+
+complete -F _corvcim corvcim
