@@ -93,14 +93,12 @@ TEST_F(InventoryMaps, NothingIsReported) {
   factory()._processorList = {fullProcessor("cpu0")};
   factory()._cpuMemoryList = {fullCache("cache0")};
   factory()._cpuProcCoreList = {fullCore("core0")};
-  CPUObjFactory& theFactory = factory();
-  forgetTraces();
 
-  theFactory.createProcessorMap();
-  theFactory.createCPUMemoryMap();
-  theFactory.createProcessorCoreMap();
-  EXPECT_EQ(theFactory.getNumberOfProcInstances() + theFactory.getNumberOfMemInstances() +
-                theFactory.getNumberOfProcCoreInstances(),
+  factory().createProcessorMap();
+  factory().createCPUMemoryMap();
+  factory().createProcessorCoreMap();
+  EXPECT_EQ(factory().getNumberOfProcInstances() + factory().getNumberOfMemInstances() +
+                factory().getNumberOfProcCoreInstances(),
             3);
 
   EXPECT_TRUE(Scripted::takeMessages().empty());

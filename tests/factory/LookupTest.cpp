@@ -101,7 +101,7 @@ TEST_P(LookupOfOne, AppendsToWhatIsThere) {
 
 TEST_P(LookupOfOne, AKeyThatIsNotThereFailsButForCapabilities) {
   placeSome();
-  for (const std::string& name : {"d", "B", " b", "b ", "", "b\t"}) {
+  for (const char* name : {"d", "B", " b", "b ", "", "b\t"}) {
     const std::string text = GetParam().prefix + name;
     forgetTraces();
 
