@@ -8,33 +8,17 @@ namespace {
 using namespace Tarn::NodeLexicon;
 using Tarn::Inventory::TreeBuilder;
 
-struct CacheKind {
-  const char* level;
-  unsigned int levelCode;
-  unsigned int type;
-  unsigned int blocks;
-  unsigned int associativity;
-  const char* name;
-};
-
-constexpr CacheKind sharedCache = {"L3", 5, 3, 524288, 6, "L3 unified cache"};
-constexpr CacheKind coreCaches[] = {
-    {"L1d", 3, 2, 512, 5, "L1 data cache"},
-    {"L1i", 3, 1, 512, 5, "L1 instruction cache"},
-    {"L2", 4, 3, 16384, 6, "L2 unified cache"},
-};
-
 void addCache(TreeBuilder& builder, const CacheKind& kind, unsigned int processor, unsigned int core) {
-  builder.cache(cachePath(processor, kind.level, core))
-      .description(kind.name)
+  builder.cache(cachePath(processor, kind, core))
+      .description(kind.description)
       .number(PropCacheAssociativity, kind.associativity)
       .number(PropCacheType, kind.type)
-      .number(PropCacheLevel, kind.levelCode)
-      .number(PropCacheBlockSize, 64)
-      .number(PropCacheWritePolicy, 1)
+      .number(PropCacheLevel, kind.level)
+      .number(PropCacheBlockSize, cacheBlockSize)
+      .number(PropCacheWritePolicy, cacheWritePolicy)
       .number(PropCacheConsumableBlocks, kind.blocks)
       .number(PropCacheNumberOfBlocks, kind.blocks)
-      .text(PropCacheName, kind.level);
+      .text(PropCacheName, kind.name);
 }
 
 void addProcessor(TreeBuilder& builder, unsigned int processor, unsigned int cores) {
@@ -71,8 +55,8 @@ std::string corePath(unsigned int processor, unsigned int core) {
   return path(processor, "C" + std::to_string(core));
 }
 
-std::string cachePath(unsigned int processor, const char* level, unsigned int core) {
-  return path(processor, std::string(level) + "." + std::to_string(core));
+std::string cachePath(unsigned int processor, const CacheKind& kind, unsigned int core) {
+  return path(processor, std::string(kind.name) + "." + std::to_string(core));
 }
 
 Tarn::Inventory::Tree makeMachine(const MachineSize& size) {

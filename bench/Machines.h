@@ -1,9 +1,30 @@
 #ifndef CORVANE_BENCH_MACHINES_H
 #define CORVANE_BENCH_MACHINES_H
 
+#include <string>
+
 #include "platform/instrumentation/Tree.h"
 
 namespace Corvane::Bench {
+
+/// A kind of cache, in the codes of the inventory tree.
+struct CacheKind {
+  const char* name;
+  const char* description;
+  unsigned int level;
+  unsigned int type;
+  unsigned int blocks;
+  unsigned int associativity;
+};
+
+inline constexpr unsigned int cacheBlockSize = 64;
+inline constexpr unsigned int cacheWritePolicy = 1;
+inline constexpr CacheKind sharedCache = {"L3", "L3 unified cache", 5, 3, 524288, 6};
+inline constexpr CacheKind coreCaches[] = {
+    {"L1d", "L1 data cache", 3, 2, 512, 5},
+    {"L1i", "L1 instruction cache", 3, 1, 512, 5},
+    {"L2", "L2 unified cache", 4, 3, 16384, 6},
+};
 
 /// What a machine has of each kind: `processors` packages, and in each `coresEach` cores, a private L2
 /// and two L1 caches for every core, and one L3 for all of them.
@@ -22,7 +43,7 @@ Tarn::Inventory::Tree makeMachine(const MachineSize& size);
 /// The paths of a part, by its numbers.
 std::string processorPath(unsigned int processor);
 std::string corePath(unsigned int processor, unsigned int core);
-std::string cachePath(unsigned int processor, const char* level, unsigned int core);
+std::string cachePath(unsigned int processor, const CacheKind& kind, unsigned int core);
 
 }  // namespace Corvane::Bench
 

@@ -26,6 +26,9 @@ struct Collections {
 /// Adds the row of a request: makes it once, checks how much it returned, and takes its broker calls as the floor.
 void addRequestRow(const Row& row, const std::function<CMPIStatus()>& request, std::size_t results,
                    const MachineSize& machine, const Collections& collections) {
+  if (!selected(row.name)) {
+    return;
+  }
   const auto operation = [request] {
     NullBroker::beginRequest();
     request();
@@ -45,12 +48,15 @@ void addRequestRow(const Row& row, const std::function<CMPIStatus()>& request, s
 }
 
 void addProcessorRow() {
+  const Row row{"EnumInstances of HALDA_CPUProcessor, warm, 64 processors", 2.2};
+  if (!selected(row.name)) {
+    return;
+  }
   constexpr MachineSize machine{64, 1};
   CMPIInstanceMI* mi = LoadedProduct(makeMachine(machine)).instances("CPUProcessorProvider");
   const CMPIObjectPath* path = NullBroker::requestPath(cpuProcessorClass, nullptr);
   addRequestRow(
-      {"EnumInstances of HALDA_CPUProcessor, warm, 64 processors", 2.2},
-      [=] { return mi->ft->enumerateInstances(mi, NullBroker::context(), NullBroker::result(), path, nullptr); },
+      row, [=] { return mi->ft->enumerateInstances(mi, NullBroker::context(), NullBroker::result(), path, nullptr); },
       machine.processors, machine, {});
 }
 
@@ -134,29 +140,32 @@ void addAssociationRows(const Association& association) {
 
   for (std::size_t index = 0; index < std::size(machines); ++index) {
     const MachineSize& machine = machines[index];
+    Row enumeration = rowFor("EnumInstances of " + std::string(association.className), index);
+    const Row navigation = rowFor("Associators through " + std::string(association.className), index);
+    if (!selected(enumeration.name) && !selected(navigation.name)) {
+      continue;
+    }
+    if (association.className == cpuCoreAssociatedCacheMemoryClass && machine.cores() == 128) {
+      enumeration.limit = 1.5;
+      enumeration.slow = true;
+    }
     const LoadedProduct product(makeMachine(machine));
 
-    Row row = rowFor("EnumInstances of " + std::string(association.className), index);
-    if (association.className == cpuCoreAssociatedCacheMemoryClass && machine.cores() == 128) {
-      row.limit = 1.5;
-      row.slow = true;
-    }
-    CMPIInstanceMI* instances = product.instances(association.provider);
+    CMPIInstanceMI* elements = product.instances(association.provider);
     const auto enumerate = [=] {
-      return instances->ft->enumerateInstances(instances, NullBroker::context(), NullBroker::result(), classPath,
-                                               nullptr);
+      return elements->ft->enumerateInstances(elements, NullBroker::context(), NullBroker::result(), classPath,
+                                              nullptr);
     };
     const auto [enumerated, walks] = association.enumeration(machine);
-    addRequestRow(row, enumerate, enumerated, machine, walks);
+    addRequestRow(enumeration, enumerate, enumerated, machine, walks);
 
-    CMPIAssociationMI* mi = product.associations(association.provider);
+    CMPIAssociationMI* links = product.associations(association.provider);
     const auto navigate = [=] {
-      return mi->ft->associators(mi, NullBroker::context(), NullBroker::result(), sourcePath, association.className,
-                                 nullptr, nullptr, nullptr, nullptr);
+      return links->ft->associators(links, NullBroker::context(), NullBroker::result(), sourcePath,
+                                    association.className, nullptr, nullptr, nullptr, nullptr);
     };
     const auto [related, queries] = association.navigation(machine);
-    addRequestRow(rowFor("Associators through " + std::string(association.className), index), navigate, related,
-                  machine, queries);
+    addRequestRow(navigation, navigate, related, machine, queries);
   }
 }
 

@@ -50,44 +50,62 @@ void fill(ProcessorCore& record) {
   record.setRequestedState(inUse);
 }
 
-void fill(Memory& record) {
+void fill(Memory& record, const CacheKind& kind) {
   record.setMemoryDeviceID("P0.L1d.0");
-  record.setBlockSize(64);
-  record.setConsumableBlocks(512);
-  record.setNumberOfBlocks(512);
+  record.setBlockSize(cacheBlockSize);
+  record.setConsumableBlocks(kind.blocks);
+  record.setNumberOfBlocks(kind.blocks);
   record.setEnabledState(inUse);
   record.setOperationalStatus(inUse);
   record.setHealthState(inUse);
   record.setRequestedState(inUse);
-  record.setElementName("L1 data cache");
-  record.setCacheAssociativity(5);
-  record.setCacheType(2);
-  record.setCacheWritePolicy(1);
-  record.setCacheLevel(3);
-  record.setCacheName("L1d");
+  record.setElementName(kind.description);
+  record.setCacheAssociativity(kind.associativity);
+  record.setCacheType(kind.type);
+  record.setCacheWritePolicy(cacheWritePolicy);
+  record.setCacheLevel(kind.level);
+  record.setCacheName(kind.name);
 }
 
-template <class Record>
-void fillTimes(std::size_t records, std::size_t times) {
+/// Fills a new vector, as often as asked.
+template <class Record, class Fill>
+void fillTimes(std::size_t times, Fill fillAll) {
   for (; times != 0; --times) {
-    std::vector<Record> filled;
-    for (std::size_t i = 0; i < records; ++i) {
-      fill(filled.emplace_back());
-    }
-    benchmark::DoNotOptimize(filled.data());
+    std::vector<Record> records;
+    fillAll(records);
+    benchmark::DoNotOptimize(records.data());
   }
 }
 
 }  // namespace
 
 void fillProcessors(const MachineSize& machine, std::size_t times) {
-  fillTimes<Processor>(machine.processors, times);
+  fillTimes<Processor>(times, [&](std::vector<Processor>& records) {
+    for (unsigned int i = 0; i < machine.processors; ++i) {
+      fill(records.emplace_back());
+    }
+  });
 }
+
 void fillCores(const MachineSize& machine, std::size_t times) {
-  fillTimes<ProcessorCore>(machine.cores(), times);
+  fillTimes<ProcessorCore>(times, [&](std::vector<ProcessorCore>& records) {
+    for (unsigned int i = 0; i < machine.cores(); ++i) {
+      fill(records.emplace_back());
+    }
+  });
 }
+
 void fillCaches(const MachineSize& machine, std::size_t times) {
-  fillTimes<Memory>(machine.caches(), times);
+  fillTimes<Memory>(times, [&](std::vector<Memory>& records) {
+    for (unsigned int i = 0; i < machine.cores(); ++i) {
+      for (const CacheKind& kind : coreCaches) {
+        fill(records.emplace_back(), kind);
+      }
+    }
+    for (unsigned int i = 0; i < machine.processors; ++i) {
+      fill(records.emplace_back(), sharedCache);
+    }
+  });
 }
 
 }  // namespace Corvane::Bench

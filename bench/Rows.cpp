@@ -16,10 +16,8 @@ constexpr int repetitions = 21;
 constexpr int slowRepetitions = 5;
 constexpr double secondsEach = 0.02;
 
-std::vector<Row>& rows() {
-  static std::vector<Row> all;
-  return all;
-}
+std::vector<Row> rows;
+std::string selection;
 
 /// The benchmarks of one row, in the form that a filter takes.
 std::string prefixOf(std::size_t index) {
@@ -68,7 +66,7 @@ struct Measurement {
 
 /// Repetitions of operation and floor take turns at random, so that a slow minute of the machine hits both.
 Measurement measure(std::size_t index) {
-  Samples samples(rows()[index].wallClock);
+  Samples samples(rows[index].wallClock);
   benchmark::RunSpecifiedBenchmarks(&samples, prefixOf(index));
   return {samples.operation(), samples.floor()};
 }
@@ -103,11 +101,19 @@ void printJson(const std::string& abi, const Row& row, const Measurement& measur
 
 }  // namespace
 
+void selectRows(std::string part) {
+  selection = std::move(part);
+}
+
+bool selected(const std::string& name) {
+  return name.find(selection) != std::string::npos;
+}
+
 namespace detail {
 
 std::string keepRow(Row row) {
-  rows().push_back(std::move(row));
-  return prefixOf(rows().size() - 1);
+  rows.push_back(std::move(row));
+  return prefixOf(rows.size() - 1);
 }
 
 void configure(const Row& row, benchmark::internal::Benchmark* benchmark) {
@@ -126,16 +132,13 @@ void require(bool condition, const char* subject, const char* expectation) {
   }
 }
 
-void runRows(const std::string& abi, bool json, const std::string& part) {
+void runRows(const std::string& abi, bool json) {
   std::map<std::string, Measurement> done;
   if (!json) {
     printHeading(abi);
   }
-  for (std::size_t index = 0; index < rows().size(); ++index) {
-    const Row& row = rows()[index];
-    if (row.name.find(part) == std::string::npos) {
-      continue;
-    }
+  for (std::size_t index = 0; index < rows.size(); ++index) {
+    const Row& row = rows[index];
     const Measurement measured = measure(index);
     if (json) {
       printJson(abi, row, measured);

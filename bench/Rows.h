@@ -22,6 +22,12 @@ struct Row {
   bool slow = false;
 };
 
+/// Only rows whose names contain `part` are wanted; the rest are left out when they are added.
+void selectRows(std::string part);
+
+/// Whether the row is wanted, for what is costly to prepare.
+bool selected(const std::string& name);
+
 namespace detail {
 
 /// Keeps the row and returns the prefix of the names of its two benchmarks.
@@ -44,13 +50,16 @@ void measure(const Row& row, const std::string& name, Work work) {
 /// Adds a line; `operation` and `floor` are callables without arguments, each one run of its work.
 template <class Operation, class Floor>
 void addRow(const Row& row, Operation operation, Floor floor) {
+  if (!selected(row.name)) {
+    return;
+  }
   const std::string prefix = detail::keepRow(row);
   detail::measure(row, prefix + "operation", operation);
   detail::measure(row, prefix + "floor", floor);
 }
 
-/// Measures the rows whose names contain `part` and prints each as it is done: a table, or one JSON object per line.
-void runRows(const std::string& abi, bool json, const std::string& part);
+/// Measures the rows and prints each as it is done: a table, or one JSON object per line.
+void runRows(const std::string& abi, bool json);
 
 /// A measurement of a wrong answer is worth nothing: ends the program with a message unless `condition` holds.
 void require(bool condition, const char* subject, const char* expectation = "");

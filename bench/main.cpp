@@ -22,14 +22,13 @@ void initializeBenchmark() {
 int main(int argc, char** argv) {
   bool json = false;
   std::string abi = sizeof(void*) == 4 ? "32-bit" : "64-bit";
-  std::string only;
   for (int i = 1; i < argc; ++i) {
     if (std::strcmp(argv[i], "--json") == 0) {
       json = true;
     } else if (std::strcmp(argv[i], "--abi") == 0 && i + 1 < argc) {
       abi = argv[++i];
     } else if (std::strcmp(argv[i], "--only") == 0 && i + 1 < argc) {
-      only = argv[++i];
+      Corvane::Bench::selectRows(argv[++i]);
     } else {
       std::fprintf(stderr, "corvane_bench: unknown argument %s\n", argv[i]);
       return 2;
@@ -45,5 +44,5 @@ int main(int argc, char** argv) {
   Corvane::Bench::addCollectionRows();
   Corvane::Bench::addTreeRows();
   Corvane::Bench::addProcessRows();
-  Corvane::Bench::runRows(abi, json, only);
+  Corvane::Bench::runRows(abi, json);
 }
