@@ -168,8 +168,7 @@ Answer exactlyOne(Answer answer, const ObjectPath& path) {
 
 }  // namespace
 
-Dispatcher::Dispatcher(std::map<std::string, std::string, std::less<>> libraryFiles)
-    : libraryFiles_(std::move(libraryFiles)) {}
+Dispatcher::Dispatcher(LibraryFiles libraryFiles) : libraryFiles_(std::move(libraryFiles)) {}
 
 Dispatcher::~Dispatcher() = default;
 

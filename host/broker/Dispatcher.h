@@ -14,6 +14,9 @@ namespace Corvcim {
 
 class ProviderProcess;
 
+// Files of provider libraries by base name ("corvcpuprofileprovider").
+using LibraryFiles = std::map<std::string, std::string, std::less<>>;
+
 // A class whose provider did not answer an operation that went to several.
 struct ClassFailure {
   std::string className;
@@ -42,9 +45,8 @@ struct Answer {
 // selections that a library reads from there are made before.
 class Dispatcher {
  public:
-  // Files by library base name ("corvcpuprofileprovider"). A class whose library has no file here is
-  // answered with CMPI_RC_ERR_FAILED and a message that says so.
-  explicit Dispatcher(std::map<std::string, std::string, std::less<>> libraryFiles);
+  // A class whose library has no file here is answered with CMPI_RC_ERR_FAILED and a message that says so.
+  explicit Dispatcher(LibraryFiles libraryFiles);
   ~Dispatcher();
   Dispatcher(const Dispatcher&) = delete;
   Dispatcher& operator=(const Dispatcher&) = delete;
@@ -75,7 +77,7 @@ class Dispatcher {
   Response performOn(const ClassDefinition& definition, const Operation& operation);
   Response upcall(const Operation& operation);
 
-  std::map<std::string, std::string, std::less<>> libraryFiles_;
+  LibraryFiles libraryFiles_;
   std::map<std::string_view, std::unique_ptr<ProviderProcess>> processes_;  // by group
   unsigned depth_ = 0;  // of operations in progress: an up-call nests
 };
