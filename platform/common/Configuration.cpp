@@ -59,7 +59,7 @@ Content readContent(const std::string& file) {
     return {{}, "is not a regular file"};
   }
   Content content;
-  std::array<char, 4096> block;
+  std::array<char, 4096> block{};
   while (content.text.size() <= kLargestFile) {
     const ssize_t count = ::read(descriptor.number(), block.data(), block.size());
     if (count < 0 && errno == EINTR) {
@@ -115,7 +115,7 @@ void Configuration::parseLine(std::string_view line, const std::string& where) {
   }
   const std::size_t equals = line.find('=');
   if (equals == std::string_view::npos) {
-    problems_.push_back({where, "expected \"key = value\" but there is no \"=\"; the line is ignored"});
+    problems_.push_back({where, R"(expected "key = value" but there is no "="; the line is ignored)"});
     return;
   }
   const std::string_view key = trimmed(line.substr(0, equals));

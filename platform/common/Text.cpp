@@ -1,6 +1,7 @@
 #include <tarn/Common.h>
 
 #include <cstdint>
+#include <type_traits>
 
 namespace Tarn {
 namespace {
@@ -47,7 +48,7 @@ std::string make_string(const std::wstring& text) {
   std::string utf8;
   utf8.reserve(text.size());
   for (wchar_t unit : text) {
-    const auto code = static_cast<std::uint32_t>(unit);
+    const auto code = std::uint32_t{std::make_unsigned_t<wchar_t>(unit)};
     appendUtf8(utf8, isCharacter(code) ? code : kReplacementCharacter);
   }
   return utf8;

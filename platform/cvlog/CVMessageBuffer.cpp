@@ -28,7 +28,7 @@ std::ostream& CVMessageBuffer::appendAddress(const void* address) {
     text_.push_back('0');
     return stream;
   }
-  std::array<char, 2 * sizeof(void*)> digits;
+  std::array<char, 2 * sizeof(void*)> digits{};
   const auto number = reinterpret_cast<std::uintptr_t>(address);
   const std::to_chars_result end = std::to_chars(digits.data(), digits.data() + digits.size(), number, 16);
   text_.append("0x").append(digits.data(), end.ptr);
@@ -42,7 +42,9 @@ std::ostream& CVMessageBuffer::borrowStream() {
 }
 
 std::ostream& CVMessageBuffer::usableStream() {
-  stream_->clear();
+  if (!stream_->good()) {
+    stream_->clear();
+  }
   return *stream_;
 }
 

@@ -27,8 +27,8 @@ class Logger {
 
  private:
   struct Route {
-    int level;
-    std::unique_ptr<Sink> sink;  ///< null: nothing is taken
+    int level = 0;
+    std::unique_ptr<Sink> sink{};  ///< null: nothing is taken
 
     [[nodiscard]] int threshold() const;
   };

@@ -69,7 +69,7 @@ void appendTime(std::string& line, system_clock::time_point time) {
   const auto today = floor<days>(time);
   const year_month_day date(today);
   const hh_mm_ss clock(floor<milliseconds>(time - today));
-  std::array<char, 48> text;
+  std::array<char, 48> text{};
   const int length =
       std::snprintf(text.data(), text.size(), "%04d-%02u-%02uT%02d:%02d:%02d.%03dZ ", static_cast<int>(date.year()),
                     static_cast<unsigned>(date.month()), static_cast<unsigned>(date.day()),

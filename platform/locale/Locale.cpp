@@ -40,7 +40,7 @@ void reportUnknown(const Setting& setting) {
 
 std::string languageOfThisProcess() {
   if (const std::optional<Setting> wanted = wantedLanguage()) {
-    const std::string id = normalizedLanguageId(wanted->value);
+    std::string id = normalizedLanguageId(wanted->value);
     if (!id.empty()) {
       return id;
     }

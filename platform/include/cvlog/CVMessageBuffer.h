@@ -68,6 +68,7 @@ class CVMessageBuffer {
   }
 
   /// The stream that appends to this buffer. A stream that an earlier operation left failed comes back usable.
+  // NOLINTNEXTLINE(google-explicit-constructor): the buffer is used where a stream is expected.
   operator std::ostream&() { return stream_ == nullptr ? borrowStream() : usableStream(); }
 
   /// The text so far; leaves the buffer empty and its stream, if it has one, as new. The stream must be
