@@ -102,7 +102,7 @@ std::string_view nameOfError(FileError error) {
 
 void writeContents(std::string& text, std::string_view contents) {
   const std::size_t end = contents.find('\n');
-  if (!contents.empty() && end + 1 >= contents.size()) {
+  if (end != 0 && end != std::string_view::npos && end + 1 == contents.size()) {
     text += ": ";
     text += contents.substr(0, end);
     text += '\n';

@@ -153,7 +153,7 @@ constexpr auto keyOf(const FamilyRow& row) {
 }
 static_assert(std::ranges::is_sorted(rows, {}, keyOf));
 
-// "Intel(R) Core(TM) i7 CPU" and "Intel Core i7" are one brand.
+// "Intel(R) Core(TM) i7 CPU" and "Intel Core i7" are one brand; some names are filled up with blanks.
 std::string withoutMarks(std::string_view name) {
   std::string plain;
   while (!name.empty()) {
@@ -161,10 +161,12 @@ std::string withoutMarks(std::string_view name) {
     const std::string_view mark = name.substr(0, close == std::string_view::npos ? 0 : close + 1);
     if (mark == "(R)" || mark == "(r)" || mark == "(TM)" || mark == "(tm)") {
       name.remove_prefix(mark.size());
-    } else {
-      plain += name.front();
-      name.remove_prefix(1);
+      continue;
     }
+    if (name.front() != ' ' || !plain.ends_with(' ')) {
+      plain += name.front();
+    }
+    name.remove_prefix(1);
   }
   return plain;
 }

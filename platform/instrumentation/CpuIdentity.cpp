@@ -33,8 +33,9 @@ class Fields {
     const std::string_view text = (*this)[name];
     double value = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value, std::chars_format::fixed);
+    const std::string_view unit = text.substr(static_cast<std::size_t>(end - text.data()));
     constexpr double largest = 1e6;
-    const bool usable = error == std::errc() && value >= 1 && value < largest;
+    const bool usable = error == std::errc() && value >= 1 && value < largest && (unit.empty() || unit == "MHz");
     return usable ? std::optional(static_cast<unsigned int>(std::lround(value))) : std::nullopt;
   }
 

@@ -15,7 +15,7 @@ constexpr const char* mountSys = "mount sysfs on /sys";
 /// What the kernel tells of one CPU's place.
 struct CpuPlace {
   std::optional<unsigned int> package;
-  unsigned int packageCpu = 0;  // the lowest CPU of a package without id
+  std::optional<unsigned int> packageCpu;  // the lowest CPU of a package without id
   CorePlace core;
   std::optional<CpuSet> siblings;  // the CPUs of its core
 };
@@ -37,6 +37,7 @@ class TopologyReader {
         place(cpu);
       }
     }
+    placeHomeless();
     placeHidden();
     sort();
     return std::move(topology_);
@@ -78,14 +79,20 @@ class TopologyReader {
   }
 
   void place(unsigned int cpu) {
-    if (const std::optional<CpuPlace> known = readPlace(cpu)) {
-      addToCore(cpu, *known, packageOf(*known));
-    } else if (!topology_.online.contains(cpu)) {
+    std::optional<CpuPlace> known = readPlace(cpu);
+    if (!known && !topology_.online.contains(cpu)) {
       hidden_.add(cpu);
-    } else {
+      return;
+    }
+    if (!known) {
       machine_.noteUnreadOfCpu(cpu, "topology", mountSys);
-      const CpuPlace told = placeFromCpuInfo(cpu);
-      addToCore(cpu, told, packageOf(told));
+      known.emplace();
+    }
+    addFromCpuInfo(cpu, *known);
+    if (known->package || known->packageCpu) {
+      addToCore(cpu, *known, packageOf(*known));
+    } else {
+      homeless_.emplace_back(cpu, *std::move(known));
     }
   }
 
@@ -111,24 +118,26 @@ class TopologyReader {
     return place;
   }
 
-  unsigned int readPackageCpu(unsigned int cpu) {
+  std::optional<unsigned int> readPackageCpu(unsigned int cpu) {
     std::optional<CpuSet> package = cpus_.list("cpu", cpu, "/topology/core_siblings_list");
     if (!package) {
       package = cpus_.list("cpu", cpu, "/topology/package_cpus_list");
     }
-    return package && package->contains(cpu) ? package->first() : topology_.present.first();
+    return package && package->contains(cpu) ? std::optional(package->first()) : std::nullopt;
   }
 
-  // Where sysfs is hidden, some architectures tell the place in /proc/cpuinfo as well.
-  CpuPlace placeFromCpuInfo(unsigned int cpu) const {
+  // Where sysfs hides a place, /proc/cpuinfo tells it as well on some architectures.
+  void addFromCpuInfo(unsigned int cpu, CpuPlace& place) const {
     const CpuInfo& info = machine_.cpuInfo();
-    CpuPlace place;
-    place.packageCpu = topology_.present.first();
-    if (info.cpus().contains(cpu)) {
+    if (!info.cpus().contains(cpu)) {
+      return;
+    }
+    if (!place.package && !place.packageCpu) {
       place.package = Attributes::toNumber(info.field(cpu, "physical id"));
+    }
+    if (!place.core.core && !place.siblings) {
       place.core.core = Attributes::toNumber(info.field(cpu, "core id"));
     }
-    return place;
   }
 
   Package& packageOf(const CpuPlace& place) {
@@ -138,7 +147,7 @@ class TopologyReader {
     if (found != topology_.packages.end()) {
       return *found;
     }
-    return topology_.packages.emplace_back(Package{place.package, place.packageCpu, {}, {}});
+    return topology_.packages.emplace_back(Package{place.package, place.packageCpu.value_or(0), {}, {}});
   }
 
   void addToCore(unsigned int cpu, const CpuPlace& place, Package& package) {
@@ -152,6 +161,19 @@ class TopologyReader {
       same->cpus.add(added);
     } else if (place.siblings || place.core.core) {
       package.cores.push_back({place.core, added});
+    }
+  }
+
+  // Where nothing tells of any package there is one at least, and these CPUs are in it. Beside packages
+  // that are known, they could be anywhere.
+  void placeHomeless() {
+    const bool nothingKnown = topology_.packages.empty();
+    for (const auto& [cpu, place] : homeless_) {
+      if (!nothingKnown) {
+        machine_.noteUnreadOfCpu(cpu, "topology", "nothing tells which processor the CPU belongs to", mountSys);
+      } else if (!placed_.contains(cpu)) {
+        addToCore(cpu, place, packageOf({.package = {}, .packageCpu = 0, .core = {}, .siblings = {}}));
+      }
     }
   }
 
@@ -194,6 +216,9 @@ class TopologyReader {
   }
 
   void sort() {
+    for (Package& package : topology_.packages) {
+      package.lowestCpu = package.cpus.first();
+    }
     std::ranges::sort(topology_.packages, {},
                       [](const Package& package) { return std::tuple(package.id, package.lowestCpu); });
     for (Package& package : topology_.packages) {
@@ -208,7 +233,8 @@ class TopologyReader {
   const bool coresAreNumberedByCluster_;
   Topology topology_;
   CpuSet placed_;
-  CpuSet hidden_;
+  CpuSet hidden_;                                            // offline, without a place
+  std::vector<std::pair<unsigned int, CpuPlace>> homeless_;  // without a package
 };
 
 }  // namespace

@@ -25,7 +25,7 @@ struct Core {
 /// A processor package. Its CPUs include those of which the kernel does not tell the core.
 struct Package {
   std::optional<unsigned int> id;
-  unsigned int lowestCpu = 0;  ///< identifies a package without id
+  unsigned int lowestCpu = 0;  ///< stands for the id where there is none
   CpuSet cpus;
   std::vector<Core> cores;  ///< by die, cluster, number
 };

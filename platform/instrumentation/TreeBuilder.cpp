@@ -154,10 +154,10 @@ Tree TreeBuilder::build() {
     tree.byPath_[index] = index;
   }
   const auto pathOf = [&tree](NodeIndex index) { return std::string_view(tree.nodes_[index].internalPath); };
-  std::ranges::sort(tree.byPath_, {}, pathOf);
+  std::ranges::stable_sort(tree.byPath_, {}, pathOf);
   const auto twice = std::ranges::adjacent_find(tree.byPath_, {}, pathOf);
   if (twice != tree.byPath_.end()) {
-    const Node& node = tree.nodes_[*twice];
+    const Node& node = tree.nodes_[*std::next(twice)];
     refuse(node.type, node.path(), "another node has the same path");
   }
   return tree;

@@ -1,0 +1,100 @@
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cerrno>
+
+#include "tests/platform/instrumentation/KernelFiles.h"
+
+namespace Tarn::Inventory {
+namespace {
+
+using namespace NodeLexicon;
+using testing::Contains;
+
+const std::string productName = "sys/class/dmi/id/product_name";
+
+KernelFiles machine() {
+  KernelFiles files;
+  files.cpus("0")
+      .cpu(0, {.package = 0, .core = 0, .siblings = "0"})
+      .cache(0, 0, {.cpus = "0"})
+      .maxFrequency(0, "1000000");
+  files.x86Block(0);
+  return files;
+}
+
+std::optional<std::string> modelOf(KernelFiles files) {
+  return textAt(files.tree(), "system", PropSystemModel);
+}
+
+KernelFiles underHypervisor() {
+  return machine().file("proc/cpuinfo", "processor\t: 0\ncpu family\t: 6\nflags\t\t: fpu hypervisor lm\n");
+}
+
+TEST(SystemModel, IsTheFirmwaresProductName) {
+  const Tree tree = machine().file(productName, "  Rack Server 2200 \n").tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Rack Server 2200");
+  EXPECT_EQ(nodeAt(tree, "system").description, "Rack Server 2200");
+  EXPECT_TRUE(tree.unread().empty());
+}
+
+TEST(SystemModel, IsTheProductNameAlsoUnderAHypervisor) {
+  EXPECT_EQ(modelOf(underHypervisor().file(productName, "Standard PC (Q35 + ICH9, 2009)\n")),
+            "Standard PC (Q35 + ICH9, 2009)");
+}
+
+TEST(SystemModel, IsNoPlaceholder) {
+  for (const char* text : {"To Be Filled By O.E.M.", "To be filled by O.E.M.", "System Product Name", "Default string",
+                           "Not Specified", "Not Applicable", "None", "O.E.M.", "Undefined", "", "  "}) {
+    const Tree tree = machine().file(productName, text + std::string("\n")).tree();
+    EXPECT_EQ(textAt(tree, "system", PropSystemModel), std::nullopt) << text;
+    EXPECT_EQ(nodeAt(tree, "system").description, "Computer system");
+    EXPECT_TRUE(tree.unread().empty()) << "it was read";
+  }
+}
+
+TEST(SystemModel, IsElseTheDeviceTrees) {
+  const Tree tree = machine().file("proc/device-tree/model", std::string("Single Board 4B\0", 16)).tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Single Board 4B");
+  EXPECT_TRUE(tree.unread().empty());
+}
+
+TEST(SystemModel, OfAnEmulatedBoardSaysThatItIsVirtual) {
+  EXPECT_EQ(modelOf(machine().file("proc/device-tree/model", std::string("linux,dummy-virt\0", 17))),
+            "linux,dummy-virt (Virtual Machine)");
+}
+
+TEST(SystemModel, IsElseWhatTheHypervisorTells) {
+  EXPECT_EQ(modelOf(underHypervisor()), "Virtual Machine");
+  EXPECT_EQ(modelOf(machine().file("sys/hypervisor/type", "xen\n")), "Virtual Machine (xen)");
+}
+
+TEST(SystemModel, OfAPlaceholderUnderAHypervisorIsVirtual) {
+  EXPECT_EQ(modelOf(underHypervisor().file(productName, "None\n")), "Virtual Machine");
+}
+
+TEST(SystemModel, IsAbsentWhereNothingTellsIt) {
+  const Tree tree = machine().tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), std::nullopt);
+  ASSERT_EQ(tree.unread().size(), 1U);
+  EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/class/dmi/id/product_name", "no such file or directory",
+                                             "it is there on machines whose firmware has DMI tables"}));
+}
+
+TEST(SystemModel, ThatMayNotBeReadIsTold) {
+  const Tree tree = machine().fail(productName, EACCES).tree();
+
+  ASSERT_EQ(tree.unread().size(), 1U);
+  EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/class/dmi/id/product_name", "permission denied",
+                                             "run as root, or let this process read it"}));
+}
+
+TEST(SystemModel, WithStrangeBytesIsValidUtf8) {
+  EXPECT_EQ(modelOf(machine().file(productName, "Box\xFF\n")), "Box\xEF\xBF\xBD");
+}
+
+}  // namespace
+}  // namespace Tarn::Inventory
