@@ -32,16 +32,11 @@ std::set<std::string> idsOf(const std::map<std::string, std::string>& texts) {
   return ids;
 }
 
-const std::set<std::string> kIds = {"MSGID_COMPUTER_SYSTEM_CAPTION",
-                                    "MSGID_COMPUTER_SYSTEM_DESCRIPTION",
-                                    "MSGID_CPU_PROCESSOR_CAPTION",
-                                    "MSGID_CPU_PROCESSOR_DESCRIPTION",
-                                    "MSGID_CPU_PROC_CAPABILITIES_CAPTION",
-                                    "MSGID_CPU_PROC_CAPABILITIES_DESCRIPTION",
-                                    "MSGID_CPU_PROC_CORE_CAPTION",
-                                    "MSGID_CPU_PROC_CORE_DESCRIPTION",
-                                    "MSGID_CPU_MEMORY_CAPTION",
-                                    "MSGID_CPU_MEMORY_DESCRIPTION"};
+const std::set<std::string> kIds = {
+    "MSGID_COMPUTER_SYSTEM_CAPTION",   "MSGID_COMPUTER_SYSTEM_DESCRIPTION",   "MSGID_CPU_PROCESSOR_CAPTION",
+    "MSGID_CPU_PROCESSOR_DESCRIPTION", "MSGID_CPU_PROC_CAPABILITIES_CAPTION", "MSGID_CPU_PROC_CAPABILITIES_DESCRIPTION",
+    "MSGID_CPU_PROC_CORE_CAPTION",     "MSGID_CPU_PROC_CORE_DESCRIPTION",     "MSGID_CPU_MEMORY_CAPTION",
+    "MSGID_CPU_MEMORY_DESCRIPTION"};
 
 TEST(Catalogues, AreThereInEnglishAndGerman) {
   const auto files = catalogueFiles();
