@@ -85,13 +85,10 @@ std::string Instrumentation::getPathToParentNode() const {
   return parent != noNode ? tree_->node(parent).internalPath : std::string();
 }
 
-// Both are members of the interface, though this form of path needs no look-up.
-// NOLINTNEXTLINE(readability-convert-member-functions-to-static)
 std::string Instrumentation::convertPathToString(const std::string& internalPath) const {
   return Inventory::toPrintablePath(internalPath);
 }
 
-// NOLINTNEXTLINE(readability-convert-member-functions-to-static)
 std::string Instrumentation::convertStringToPath(const std::string& printablePath) const {
   return Inventory::toInternalPath(printablePath);
 }

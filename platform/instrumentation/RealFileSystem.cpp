@@ -22,7 +22,7 @@ constexpr std::size_t largestFile = std::size_t{64} << 20;
 
 FileError readAll(int file, std::string& contents) {
   contents.clear();
-  std::array<char, 16384> chunk;  // NOLINT(cppcoreguidelines-pro-type-member-init): filled by what is read
+  std::array<char, 16384> chunk;
   for (;;) {
     const ssize_t got = ::read(file, chunk.data(), chunk.size());
     if (got == 0) {

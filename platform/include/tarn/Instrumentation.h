@@ -32,7 +32,6 @@ class Tree;
 /// boot. Each form is the exact inverse of the other.
 ///
 /// On a cursor that stands on no node every getter answers empty, 0 or false.
-// NOLINTNEXTLINE(cppcoreguidelines-special-member-functions): a cursor that was moved from would dangle.
 class Instrumentation {
  public:
   /// A cursor on no node. Throws std::exception's children if the inventory can not be read; the text

@@ -3,6 +3,7 @@
 #include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/TreeBuilder.h"
+#include "tests/platform/instrumentation/Scratch.h"
 
 namespace Tarn::Inventory {
 namespace {
@@ -52,6 +53,17 @@ TEST(JsonReader, ReadsWhatCouldNotBeRead) {
 
   ASSERT_EQ(tree.unread().size(), 1U);
   EXPECT_EQ(tree.unread()[0], (Unread{"f", "r", "m"}));
+}
+
+TEST(JsonReader, ReadsTheExampleOfTheDocumentation) {
+  const std::string page = contentsOf(CORVANE_SOURCE_DIR "/docs/inventory.md");
+  const std::string fence = "```json\n";
+  const std::size_t begin = page.find(fence) + fence.size();
+
+  const Tree tree = readJson(page.substr(begin, page.find("```", begin) - begin), "docs/inventory.md");
+
+  EXPECT_EQ(tree.nodes().size(), 4U);
+  EXPECT_EQ(tree.unread().size(), 1U);
 }
 
 struct Broken {
