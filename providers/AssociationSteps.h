@@ -83,29 +83,26 @@ inline void setEnds(const Association& association, CMPIInstance* instance, cons
   CMSetProperty(instance, association.second.name, &second, CMPI_ref);
 }
 
-inline void addEnds(const Association& association, CMPIObjectPath* path, const CMPIObjectPath* first,
-                    const CMPIObjectPath* second) {
-  CMAddKey(path, association.first.name, &first, CMPI_ref);
-  CMAddKey(path, association.second.name, &second, CMPI_ref);
-}
-
 /// What a walk over all pairs says where it fails; a NULL status text leaves the status alone.
 struct WalkTexts {
   const char* noPaths;
   FailureTexts nullNear;
   const char* noRelated;
   FailureTexts nullFar;
+  FailureTexts noAssociationPath;
 };
 
 /// The near ends of a walk: all object paths of one class, and the key that leads on from them.
 struct NearEnds {
+  const char* objectClass;
   unsigned short (CPUObjFactory::*allPaths)(const CMPIBroker*, const CMPIObjectPath*, Paths&, CMPIStatus*);
   unsigned short (CPUObjFactory::*expected)() const;
   const char* key;
 };
 
-/// Walks over every near end and, from its key, every element that `related` finds for it. Hands both
-/// paths to `link`, until that returns false. False when the walk did not reach its end.
+/// Walks over every near end and, from its key, every element that `related` finds for it. Hands each
+/// pair to `link`, as a new path of the association and the paths of its two ends, until that returns
+/// false. False when the walk did not reach its end.
 template <class Related, class Link>
 bool forEachPair(const Association& association, CPUObjFactory* factory, const CMPIObjectPath* cop, CMPIStatus* status,
                  const NearEnds& nearEnds, const WalkTexts& texts, Related related, Link link,
@@ -116,6 +113,7 @@ bool forEachPair(const Association& association, CPUObjFactory* factory, const C
     association.events.message(LevelError, texts.noPaths, line, function);
     return false;
   }
+  const bool nearIsFirst = std::string_view(nearEnds.objectClass) == association.first.objectClass;
   for (CMPIObjectPath* near : counted(nearPaths)) {
     if (isNull(near)) {
       fail(association, status, texts.nullNear, line, function);
@@ -136,12 +134,28 @@ bool forEachPair(const Association& association, CPUObjFactory* factory, const C
         fail(association, status, texts.nullFar, line, function);
         return false;
       }
-      if (!link(near, far)) {
+      stampPath(far, cop);
+      CMPIObjectPath* path = newAssociationPath(association, cop);
+      if (isNull(path)) {
+        fail(association, status, texts.noAssociationPath, line, function);
+        return false;
+      }
+      if (!(nearIsFirst ? link(path, near, far) : link(path, far, near))) {
         return false;
       }
     }
   }
   return true;
+}
+
+/// Delivers the name of each pair of a walk: the association's path with the two ends as its keys.
+inline auto deliverName(const Association& association, const CMPIResult* result) {
+  return [&association, result](CMPIObjectPath* path, const CMPIObjectPath* first, const CMPIObjectPath* second) {
+    CMAddKey(path, association.first.name, &first, CMPI_ref);
+    CMAddKey(path, association.second.name, &second, CMPI_ref);
+    CMReturnObjectPath(result, path);
+    return true;
+  };
 }
 
 /// The way from a request's object to the elements of one target class.
@@ -197,21 +211,56 @@ inline CMPIInstance* newAssociation(const Association& association, const CMPIOb
   return instance;
 }
 
-/// The association between the object that a request starts from and an element of the target class,
-/// on the template path. With `filterKeys` the property list filters it. NULL when the broker has none.
-inline CMPIInstance* newReference(const Association& association, const CMPIObjectPath* templatePath,
-                                  const CMPIObjectPath* source, const CMPIObjectPath* far, const CMPIObjectPath* target,
-                                  const char** properties = nullptr, const char** filterKeys = nullptr) {
-  CMPIInstance* instance = CMNewInstance(association.broker, templatePath, nullptr);
+/// How the references of a request are built: on the association's template path, between the object
+/// that the request starts from and elements of the target class. With `filterKeys` the property list
+/// filters them.
+struct ReferenceTemplate {
+  const CMPIObjectPath* source;
+  const CMPIObjectPath* target;
+  const CMPIObjectPath* path;
+  const char** properties = nullptr;
+  const char** filterKeys = nullptr;
+};
+
+/// One reference; NULL when the broker has none.
+inline CMPIInstance* newReference(const Association& association, const ReferenceTemplate& from,
+                                  const CMPIObjectPath* far) {
+  CMPIInstance* instance = CMNewInstance(association.broker, from.path, nullptr);
   if (isNull(instance)) {
     return nullptr;
   }
-  if (filterKeys != nullptr) {
-    CMSetPropertyFilter(instance, properties, filterKeys);
+  if (from.filterKeys != nullptr) {
+    CMSetPropertyFilter(instance, from.properties, from.filterKeys);
   }
-  const bool farIsFirst = std::string_view(classNameOf(target)) == association.first.objectClass;
-  setEnds(association, instance, farIsFirst ? far : source, farIsFirst ? source : far);
+  const bool farIsFirst = std::string_view(classNameOf(from.target)) == association.first.objectClass;
+  setEnds(association, instance, farIsFirst ? far : from.source, farIsFirst ? from.source : far);
   return instance;
+}
+
+/// Hands the reference to each related element to `use`, with the element's path; what could not be
+/// built is left out.
+template <class Use>
+void forEachReference(const Association& association, const ReferenceTemplate& from, Instances& related, Use use) {
+  for (const CMPIInstance* element : counted(related)) {
+    CMPIObjectPath* far = pathOf(element);
+    if (isNull(far)) {
+      continue;
+    }
+    stampPath(far, from.source);
+    CMPIInstance* reference = newReference(association, from, far);
+    if (!isNull(reference)) {
+      use(reference, far);
+    }
+  }
+}
+
+/// Delivers a reference's own path, in the namespace of `cop` and with this system's host name.
+inline void deliverStampedPathOf(const CMPIResult* result, const CMPIInstance* reference, const CMPIObjectPath* cop) {
+  CMPIObjectPath* path = pathOf(reference);
+  if (!isNull(path)) {
+    stampPath(path, cop);
+    CMReturnObjectPath(result, path);
+  }
 }
 
 /// Delivers the first instance whose path `matches`; instances that could not be built do not count.
@@ -239,11 +288,7 @@ inline void deliverPathsOf(const CMPIResult* result, Instances& elements) {
 /// The same, each in the namespace of `cop` and with this system's host name.
 inline void deliverStampedPathsOf(const CMPIResult* result, Instances& elements, const CMPIObjectPath* cop) {
   for (const CMPIInstance* element : counted(elements)) {
-    CMPIObjectPath* path = pathOf(element);
-    if (!isNull(path)) {
-      stampPath(path, cop);
-      CMReturnObjectPath(result, path);
-    }
+    deliverStampedPathOf(result, element, cop);
   }
 }
 

@@ -14,20 +14,24 @@ CORVANE_ASSOCIATION_CLEANUP(CPUAssociatedCacheMemory)
 
 namespace {
 
-constexpr NearEnds caches{&CPUObjFactory::getAllCPUMemoryCMPIObjPaths, &CPUObjFactory::getNumberOfMemInstances,
-                          "DeviceID"};
+constexpr NearEnds caches{cpuMemoryClass, &CPUObjFactory::getAllCPUMemoryCMPIObjPaths,
+                          &CPUObjFactory::getNumberOfMemInstances, "DeviceID"};
 
 constexpr WalkTexts instanceTexts{
     "***Can't get ObjectPaths.             Exiting EnumerateInstanceNames***",
     {"CMPIObjectPath is                 NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
     "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"}};
+    {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
+    {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
+     "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."}};
 
 constexpr WalkTexts nameTexts{
     "getAllCPUMemoryCMPIObjPaths Failed",
     {"CMPIObjectPath is NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
     "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"}};
+    {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
+    {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass.",
+     "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass."}};
 
 constexpr Direction directions[] = {{cpuProcessorClass, "DeviceID", &CPUObjFactory::getNumberOfProcInstances,
                                      &CPUObjFactory::getProcessorRefByMemoryHandle},
@@ -62,16 +66,8 @@ unsigned short CPUAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* cop, 
     events.providerExit();
     return 0;
   }
-  const auto link = [&, function = __func__](CMPIObjectPath* cache, CMPIObjectPath* processor) {
-    stampPath(processor, cop);
-    const CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status,
-           FailureTexts{"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
-                        "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."},
-           __builtin_LINE(), function);
-      return false;
-    }
+  const auto link = [&, function = __func__](const CMPIObjectPath* path, const CMPIObjectPath* cache,
+                                             const CMPIObjectPath* processor) {
     return appendCacheAssociation(association, factory, path, cache, processor, properties, instances, &status,
                                   function);
   };
@@ -100,20 +96,8 @@ CMPIStatus CPUAssociatedCacheMemory_EnumInstanceNames(CMPIInstanceMI* /*mi*/, co
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessorsAndCaches();
   if (!coresAreKnown(factory)) {
-    const auto link = [&, function = __func__](CMPIObjectPath* cache, CMPIObjectPath* processor) {
-      stampPath(processor, cop);
-      CMPIObjectPath* path = newAssociationPath(association, cop);
-      if (isNull(path)) {
-        fail(association, &status,
-             "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass.", __builtin_LINE(),
-             function);
-        return false;
-      }
-      addEnds(association, path, cache, processor);
-      CMReturnObjectPath(result, path);
-      return true;
-    };
-    forEachPair(association, factory, cop, &status, caches, nameTexts, processorOf(factory, cop, &status), link);
+    forEachPair(association, factory, cop, &status, caches, nameTexts, processorOf(factory, cop, &status),
+                deliverName(association, result));
   }
   events.providerExit();
   CMReturnDone(result);
@@ -222,18 +206,9 @@ CMPIStatus CPUAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, const 
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    stampPath(far, cop);
-    const CMPIInstance* reference =
-        newReference(association, templatePath, cop, far, target, properties, cacheAssociationKeys);
-    if (!isNull(reference)) {
-      CMReturnInstance(result, reference);
-    }
-  }
+  forEachReference(
+      association, {cop, target, templatePath, properties, cacheAssociationKeys}, related,
+      [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
 }
@@ -262,19 +237,10 @@ CMPIStatus CPUAssociatedCacheMemory_ReferenceNames(CMPIAssociationMI* /*mi*/, co
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    stampPath(far, cop);
-    CMPIObjectPath* path =
-        pathOf(newReference(association, templatePath, cop, far, target, nullptr, cacheAssociationKeys));
-    if (!isNull(path)) {
-      stampPath(path, cop);
-      CMReturnObjectPath(result, path);
-    }
-  }
+  forEachReference(association, {cop, target, templatePath, nullptr, cacheAssociationKeys}, related,
+                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+                     deliverStampedPathOf(result, reference, cop);
+                   });
   events.providerExit();
   return status;
 }

@@ -18,20 +18,22 @@ CORVANE_ASSOCIATION_CLEANUP(CPUConcreteComponent)
 
 namespace {
 
-constexpr NearEnds processors{&CPUObjFactory::getAllCPUProcCMPIObjPaths, &CPUObjFactory::getNumberOfProcInstances,
-                              "DeviceID"};
+constexpr NearEnds processors{cpuProcessorClass, &CPUObjFactory::getAllCPUProcCMPIObjPaths,
+                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID"};
 
 constexpr WalkTexts instanceTexts{
     "***Can't get ConcreteComponent ObjectPaths.             Exiting EnumerateInstanceNames***",
     {nullptr, "CMPIObjectPath is NULL for Processor"},
     "***Can't get ObjectPaths for Processor Cores.             Exiting EnumerateInstanceNames***",
-    {nullptr, "CMPIObjectPath is NULL for Processors"}};
+    {nullptr, "CMPIObjectPath is NULL for Processors"},
+    {nullptr, "Create CMPIObjectPath failed for ConcreteComponent."}};
 
 constexpr WalkTexts nameTexts{
     "getAllCPUProcCMPIObjPaths Failed",
     {"CMPIObjectPath is                 NULL for Processor", "CMPIObjectPath is NULL for Processor"},
     "Can't get ObjectPaths for Processor Core",
-    {"CMPIObjectPath is                     NULL for Processor Cores", "CMPIObjectPath is NULL for Processor Cores"}};
+    {"CMPIObjectPath is                     NULL for Processor Cores", "CMPIObjectPath is NULL for Processor Cores"},
+    {"Create CMPIObjectPath failed for ConcreteComponent", "Create CMPIObjectPath failed for ConcreteComponent"}};
 
 constexpr Direction directions[] = {{cpuProcessorClass, "InstanceID", &CPUObjFactory::getNumberOfProcInstances,
                                      &CPUObjFactory::getProcessorRefByProcCoreHandle},
@@ -59,14 +61,7 @@ unsigned short ConcreteComponentCMPIInstances(const CMPIObjectPath* cop, const c
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const auto link = [&, function = __func__](const CMPIObjectPath* processor, CMPIObjectPath* core) {
-    stampPath(core, cop);
-    const CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status, FailureTexts{nullptr, "Create CMPIObjectPath failed for ConcreteComponent."},
-           __builtin_LINE(), function);
-      return false;
-    }
+  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* processor, const CMPIObjectPath* core) {
     instances.push_back(newAssociation(association, path, processor, core, properties, filterKeys));
     return true;
   };
@@ -94,18 +89,8 @@ CMPIStatus CPUConcreteComponent_EnumInstanceNames(CMPIInstanceMI* /*mi*/, const 
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const auto link = [&, function = __func__](const CMPIObjectPath* processor, CMPIObjectPath* core) {
-    stampPath(core, cop);
-    CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status, "Create CMPIObjectPath failed for ConcreteComponent", __builtin_LINE(), function);
-      return false;
-    }
-    addEnds(association, path, processor, core);
-    CMReturnObjectPath(result, path);
-    return true;
-  };
-  forEachPair(association, factory, cop, &status, processors, nameTexts, coresOf(factory, cop, &status), link);
+  forEachPair(association, factory, cop, &status, processors, nameTexts, coresOf(factory, cop, &status),
+              deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
   return status;
@@ -193,16 +178,9 @@ CMPIStatus CPUConcreteComponent_References(CMPIAssociationMI* /*mi*/, const CMPI
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    const CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    const CMPIInstance* reference = newReference(association, templatePath, cop, far, target);
-    if (!isNull(reference)) {
-      CMReturnInstance(result, reference);
-    }
-  }
+  forEachReference(
+      association, {cop, target, templatePath}, related,
+      [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
 }
@@ -225,16 +203,13 @@ CMPIStatus CPUConcreteComponent_ReferenceNames(CMPIAssociationMI* /*mi*/, const 
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    const CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    CMPIObjectPath* path = pathOf(newReference(association, templatePath, cop, far, target));
-    if (!isNull(path)) {
-      CMReturnObjectPath(result, path);
-    }
-  }
+  forEachReference(association, {cop, target, templatePath}, related,
+                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+                     const CMPIObjectPath* path = pathOf(reference);
+                     if (!isNull(path)) {
+                       CMReturnObjectPath(result, path);
+                     }
+                   });
   events.providerExit();
   return status;
 }

@@ -17,20 +17,24 @@ CORVANE_ASSOCIATION_CLEANUP(CPUCoreAssociatedCacheMemory)
 
 namespace {
 
-constexpr NearEnds cores{&CPUObjFactory::getAllCPUProcCoreCMPIObjPaths, &CPUObjFactory::getNumberOfProcCoreInstances,
-                         "InstanceID"};
+constexpr NearEnds cores{cpuProcessorCoreClass, &CPUObjFactory::getAllCPUProcCoreCMPIObjPaths,
+                         &CPUObjFactory::getNumberOfProcCoreInstances, "InstanceID"};
 
 constexpr WalkTexts instanceTexts{
     "***Can't get ObjectPaths.             Exiting EnumerateInstanceNames***",
     {"CMPIObjectPath is                 NULL for CPUProcessorCore", "CMPIObjectPath is NULL for CPUProcessorCore"},
     "***Can't get CPUMemory ObjectPaths based on passed in ProcessorCore                 InstanceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is                     NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"}};
+    {"CMPIObjectPath is                     NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
+    {"Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemory",
+     "Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemory."}};
 
 constexpr WalkTexts nameTexts{
     "getAllCPUProcCoreCMPIObjPaths Failed",
     {"CMPIObjectPath is NULL for CPUProcessorCore", "CMPIObjectPath is NULL for CPUProcessorCore"},
     "***Can't get Memory ObjectPaths based on passed in ProcessorCore                InstanceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"}};
+    {"CMPIObjectPath is NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
+    {"Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemoryClass.",
+     "Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemoryClass."}};
 
 constexpr Direction directions[] = {{cpuProcessorCoreClass, "DeviceID", &CPUObjFactory::getNumberOfProcCoreInstances,
                                      &CPUObjFactory::getProcessorCoreRefByMemoryHandle},
@@ -55,16 +59,8 @@ unsigned short CPUCoreAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* c
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfCachesAndCores();
-  const auto link = [&, function = __func__](CMPIObjectPath* core, CMPIObjectPath* cache) {
-    stampPath(cache, cop);
-    const CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status,
-           FailureTexts{"Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemory",
-                        "Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemory."},
-           __builtin_LINE(), function);
-      return false;
-    }
+  const auto link = [&, function = __func__](const CMPIObjectPath* path, const CMPIObjectPath* cache,
+                                             const CMPIObjectPath* core) {
     return appendCacheAssociation(association, factory, path, cache, core, properties, instances, &status, function);
   };
   const bool complete =
@@ -91,20 +87,8 @@ CMPIStatus CPUCoreAssociatedCacheMemory_EnumInstanceNames(CMPIInstanceMI* /*mi*/
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfCachesAndCores();
-  const auto link = [&, function = __func__](CMPIObjectPath* core, CMPIObjectPath* cache) {
-    stampPath(cache, cop);
-    CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status,
-           "Create CMPIObjectPath failed for                     CPUCoreAssociatedCacheMemoryClass.", __builtin_LINE(),
-           function);
-      return false;
-    }
-    addEnds(association, path, cache, core);
-    CMReturnObjectPath(result, path);
-    return true;
-  };
-  forEachPair(association, factory, cop, &status, cores, nameTexts, cachesOf(factory, cop, &status), link);
+  forEachPair(association, factory, cop, &status, cores, nameTexts, cachesOf(factory, cop, &status),
+              deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
   return status;
@@ -208,21 +192,13 @@ CMPIStatus CPUCoreAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, co
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    stampPath(far, cop);
-    CMPIInstance* reference =
-        newReference(association, templatePath, cop, far, target, properties, cacheAssociationKeys);
-    if (isNull(reference)) {
-      continue;
-    }
-    const bool farIsCache = std::string_view(classNameOf(target)) == cpuMemoryClass;
-    setCacheProperties(association, factory, reference, farIsCache ? far : cop, &status);
-    CMReturnInstance(result, reference);
-  }
+  const bool farIsCache = std::string_view(classNameOf(target)) == cpuMemoryClass;
+  forEachReference(association, {cop, target, templatePath, properties, cacheAssociationKeys}, related,
+                   [&, function = __func__](CMPIInstance* reference, const CMPIObjectPath* far) {
+                     setCacheProperties(association, factory, reference, farIsCache ? far : cop, &status,
+                                        __builtin_LINE(), function);
+                     CMReturnInstance(result, reference);
+                   });
   events.providerExit();
   return status;
 }
@@ -247,19 +223,10 @@ CMPIStatus CPUCoreAssociatedCacheMemory_ReferenceNames(CMPIAssociationMI* /*mi*/
                    related)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    stampPath(far, cop);
-    CMPIObjectPath* path =
-        pathOf(newReference(association, templatePath, cop, far, target, nullptr, cacheAssociationKeys));
-    if (!isNull(path)) {
-      stampPath(path, cop);
-      CMReturnObjectPath(result, path);
-    }
-  }
+  forEachReference(association, {cop, target, templatePath, nullptr, cacheAssociationKeys}, related,
+                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+                     deliverStampedPathOf(result, reference, cop);
+                   });
   events.providerExit();
   return status;
 }

@@ -16,8 +16,8 @@ CORVANE_ASSOCIATION_CLEANUP(CPUElementCapabilities)
 
 namespace {
 
-constexpr NearEnds processors{&CPUObjFactory::getAllCPUProcCMPIObjPaths, &CPUObjFactory::getNumberOfProcInstances,
-                              "DeviceID"};
+constexpr NearEnds processors{cpuProcessorClass, &CPUObjFactory::getAllCPUProcCMPIObjPaths,
+                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID"};
 
 constexpr FailureTexts nullProcessor{"CMPIObjectPath is                 NULL for Processor",
                                      "CMPIObjectPath is NULL for Processor"};
@@ -29,10 +29,11 @@ constexpr FailureTexts noAssociationPath{"Create CMPIObjectPath failed for Eleme
 constexpr WalkTexts instanceTexts{
     "***Can't get ElementCapabilities ObjectPaths.             Exiting EnumerateInstanceNames***", nullProcessor,
     "***Can't get ObjectPaths for EnabledLogicalElementCap.                 Exiting EnumerateInstanceNames***",
-    nullCapabilities};
+    nullCapabilities, noAssociationPath};
 
 constexpr WalkTexts nameTexts{"getAllCPUProcCMPIObjPaths Failed", nullProcessor,
-                              "getProcessorCapRefByProcHandle Failed for DeviceId", nullCapabilities};
+                              "getProcessorCapRefByProcHandle Failed for DeviceId", nullCapabilities,
+                              noAssociationPath};
 
 CPUObjFactory* factoryOfProcessors() {
   return CPUObjFactory::getFactoryInstance(true, false, false);
@@ -68,12 +69,8 @@ unsigned short ElementCapabilitiesCMPIInstances(const CMPIObjectPath* cop, const
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessors();
-  const auto link = [&, function = __func__](const CMPIObjectPath* processor, const CMPIObjectPath* capabilities) {
-    const CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status, noAssociationPath, __builtin_LINE(), function);
-      return false;
-    }
+  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* processor,
+                        const CMPIObjectPath* capabilities) {
     instances.push_back(newAssociation(association, path, processor, capabilities, properties, filterKeys));
     return true;
   };
@@ -101,18 +98,8 @@ CMPIStatus CPUElementCapabilities_EnumInstanceNames(CMPIInstanceMI* /*mi*/, cons
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessors();
-  const auto link = [&, function = __func__](const CMPIObjectPath* processor, const CMPIObjectPath* capabilities) {
-    CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status, noAssociationPath, __builtin_LINE(), function);
-      return false;
-    }
-    addEnds(association, path, processor, capabilities);
-    CMReturnObjectPath(result, path);
-    return true;
-  };
   forEachPair(association, factory, cop, &status, processors, nameTexts, capabilitiesOf(factory, cop, nullptr, &status),
-              link);
+              deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
   return status;
@@ -197,16 +184,9 @@ CMPIStatus CPUElementCapabilities_References(CMPIAssociationMI* /*mi*/, const CM
   if (!findRelated(factory, cop, target, nullptr, related, &status)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    const CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    const CMPIInstance* reference = newReference(association, templatePath, cop, far, target);
-    if (!isNull(reference)) {
-      CMReturnInstance(result, reference);
-    }
-  }
+  forEachReference(
+      association, {cop, target, templatePath}, related,
+      [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
 }
@@ -228,17 +208,14 @@ CMPIStatus CPUElementCapabilities_ReferenceNames(CMPIAssociationMI* /*mi*/, cons
   if (!findRelated(factory, cop, target, nullptr, related, &status)) {
     return status;
   }
-  for (const CMPIInstance* element : counted(related)) {
-    const CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    CMPIObjectPath* path = pathOf(newReference(association, templatePath, cop, far, target));
-    if (!isNull(path)) {
-      CMSetNameSpace(path, namespaceOf(cop));
-      CMReturnObjectPath(result, path);
-    }
-  }
+  forEachReference(association, {cop, target, templatePath}, related,
+                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+                     CMPIObjectPath* path = pathOf(reference);
+                     if (!isNull(path)) {
+                       CMSetNameSpace(path, namespaceOf(cop));
+                       CMReturnObjectPath(result, path);
+                     }
+                   });
   events.providerExit();
   return status;
 }

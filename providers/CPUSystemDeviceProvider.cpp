@@ -82,11 +82,13 @@ std::string_view tracedClassOf(const CMPIObjectPath* target, unsigned int line =
   return name;
 }
 
-/// Hands every pair of a computer system's path and a processor's to `link`, until that returns false.
+/// Hands every pair of a computer system and a processor to `link`, as a new path of the association and
+/// the paths of its two ends, until that returns false.
 /// The status is the broker's when its answer was a failure. False when the walk did not reach its end.
 template <class Link>
 bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStatus* status,
-                 const FailureTexts& nullProcessor, Link link, const char* function = __builtin_FUNCTION()) {
+                 const FailureTexts& nullProcessor, const FailureTexts& noAssociationPath, Link link,
+                 const char* function = __builtin_FUNCTION()) {
   CPUObjFactory* factory = factoryOfProcessors();
   const CMPIObjectPath* systemClass = CMNewObjectPath(broker, namespaceOf(cop), computerSystemClass, nullptr);
   if (isNull(systemClass)) {
@@ -115,7 +117,12 @@ bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStat
         return false;
       }
       stampPath(processor, cop);
-      if (!link(system.ref, processor)) {
+      CMPIObjectPath* path = newAssociationPath(association, cop);
+      if (isNull(path)) {
+        fail(association, status, noAssociationPath, __builtin_LINE(), function);
+        return false;
+      }
+      if (!link(path, system.ref, processor)) {
         return false;
       }
     }
@@ -129,21 +136,17 @@ unsigned short CPUSystemDeviceCMPIInstances(const CMPIObjectPath* cop, const cha
                                             std::vector<CMPIInstance*>& instances) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  const auto link = [&, function = __func__](const CMPIObjectPath* system, const CMPIObjectPath* processor) {
-    const CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status,
-           FailureTexts{"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
-                        "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."},
-           __builtin_LINE(), function);
-      return false;
-    }
+  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* system, const CMPIObjectPath* processor) {
     instances.push_back(newAssociation(association, path, system, processor, properties, filterKeys));
     return true;
   };
   const bool complete = forEachPair(
       cop, ctx, &status,
-      {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"}, link);
+      {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
+      // The words of another association, as they have always been.
+      {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
+       "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."},
+      link);
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -164,19 +167,11 @@ CMPIStatus CPUSystemDevice_EnumInstanceNames(CMPIInstanceMI* /*mi*/, const CMPIC
                                              const CMPIResult* result, const CMPIObjectPath* cop) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  const auto link = [&, function = __func__](const CMPIObjectPath* system, const CMPIObjectPath* processor) {
-    CMPIObjectPath* path = newAssociationPath(association, cop);
-    if (isNull(path)) {
-      fail(association, &status, "Create CMPIObjectPath failed for                     cpuSystemDeviceClass.",
-           __builtin_LINE(), function);
-      return false;
-    }
-    addEnds(association, path, system, processor);
-    CMReturnObjectPath(result, path);
-    return true;
-  };
   forEachPair(cop, context, &status,
-              {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"}, link);
+              {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
+              {"Create CMPIObjectPath failed for                     cpuSystemDeviceClass.",
+               "Create CMPIObjectPath failed for                     cpuSystemDeviceClass."},
+              deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
   return status;
@@ -322,7 +317,7 @@ CMPIStatus CPUSystemDevice_References(CMPIAssociationMI* /*mi*/, const CMPIConte
     return status;
   }
   const auto link = [&](const CMPIObjectPath* far) {
-    const CMPIInstance* reference = newReference(association, templatePath, cop, far, target);
+    const CMPIInstance* reference = newReference(association, {cop, target, templatePath}, far);
     if (!isNull(reference)) {
       CMReturnInstance(result, reference);
     }
@@ -346,11 +341,7 @@ CMPIStatus CPUSystemDevice_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIC
     return status;
   }
   const auto link = [&](const CMPIObjectPath* far) {
-    CMPIObjectPath* path = pathOf(newReference(association, templatePath, cop, far, target));
-    if (!isNull(path)) {
-      stampPath(path, cop);
-      CMReturnObjectPath(result, path);
-    }
+    deliverStampedPathOf(result, newReference(association, {cop, target, templatePath}, far), cop);
   };
   if (forEachFarEnd(cop, context, target, &status,
                     "***Can't get Processor instances                 Exiting References***", link)) {
