@@ -29,9 +29,9 @@ CMPIStatus answer(Operation operation) {
   try {
     return operation(registeredBroker.load());
   } catch (const std::exception& error) {
-    return statusOf(CMPI_RC_ERR_FAILED, std::string(className) + ": " + error.what());
+    return statusOf(CMPI_RC_ERR_FAILED, error.what());
   } catch (...) {
-    return statusOf(CMPI_RC_ERR_FAILED, std::string(className) + ": unknown exception");
+    return statusOf(CMPI_RC_ERR_FAILED, "reading the computer system failed for a reason that is not known");
   }
 }
 
@@ -50,12 +50,11 @@ CMPIStatus checkKeys(const CMPIObjectPath* path, const ComputerSystem& system) {
   const char* creationClass = keyText(path, "CreationClassName");
   if (name == nullptr || creationClass == nullptr) {
     return statusOf(CMPI_RC_ERR_INVALID_PARAMETER,
-                    std::string(className) + ": the path needs the keys CreationClassName and Name");
+                    "the path of a computer system needs the keys CreationClassName and Name");
   }
   if (strcasecmp(creationClass, className) != 0 || system.name != name) {
-    return statusOf(CMPI_RC_ERR_NOT_FOUND, std::string(className) + ": no system with CreationClassName \"" +
-                                               creationClass + "\" and Name \"" + name + "\"; this machine is \"" +
-                                               system.name + "\"");
+    return statusOf(CMPI_RC_ERR_NOT_FOUND, std::string("no system has CreationClassName \"") + creationClass +
+                                               "\" and Name \"" + name + "\"; this machine is \"" + system.name + "\"");
   }
   return {CMPI_RC_OK, nullptr};
 }

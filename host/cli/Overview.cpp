@@ -204,8 +204,7 @@ Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace) {
   outcome.errors = data.failures;
   if (data.processors.empty()) {
     if (const std::optional<std::string> error = inventoryError()) {
-      outcome.errors.push_back(*error);
-      return outcome;
+      return {"", {*error}};
     }
   }
   outcome.output = writeOverview(data, Tarn::Inventory::processTree()->unread());

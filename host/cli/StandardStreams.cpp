@@ -7,9 +7,9 @@
 #include <cerrno>
 #include <stdexcept>
 #include <string>
+#include <system_error>
 
 #include "host/cli/Text.h"
-#include "platform/instrumentation/FileSystem.h"
 
 namespace Corvcim {
 namespace {
@@ -49,7 +49,7 @@ void writeOutput(std::string_view text) {
     _exit(statusOfSigpipe);
   }
   if (error != 0) {
-    throw std::runtime_error("standard output: " + Tarn::Inventory::describeError(error));
+    throw std::runtime_error("standard output: " + std::generic_category().message(error));
   }
 }
 

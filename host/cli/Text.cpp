@@ -98,7 +98,7 @@ std::string shorten(const std::string& text, std::size_t width) {
   return width == 0 ? "" : text.substr(0, end) + "…";
 }
 
-std::string counted(std::size_t count, std::string_view noun) {
+std::string counted(std::uint64_t count, std::string_view noun) {
   return std::to_string(count) + ' ' + std::string(noun) + (count == 1 ? "" : "s");
 }
 

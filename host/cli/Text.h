@@ -2,6 +2,7 @@
 #define HOST_CLI_TEXT_H
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
 
@@ -24,7 +25,7 @@ std::string padRight(std::string text, std::size_t width);
 std::string shorten(const std::string& text, std::size_t width);
 
 /// "1 core", "2 cores".
-std::string counted(std::size_t count, std::string_view noun);
+std::string counted(std::uint64_t count, std::string_view noun);
 
 }  // namespace Corvcim
 

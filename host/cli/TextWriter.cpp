@@ -47,7 +47,7 @@ std::string valueAsText(std::string_view property, const Value& value) {
   if (isUnsignedNumber(value)) {
     return numberAsText(property, value);
   }
-  if (value.type() == CMPI_string) {
+  if (value.type() == CMPI_string || value.type() == CMPI_dateTime) {
     return value.asString().empty() ? "\"\"" : toPrintable(value.asString());
   }
   if (value.type() == CMPI_boolean) {

@@ -1,0 +1,382 @@
+// The built program from outside: arguments in, both streams and the exit status out.
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+#include <tarn/Common.h>
+#include <nlohmann/json.hpp>
+#include <string>
+
+#include "platform/instrumentation/JsonTree.h"
+#include "tests/host/cli/Machines.h"
+#include "tests/host/cli/Program.h"
+
+namespace Corvcim::Testing {
+namespace {
+
+std::string host() {
+  return Tarn::getSystemName();
+}
+
+std::string processorPath(const std::string& identifier) {
+  return "root/cimv2:HALDA_CPUProcessor.CreationClassName=\"HALDA_CPUProcessor\",DeviceID=\"" + identifier +
+         "\",SystemCreationClassName=\"HALDA_ComputerSystem\",SystemName=\"" + host() + '"';
+}
+
+std::string cachePath(const std::string& identifier) {
+  return "root/cimv2:HALDA_CPUMemory.CreationClassName=\"HALDA_CPUMemory\",DeviceID=\"" + identifier +
+         "\",SystemCreationClassName=\"HALDA_ComputerSystem\",SystemName=\"" + host() + '"';
+}
+
+std::string corePath(const std::string& identifier) {
+  return "root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"" + identifier + '"';
+}
+
+std::string systemPath() {
+  return "root/cimv2:HALDA_ComputerSystem.CreationClassName=\"HALDA_ComputerSystem\",Name=\"" + host() + '"';
+}
+
+/// A path as it stands inside another path.
+std::string nested(const std::string& path) {
+  std::string text;
+  for (const char c : path) {
+    text += c == '"' || c == '\\' ? std::string("\\") + c : std::string(1, c);
+  }
+  return '"' + text + '"';
+}
+
+Finished success(const std::string& output) {
+  return {0, output, ""};
+}
+
+Finished failed(const std::string& error) {
+  return {1, "", "corvcim: " + error + '\n'};
+}
+
+TEST(Corvcim, EnumeratesInstances) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ei", "HALDA_CPUProcessor"}),
+            success(processorPath("P0") +
+                    "\n"
+                    "  CreationClassName        HALDA_CPUProcessor\n"
+                    "  DeviceID                 P0\n"
+                    "  SystemCreationClassName  HALDA_ComputerSystem\n"
+                    "  SystemName               " +
+                    host() +
+                    "\n"
+                    "  Caption                  Processor\n"
+                    "  Description              A processor package of the computer system, with its model, clocks "
+                    "and state.\n"
+                    "  ElementName              Socket P0\n"
+                    "  Name                     Desk CPU 2\n"
+                    "  Family                   179 (Xeon)\n"
+                    "  OtherFamilyDescription   Other\n"
+                    "  EnabledState             2 (Enabled)\n"
+                    "  RequestedState           12 (Not Applicable)\n"
+                    "  CurrentClockSpeed        2000 MHz\n"
+                    "  MaxClockSpeed            2300 MHz\n"
+                    "  ExternalBusClockSpeed    3600 MHz\n"
+                    "  CPUStatus                1 (CPU Enabled)\n"
+                    "  Status                   OK\n"
+                    "  HealthState              5 (OK)\n"
+                    "  OperationalStatus        2 (OK)\n"
+                    "  DataWidth                64 bits\n"
+                    "  AddressWidth             64 bits\n"
+                    "  Stepping                 8\n"
+                    "  UniqueId                 0FA9\n"
+                    "  UpgradeMethod            0\n"
+                    "  NumberOfEnabledCores     2\n"));
+}
+
+TEST(Corvcim, EnumeratesWithAPropertyListAndANamespace) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "mof", "ei", "root/test:HALDA_CPUProcessor", "MaxClockSpeed,Stepping"}),
+            success("instance of HALDA_CPUProcessor {\n"
+                    "  CreationClassName = \"HALDA_CPUProcessor\";\n"
+                    "  DeviceID = \"P0\";\n"
+                    "  SystemCreationClassName = \"HALDA_ComputerSystem\";\n"
+                    "  SystemName = \"" +
+                    host() +
+                    "\";\n"
+                    "  MaxClockSpeed = 2300;\n"
+                    "  Stepping = \"8\";\n"
+                    "};\n"));
+}
+
+TEST(Corvcim, EnumeratesNames) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ein", "HALDA_CPUProcessorCore"}),
+            success(corePath("P0.C0") + '\n' + corePath("P0.C1") + '\n'));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-n", "root/x", "ein", "halda_cpuprocessorCORE"}),
+            success("root/x:HALDA_CPUProcessorCore.InstanceID=\"P0.C0\"\n"
+                    "root/x:HALDA_CPUProcessorCore.InstanceID=\"P0.C1\"\n"));
+}
+
+TEST(Corvcim, AClassOfTheSchemaStandsForThoseDerivedFromIt) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ein", "CIM_Processor"}), success(processorPath("P0") + '\n'));
+}
+
+TEST(Corvcim, GetsOneInstanceAsOneObject) {
+  const Finished run = corvcimOn(twoCoreMachine(), {"-o", "json", "gi", corePath("P0.C1"), "HealthState"});
+
+  EXPECT_EQ(run, success("{\n"
+                         "  \"class\": \"HALDA_CPUProcessorCore\",\n"
+                         "  \"namespace\": \"root/cimv2\",\n"
+                         "  \"path\": \"root/cimv2:HALDA_CPUProcessorCore.InstanceID=\\\"P0.C1\\\"\",\n"
+                         "  \"properties\": {\n"
+                         "    \"InstanceID\": \"P0.C1\",\n"
+                         "    \"HealthState\": 5\n"
+                         "  }\n"
+                         "}\n"));
+}
+
+TEST(Corvcim, APathNeedsNoNamespace) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", "HALDA_CPUProcessorCore.InstanceID=\"P0.C0\"", "ElementName"}),
+            success(corePath("P0.C0") + "\n  InstanceID   P0.C0\n  ElementName  Core 0\n"));
+}
+
+TEST(Corvcim, WhatIsNotThereIsNotFound) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", "HALDA_CPUProcessorCore.InstanceID=\"P0.C9\""}),
+            failed("gi HALDA_CPUProcessorCore.InstanceID=\"P0.C9\": CIM_ERR_NOT_FOUND: there is no instance "
+                   "root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"P0.C9\""));
+}
+
+TEST(Corvcim, ClassAndPathAreNotMistakenForEachOther) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", "HALDA_CPUMemory"}),
+            failed("gi HALDA_CPUMemory: this is a class, and gi takes the path of an instance; ein lists the paths of "
+                   "a class"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ei", "HALDA_CPUProcessorCore.InstanceID=\"P0.C0\""}),
+            failed("ei HALDA_CPUProcessorCore.InstanceID=\"P0.C0\": this is the path of an instance, and ei takes a "
+                   "class; ask for the instance with gi"));
+}
+
+TEST(Corvcim, AnUnknownClassIsAnErrorThatNamesTheServedOnes) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ei", "HALDA_Disk"}),
+            failed("ei HALDA_Disk: CIM_ERR_INVALID_CLASS: no class \"HALDA_Disk\" is served here; there are "
+                   "HALDA_ComputerSystem, HALDA_CPUProcessor, HALDA_CPUProcessorCore, HALDA_CPUMemory, "
+                   "HALDA_CPUProcessorCapabilities, HALDA_CPUSystemDevice, HALDA_CPUConcreteComponent, "
+                   "HALDA_CPUAssociatedCacheMemory, HALDA_CPUCoreAssociatedCacheMemory, "
+                   "HALDA_CPUElementCapabilities"));
+}
+
+TEST(Corvcim, NavigatesAllAssociationsOfAClass) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ain", processorPath("P0")}),
+            success(systemPath() + '\n' + corePath("P0.C0") + '\n' + corePath("P0.C1") + '\n' + cachePath("P0.L1d.0") +
+                    '\n' + cachePath("P0.L1i.0") + '\n' + cachePath("P0.L2.0") + '\n' + cachePath("P0.L1d.1") + '\n' +
+                    cachePath("P0.L1i.1") + '\n' + cachePath("P0.L2.1") + '\n' + cachePath("P0.L3.0") + '\n' +
+                    "root/cimv2:HALDA_CPUProcessorCapabilities.InstanceID=\"NERITH:P0\"\n"));
+}
+
+TEST(Corvcim, NavigatesOneAssociation) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ain", "-ac", "HALDA_CPUConcreteComponent", processorPath("P0")}),
+            success(corePath("P0.C0") + '\n' + corePath("P0.C1") + '\n'));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ain", "-arc", "HALDA_CPUProcessorCapabilities", processorPath("P0")}),
+            success("root/cimv2:HALDA_CPUProcessorCapabilities.InstanceID=\"NERITH:P0\"\n"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ain", "-ar", "PartComponent", "-arr", "GroupComponent", corePath("P0.C1")}),
+            success(processorPath("P0") + '\n'));
+}
+
+TEST(Corvcim, GetsAssociatedInstancesWithAPropertyList) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ai", "-ac", "HALDA_CPUConcreteComponent", corePath("P0.C0"), "Name"}).output,
+            processorPath("P0") +
+                "\n"
+                "  CreationClassName        HALDA_CPUProcessor\n"
+                "  DeviceID                 P0\n"
+                "  SystemCreationClassName  HALDA_ComputerSystem\n"
+                "  SystemName               " +
+                host() +
+                "\n"
+                "  Name                     Desk CPU 2\n");
+}
+
+TEST(Corvcim, ShowsReferences) {
+  const std::string reference =
+      "root/cimv2:HALDA_CPUElementCapabilities.ManagedElement=" + nested(processorPath("P0")) +
+      ",Capabilities=" + nested("root/cimv2:HALDA_CPUProcessorCapabilities.InstanceID=\"NERITH:P0\"");
+
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"rin", "-arc", "HALDA_CPUElementCapabilities", processorPath("P0")}),
+            success(reference + '\n'));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ri", "-ac", "HALDA_CPUElementCapabilities", processorPath("P0")}),
+            success(reference + "\n  ManagedElement  " + processorPath("P0") +
+                    "\n  Capabilities    root/cimv2:HALDA_CPUProcessorCapabilities.InstanceID=\"NERITH:P0\"\n"));
+}
+
+TEST(Corvcim, EveryClassAnswersFromItsOwnNames) {
+  for (const std::string className :
+       {"HALDA_ComputerSystem", "HALDA_CPUProcessor", "HALDA_CPUProcessorCore", "HALDA_CPUMemory",
+        "HALDA_CPUProcessorCapabilities", "HALDA_CPUSystemDevice", "HALDA_CPUConcreteComponent",
+        "HALDA_CPUAssociatedCacheMemory", "HALDA_CPUCoreAssociatedCacheMemory", "HALDA_CPUElementCapabilities"}) {
+    const std::string names = corvcimOn(twoCoreMachine(), {"ein", className}).output;
+    const std::string first = names.substr(0, names.find('\n'));
+    ASSERT_NE(first, "") << className;
+
+    const Finished run = corvcimOn(twoCoreMachine(), {"gi", first});
+
+    EXPECT_EQ(run.status, 0) << className << ": " << run.errors;
+    EXPECT_TRUE(run.output.starts_with(first + '\n')) << className;
+  }
+}
+
+TEST(Corvcim, OneFailingAssociationDoesNotHideTheOthers) {
+  const Finished run =
+      corvcimOn(twoCoreMachine(), {"--companion", "/nowhere/companion.so", "ain", processorPath("P0")});
+
+  EXPECT_EQ(run.status, 1);
+  EXPECT_TRUE(run.output.starts_with(corePath("P0.C0") + '\n')) << run;
+  EXPECT_TRUE(run.output.ends_with("HALDA_CPUProcessorCapabilities.InstanceID=\"NERITH:P0\"\n")) << run;
+  EXPECT_EQ(run.errors, "corvcim: ain " + processorPath("P0") +
+                            ": HALDA_CPUSystemDevice: CIM_ERR_FAILED: cannot load provider library: "
+                            "/nowhere/companion.so: cannot open shared object file: No such file or directory\n");
+}
+
+TEST(Corvcim, ALibraryThatIsNotThereIsOneLine) {
+  EXPECT_EQ(
+      corvcimOn(twoCoreMachine(), {"-l", "/nowhere/provider.so", "ei", "HALDA_CPUMemory"}),
+      failed("ei HALDA_CPUMemory: CIM_ERR_FAILED: cannot load provider library: /nowhere/provider.so: cannot open "
+             "shared object file: No such file or directory"));
+}
+
+TEST(Corvcim, AnInventoryThatCanNotBeReadIsSaidByEveryVerb) {
+  const std::string why =
+      "can not read the inventory: /nowhere.json: no such file or directory; name a file that holds an inventory as "
+      "JSON";
+
+  EXPECT_EQ(corvcim({"-i", "json:/nowhere.json"}), failed(why));
+  EXPECT_EQ(corvcim({"-i", "json:/nowhere.json", "tree"}), failed(why));
+  EXPECT_EQ(corvcim({"-i", "json:/nowhere.json", "inventory"}), failed(why));
+  EXPECT_EQ(corvcim({"-i", "json:/nowhere.json", "ei", "HALDA_CPUProcessor"}), failed("ei HALDA_CPUProcessor: " + why));
+}
+
+TEST(Corvcim, AWrongCommandLineIsOneLineAndStatusTwo) {
+  EXPECT_EQ(corvcim({"enumerate"}), (Finished{2, "", "corvcim: unknown verb 'enumerate'; see 'corvcim --help'\n"}));
+}
+
+TEST(Corvcim, AWrongPathIsOneLineThatSaysWhere) {
+  const Finished run = corvcimOn(twoCoreMachine(), {"gi", "HALDA_CPUMemory.DeviceID="});
+
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.errors,
+            "corvcim: gi HALDA_CPUMemory.DeviceID=: object path \"HALDA_CPUMemory.DeviceID=\", column 26: expected a "
+            "value: a text in double quotes, TRUE, FALSE or a number\n");
+}
+
+TEST(Corvcim, ShowsVersionAndHelp) {
+  EXPECT_EQ(corvcim({"--version"}), success("corvcim " CORVCIM_VERSION "\n"));
+  EXPECT_TRUE(corvcim({"--help"}).output.starts_with("Usage: corvcim [OPTION...] [VERB [ARGUMENT...]]\n"));
+  EXPECT_EQ(corvcim({"ein", "--help"}), success("Usage: corvcim [OPTION...] ein CLASS\n"
+                                                "\n"
+                                                "Shows the paths of every instance.\n"
+                                                "Output: text, mof or json.\n"
+                                                "\n"
+                                                "CLASS is a class name, with or without a namespace before it "
+                                                "(root/cimv2:HALDA_CPUMemory).\n"));
+}
+
+TEST(Corvcim, InventoryReadsBackAsTheSameTree) {
+  for (const auto& machine : {twoCoreMachine(), dualSocketServer(), smallBoard(), strangeTexts()}) {
+    const Finished run = corvcimOn(machine, {"inventory", "-o", "json"});
+
+    EXPECT_EQ(run.errors, "");
+    EXPECT_EQ(Tarn::Inventory::readJson(run.output, "output"), machine);
+  }
+}
+
+TEST(Corvcim, OverviewComesThroughTheProviders) {
+  EXPECT_EQ(corvcimOn(smallBoard(), {}), success(host() + ": BoardBox\n"
+                                                          "\n"
+                                                          "Processor P0\n"
+                                                          "  Model   Board CPU 4\n"
+                                                          "  Family  Xeon, stepping 8\n"
+                                                          "  State   Enabled, health OK\n"
+                                                          "  Cores   4 cores, all enabled, 4 threads\n"
+                                                          "  Clocks  2 GHz now, 1.5 GHz at most\n"
+                                                          "  Caches  4 × L1d 32 KiB, 4 × L1i 48 KiB, L2 1 MiB, cache\n"
+                                                          "  Widths  64 data bits, 64 address bits\n"
+                                                          "\n"
+                                                          "Not read:\n"
+                                                          "  /sys/firmware/dmi/tables/DMI: permission denied\n"
+                                                          "    run as root to read it\n"));
+}
+
+TEST(Corvcim, OverviewOfAVirtualMachineSaysWhyThereIsNoName) {
+  EXPECT_EQ(corvcimOn(virtualMachine(), {}),
+            success(host() + ": Virtual Machine\n"
+                             "\n"
+                             "Processor P0\n"
+                             "  Model   Unknown\n"
+                             "  Family  Unknown, stepping 8\n"
+                             "  State   Enabled, health OK\n"
+                             "  Cores   1 core, 1 enabled, 1 thread\n"
+                             "  Clocks  2 GHz now\n"
+                             "  Caches  not known\n"
+                             "  Widths  64 data bits, 64 address bits\n"
+                             "\n"
+                             "A virtual machine: its processors' model and family are not reported.\n"));
+}
+
+TEST(Corvcim, OverviewOfABigMachineFitsAScreen) {
+  const Finished run = corvcimOn(dualSocketServer(), {});
+
+  EXPECT_EQ(run.status, 0) << run;
+  EXPECT_LE(std::ranges::count(run.output, '\n'), 24) << run;
+  EXPECT_NE(run.output.find("2 equal processors: P0, P1\n"), std::string::npos) << run;
+}
+
+TEST(Corvcim, DrawsTheTree) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"tree"}),
+            success(host() + ": DeskBox 2\n"
+                             "└─ processor P0: Desk CPU 2; 2 cores; 2 threads; up to 2.3 GHz\n"
+                             "   └─ L3 16 MiB: shared by 2 cores\n"
+                             "      ├─ core P0.C0: CPU 0; L2 2 MiB, L1d 48 KiB, L1i 32 KiB\n"
+                             "      └─ core P0.C1: CPU 1; L2 2 MiB, L1d 48 KiB, L1i 32 KiB\n"));
+  EXPECT_TRUE(corvcimOn(twoCoreMachine(), {"tree", "-o", "svg"}).output.starts_with("<svg "));
+  EXPECT_TRUE(corvcimOn(twoCoreMachine(), {"tree", "-o", "dot"}).output.starts_with("digraph corvcim {\n"));
+}
+
+TEST(Corvcim, ListsTheClasses) {
+  EXPECT_TRUE(corvcim({"classes"})
+                  .output.starts_with(
+                      "CLASS                               DERIVED FROM               KEYS\n"
+                      "HALDA_ComputerSystem                CIM_ComputerSystem         CreationClassName, Name\n"));
+  const nlohmann::json classes = nlohmann::json::parse(corvcim({"classes", "-o", "json"}).output);
+  EXPECT_EQ(classes.size(), 10U);
+  EXPECT_EQ(classes[5]["properties"][0].dump(),
+            R"({"key":true,"name":"GroupComponent","referenceClass":"HALDA_ComputerSystem","type":"ref"})");
+}
+
+TEST(Corvcim, LanguageIsForPeopleAlone) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"--language", "de_AT", "gi", corePath("P0.C0"), "Caption"}),
+            success(corePath("P0.C0") + "\n  InstanceID  P0.C0\n  Caption     Prozessorkern\n"));
+  const Finished run = shell("CORVANE_LANGUAGE=de \"$corvcim\" -o mof ei HALDA_ComputerSystem Caption");
+  EXPECT_EQ(run.output,
+            "instance of HALDA_ComputerSystem {\n"
+            "  CreationClassName = \"HALDA_ComputerSystem\";\n"
+            "  Name = \"" +
+                host() +
+                "\";\n"
+                "  Caption = \"Computer System\";\n"
+                "};\n");
+}
+
+TEST(Corvcim, StrangeTextsGiveValidJson) {
+  const Finished run = corvcimOn(strangeTexts(), {"-o", "json", "ei", "HALDA_CPUProcessor", "Name"});
+
+  EXPECT_EQ(nlohmann::json::parse(run.output)[0]["properties"]["Name"], "say \"hi\" \\ <there>\x07 \xC3\xA9\n");
+}
+
+TEST(Corvcim, AReaderThatGoesAwayEndsItQuietly) {
+  const Finished run = shell("\"$corvcim\" classes | true; echo ${PIPESTATUS[0]}");
+
+  EXPECT_EQ(run.errors, "");
+  EXPECT_TRUE(run.output == "141\n" || run.output == "0\n") << run;
+}
+
+TEST(Corvcim, AReaderThatGoesAwayEndsItQuietlyWhereThePipeSignalIsIgnored) {
+  EXPECT_EQ(shell("trap '' PIPE; exec 3> >(exec true); wait $!; \"$corvcim\" classes >&3; echo $?"), success("141\n"));
+}
+
+TEST(Corvcim, OutputThatCanNotBeWrittenIsAnError) {
+  EXPECT_EQ(shell("\"$corvcim\" classes > /dev/full"), failed("standard output: No space left on device"));
+  EXPECT_EQ(shell("\"$corvcim\" classes >&-").status, 1);
+}
+
+}  // namespace
+}  // namespace Corvcim::Testing

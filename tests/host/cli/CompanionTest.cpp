@@ -1,0 +1,208 @@
+// The provider of HALDA_ComputerSystem, called through its shared object as a broker does.
+
+#include <dlfcn.h>
+#include <gtest/gtest.h>
+
+#include <tarn/Common.h>
+#include <cstdlib>
+#include <string>
+
+#include "host/broker/Broker.h"
+#include "host/broker/ProviderLibrary.h"
+#include "host/broker/Request.h"
+#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/TreeBuilder.h"
+#include "tests/host/cli/Program.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::TreeBuilder;
+using namespace Tarn::NodeLexicon;
+
+constexpr const char* provider = "CorvaneComputerSystemProvider";
+
+class Companion : public testing::Test {
+ protected:
+  Companion() {
+    setenv("CORVANE_LOG", "6000:none", 1);
+    use(TreeBuilder().system().text(PropSystemModel, "DeskBox 2").build());
+  }
+
+  /// The library reads its inventory once for each load.
+  void use(const Tarn::Inventory::Tree& tree) {
+    const std::string file = directory_.write("machine.json", Tarn::Inventory::writeJson(tree));
+    setenv("CORVANE_INVENTORY", ("json:" + file).c_str(), 1);
+    library_.emplace(COMPANION_LIBRARY);
+  }
+
+  CMPIInstanceMI* mi() { return library_->instanceMI(broker_, provider); }
+
+  static ObjectPath classPath() { return {"", "root/test", "HALDA_ComputerSystem", {}}; }
+
+  static ObjectPath systemPath(const std::string& name) {
+    ObjectPath path = classPath();
+    path.keys = {{"CreationClassName", Value::string("HALDA_ComputerSystem")}, {"Name", Value::string(name)}};
+    return path;
+  }
+
+  Testing::Directory directory_;
+  Broker broker_;
+  std::optional<ProviderLibrary> library_;
+};
+
+std::vector<NamedValue> keys() {
+  return {{"CreationClassName", Value::string("HALDA_ComputerSystem")}, {"Name", Value::string(Tarn::getSystemName())}};
+}
+
+TEST_F(Companion, TellsAboutTheSystem) {
+  const Response response = broker_.enumerateInstances(mi(), classPath());
+
+  std::vector<NamedValue> properties = keys();
+  properties.push_back({"Caption", Value::string("Computer System")});
+  properties.push_back({"Description", Value::string("The computer system that the processors belong to, with its "
+                                                     "model, maker and state.")});
+  properties.push_back({"ElementName", Value::string(Tarn::getSystemName())});
+  properties.push_back({"Model", Value::string("DeskBox 2")});
+  properties.push_back({"EnabledState", Value::uint16(2)});
+  properties.push_back({"RequestedState", Value::uint16(12)});
+  properties.push_back({"HealthState", Value::uint16(5)});
+  properties.push_back({"OperationalStatus", Value::uint16Array({2})});
+  ASSERT_TRUE(response.ok());
+  ASSERT_EQ(response.instances.size(), 1U);
+  EXPECT_EQ(response.instances[0].properties, properties);
+  EXPECT_EQ(response.instances[0].path.nameSpace, "root/test");
+  EXPECT_EQ(response.doneCalls, 1U);
+}
+
+TEST_F(Companion, NamesTheSystem) {
+  const Response response = broker_.enumerateInstanceNames(mi(), classPath());
+
+  ASSERT_EQ(response.paths.size(), 1U);
+  EXPECT_TRUE(namesSameInstance(response.paths[0], systemPath(Tarn::getSystemName())));
+  EXPECT_EQ(response.paths[0].host, Tarn::getSystemName());
+  EXPECT_EQ(response.doneCalls, 1U);
+}
+
+TEST_F(Companion, KeepsToThePropertyList) {
+  const Response response = broker_.enumerateInstances(mi(), classPath(), std::vector<std::string>{"healthSTATE"});
+
+  std::vector<NamedValue> properties = keys();
+  properties.push_back({"HealthState", Value::uint16(5)});
+  ASSERT_EQ(response.instances.size(), 1U);
+  EXPECT_EQ(response.instances[0].properties, properties);
+  EXPECT_EQ(broker_.enumerateInstances(mi(), classPath(), std::vector<std::string>{}).instances.at(0).properties,
+            keys());
+}
+
+TEST_F(Companion, GetsTheSystemByItsKeys) {
+  const Response response = broker_.getInstance(mi(), systemPath(Tarn::getSystemName()));
+
+  ASSERT_TRUE(response.ok());
+  EXPECT_EQ(response.instances.size(), 1U);
+  EXPECT_EQ(response.doneCalls, 1U);
+}
+
+TEST_F(Companion, FindsNoOtherSystem) {
+  const Response response = broker_.getInstance(mi(), systemPath("another"));
+
+  EXPECT_EQ(response.rc, CMPI_RC_ERR_NOT_FOUND);
+  EXPECT_EQ(response.message,
+            "no system has CreationClassName \"HALDA_ComputerSystem\" and Name \"another\"; this "
+            "machine is \"" +
+                Tarn::getSystemName() + '"');
+  EXPECT_TRUE(response.instances.empty());
+}
+
+TEST_F(Companion, NeedsBothKeys) {
+  ObjectPath path = systemPath(Tarn::getSystemName());
+  path.keys.pop_back();
+
+  const Response response = broker_.getInstance(mi(), path);
+
+  EXPECT_EQ(response.rc, CMPI_RC_ERR_INVALID_PARAMETER);
+  EXPECT_EQ(response.message, "the path of a computer system needs the keys CreationClassName and Name");
+}
+
+TEST_F(Companion, StatesAreThoseOfTheInventory) {
+  use(TreeBuilder().system().status(Tarn::Inventory::Status::failed).build());
+
+  const Response response = broker_.enumerateInstances(
+      mi(), classPath(), std::vector<std::string>{"EnabledState", "HealthState", "OperationalStatus", "Model"});
+
+  std::vector<NamedValue> properties = keys();
+  properties.push_back({"EnabledState", Value::uint16(2)});
+  properties.push_back({"HealthState", Value::uint16(25)});
+  properties.push_back({"OperationalStatus", Value::uint16Array({6})});
+  EXPECT_EQ(response.instances.at(0).properties, properties);
+}
+
+TEST_F(Companion, AMachineWithoutASystemNodeHasANameAndUnknownStates) {
+  use(TreeBuilder().processor("P0").build());
+
+  const Response response = broker_.enumerateInstances(mi(), classPath(), std::vector<std::string>{"EnabledState"});
+
+  EXPECT_EQ(response.instances.at(0).properties.back(), (NamedValue{"EnabledState", Value::uint16(0)}));
+}
+
+TEST_F(Companion, AnInventoryThatCanNotBeReadIsAStatus) {
+  setenv("CORVANE_INVENTORY", "json:/nowhere.json", 1);
+  library_.emplace(COMPANION_LIBRARY);
+
+  const Response response = broker_.enumerateInstances(mi(), classPath());
+
+  EXPECT_EQ(response.rc, CMPI_RC_ERR_FAILED);
+  EXPECT_EQ(response.message,
+            "can not read the inventory: /nowhere.json: no such file or directory; name a file that "
+            "holds an inventory as JSON");
+}
+
+TEST_F(Companion, ABrokerThatRefusesGivesAFailureAndNothingElse) {
+  for (const char* service : {"newObjectPath", "newInstance"}) {
+    broker_.failNth(service, 1);
+
+    const Response response = broker_.enumerateInstances(mi(), classPath());
+
+    EXPECT_EQ(response.rc, CMPI_RC_ERR_FAILED) << service;
+    EXPECT_TRUE(response.instances.empty()) << service;
+  }
+}
+
+TEST_F(Companion, AnArrayThatCanNotBeMadeLeavesItsPropertyOut) {
+  broker_.failNth("newArray", 1);
+
+  const Response response = broker_.enumerateInstances(mi(), classPath());
+
+  ASSERT_EQ(response.instances.size(), 1U);
+  EXPECT_EQ(response.instances[0].property("OperationalStatus"), nullptr);
+}
+
+TEST_F(Companion, RefusesEveryChange) {
+  const Request request(broker_);
+  CMPIInstanceMI* instances = mi();
+  const CMPIInstanceMIFT* functions = instances->ft;
+
+  EXPECT_EQ(functions->createInstance(instances, nullptr, nullptr, nullptr, nullptr).rc, CMPI_RC_ERR_NOT_SUPPORTED);
+  EXPECT_EQ(functions->modifyInstance(instances, nullptr, nullptr, nullptr, nullptr, nullptr).rc,
+            CMPI_RC_ERR_NOT_SUPPORTED);
+  EXPECT_EQ(functions->deleteInstance(instances, nullptr, nullptr, nullptr).rc, CMPI_RC_ERR_NOT_SUPPORTED);
+  EXPECT_EQ(functions->execQuery(instances, nullptr, nullptr, nullptr, nullptr, nullptr).rc, CMPI_RC_ERR_NOT_SUPPORTED);
+  EXPECT_EQ(functions->cleanup(instances, nullptr, 1).rc, CMPI_RC_OK);
+  EXPECT_STREQ(functions->miName, "instanceCorvaneComputerSystemProvider");
+}
+
+TEST_F(Companion, LeavesNothingBehind) {
+  broker_.enumerateInstances(mi(), classPath());
+
+  EXPECT_EQ(broker_.liveObjects(), 0U);
+}
+
+TEST_F(Companion, IsGoneAfterItsLastUse) {
+  broker_.enumerateInstances(mi(), classPath());
+  library_.reset();
+
+  EXPECT_EQ(dlopen(COMPANION_LIBRARY, RTLD_NOW | RTLD_NOLOAD), nullptr);
+}
+
+}  // namespace
+}  // namespace Corvcim

@@ -1,0 +1,154 @@
+#include "host/cli/Options.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <vector>
+
+namespace Corvcim {
+namespace {
+
+using testing::ElementsAre;
+
+Options parse(const std::vector<const char*>& arguments) {
+  return parseOptions(arguments);
+}
+
+/// What is said against the arguments; empty if they are understood.
+std::string complaint(const std::vector<const char*>& arguments) {
+  try {
+    parseOptions(arguments);
+    return "";
+  } catch (const UsageError& error) {
+    return error.what();
+  }
+}
+
+TEST(Options, NothingMeansTheOverviewOfThisMachine) {
+  const Options options = parse({});
+
+  EXPECT_EQ(options.verb->verb, Verb::Overview);
+  EXPECT_EQ(options.format, Format::Text);
+  EXPECT_EQ(options.nameSpace, "root/cimv2");
+  EXPECT_EQ(options.library + options.companion + options.inventory + options.language, "");
+}
+
+TEST(Options, LongOptionsTakeTheirValueAsAWordOrBehindAnEqualsSign) {
+  const Options options = parse({"--library", "a.so", "--companion=b.so", "--inventory", "json:x=y", "--language=de_AT",
+                                 "--namespace=root/test", "--output", "text"});
+
+  EXPECT_EQ(options.library, "a.so");
+  EXPECT_EQ(options.companion, "b.so");
+  EXPECT_EQ(options.inventory, "json:x=y");
+  EXPECT_EQ(options.language, "de_AT");
+  EXPECT_EQ(options.nameSpace, "root/test");
+}
+
+TEST(Options, ShortOptionsTakeTheirValueAsAWordOrGlued) {
+  const Options options = parse({"-l", "a.so", "-ilive", "-nroot/x", "-ojson", "classes"});
+
+  EXPECT_EQ(options.library, "a.so");
+  EXPECT_EQ(options.inventory, "live");
+  EXPECT_EQ(options.nameSpace, "root/x");
+  EXPECT_EQ(options.format, Format::Json);
+}
+
+TEST(Options, MayStandBehindTheVerb) {
+  const Options options = parse({"ei", "HALDA_CPUMemory", "-o", "mof", "DeviceID"});
+
+  EXPECT_EQ(options.verb->verb, Verb::EnumerateInstances);
+  EXPECT_EQ(options.target, "HALDA_CPUMemory");
+  EXPECT_EQ(options.format, Format::Mof);
+  EXPECT_THAT(options.properties, ElementsAre("DeviceID"));
+}
+
+TEST(Options, PropertyListsAreSeparatedByCommas) {
+  const Options options = parse({"ei", "HALDA_CPUProcessor", "DeviceID,Name,,Family"});
+
+  EXPECT_TRUE(options.hasPropertyList);
+  EXPECT_THAT(options.properties, ElementsAre("DeviceID", "Name", "Family"));
+}
+
+TEST(Options, AnEmptyPropertyListSelectsTheKeysAlone) {
+  EXPECT_TRUE(parse({"ei", "HALDA_CPUProcessor", ""}).hasPropertyList);
+  EXPECT_FALSE(parse({"ei", "HALDA_CPUProcessor"}).hasPropertyList);
+}
+
+TEST(Options, AssociationOptionsAreThoseOfWbemcli) {
+  const Options options = parse({"ai", "-ac", "A", "-arc", "R", "-ar", "role", "-arr", "far", "X.K=1"});
+
+  EXPECT_EQ(options.association.associationClass, "A");
+  EXPECT_EQ(options.association.resultClass, "R");
+  EXPECT_EQ(options.association.role, "role");
+  EXPECT_EQ(options.association.resultRole, "far");
+  EXPECT_EQ(options.target, "X.K=1");
+}
+
+TEST(Options, ReferencesTakeTheAssociationClassByEitherOption) {
+  EXPECT_EQ(parse({"ri", "-arc", "A", "X.K=1"}).association.associationClass, "A");
+  EXPECT_EQ(parse({"rin", "-ac", "A", "X.K=1"}).association.associationClass, "A");
+  EXPECT_EQ(complaint({"ri", "-ac", "A", "-arc", "B", "X.K=1"}),
+            "ri: '-ac' and '-arc' both name the association class; usage: corvcim [OPTION...] ri PATH [PROPERTY,...]");
+  EXPECT_EQ(complaint({"rin", "-arr", "far", "X.K=1"}),
+            "rin: no option '-arr': a reference has no far end; usage: corvcim [OPTION...] rin PATH");
+}
+
+TEST(Options, TwoDashesEndThem) {
+  EXPECT_EQ(parse({"ein", "--", "-strange"}).target, "-strange");
+}
+
+TEST(Options, HelpNeedsNoOperands) {
+  const Options options = parse({"gi", "--help"});
+
+  EXPECT_TRUE(options.wantsHelp);
+  EXPECT_EQ(options.verb->verb, Verb::GetInstance);
+  EXPECT_TRUE(parse({"-h"}).wantsHelp);
+  EXPECT_TRUE(parse({"-V"}).wantsVersion);
+}
+
+TEST(Options, UnknownWordsAreNamed) {
+  EXPECT_EQ(complaint({"list"}), "unknown verb 'list'; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"--colour"}), "unknown option '--colour'; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-x"}), "unknown option '-x'; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-o", "xml", "classes"}),
+            "unknown output format 'xml': it can be text, mof, json, svg or dot; see 'corvcim --help'");
+}
+
+TEST(Options, MissingAndSurplusWordsAreNamed) {
+  EXPECT_EQ(complaint({"ei"}), "ei: CLASS is missing; usage: corvcim [OPTION...] ei CLASS [PROPERTY,...]");
+  EXPECT_EQ(complaint({"gi"}), "gi: PATH is missing; usage: corvcim [OPTION...] gi PATH [PROPERTY,...]");
+  EXPECT_EQ(complaint({"ein", "A", "B"}), "ein: unexpected argument 'B'; usage: corvcim [OPTION...] ein CLASS");
+  EXPECT_EQ(complaint({"tree", "now"}), "tree: unexpected argument 'now'; usage: corvcim [OPTION...] tree");
+  EXPECT_EQ(complaint({"ei", "A", "-n"}), "option '-n' needs a value; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"--help=yes"}), "option '--help' takes no value; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-n", "", "classes"}), "the namespace is empty; see 'corvcim --help'");
+}
+
+TEST(Options, FormatsBelongToVerbs) {
+  EXPECT_EQ(complaint({"ei", "A", "-o", "svg"}),
+            "ei has no output format 'svg': it can be text, mof or json; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"tree", "-o", "json"}),
+            "tree has no output format 'json': it can be text, svg or dot; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-o", "json"}),
+            "the overview has no output format 'json': it can be text; see 'corvcim --help'");
+}
+
+TEST(Options, AssociationOptionsBelongToAssociationVerbs) {
+  EXPECT_EQ(complaint({"ei", "A", "-ac", "B"}),
+            "ei takes no option '-ac': it belongs to ai, ain, ri and rin; see 'corvcim --help'");
+}
+
+TEST(Options, LanguagesBelongToText) {
+  EXPECT_EQ(complaint({"ei", "A", "--language", "de", "-o", "json"}),
+            "'--language' is for text: mof and json are the same in every language; see 'corvcim --help'");
+}
+
+TEST(Options, EveryVerbIsFoundByItsName) {
+  for (const VerbSyntax& syntax : verbs()) {
+    EXPECT_EQ(findVerb(syntax.name), &syntax);
+  }
+  EXPECT_EQ(findVerb(""), nullptr);
+}
+
+}  // namespace
+}  // namespace Corvcim
