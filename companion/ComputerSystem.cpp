@@ -3,8 +3,10 @@
 #include <tarn/Common.h>
 #include <tarn/Instrumentation.h>
 #include <tarn/NodeLexicon.h>
+
 #include <algorithm>
 #include <iterator>
+#include "platform/instrumentation/PropertyTable.h"
 
 namespace Tarn::ComputerSystemProvider {
 namespace {
@@ -42,6 +44,7 @@ ComputerSystem readComputerSystem() {
     return system;
   }
   cursor.getProperty(NodeLexicon::PropSystemModel, system.model);
+  cursor.getProperty(Inventory::PropSystemManufacturer, system.manufacturer);
   const State& state = stateOf(cursor.getNodeStatus());
   system.enabledState = state.enabledState;
   system.healthState = state.healthState;

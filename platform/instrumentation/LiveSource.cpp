@@ -10,6 +10,7 @@
 #include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/Machine.h"
 #include "platform/instrumentation/NodePaths.h"
+#include "platform/instrumentation/PropertyTable.h"
 #include "platform/instrumentation/SystemModel.h"
 #include "platform/instrumentation/Topology.h"
 #include "platform/instrumentation/TreeBuilder.h"
@@ -60,6 +61,7 @@ class LiveReader {
     const std::string model = readSystemModel(machine_);
     tree_.system().description(model.empty() ? "Computer system" : model);
     addText(PropSystemModel, model);
+    addText(PropSystemManufacturer, readSystemManufacturer(machine_));
   }
 
   void addProcessor(const Package& package, const std::string& path) {

@@ -34,6 +34,7 @@ constexpr std::array properties = {
     PropertyEntry{PropFamily, NodeProcessor, Number, "Family"},
     PropertyEntry{PropUpgradeMethod, NodeProcessor, Number, "UpgradeMethod"},
     PropertyEntry{PropProcessorName, NodeProcessor, Text, "ProcessorName"},
+    PropertyEntry{PropSystemManufacturer, NodeSystem, Text, "SystemManufacturer"},
 };
 static_assert(std::ranges::is_sorted(properties, {}, &PropertyEntry::id));
 

@@ -10,6 +10,10 @@ namespace Tarn::Inventory {
 
 enum class PropertyKind { Number, Text, List };
 
+/// The system's maker, a text. The processor classes have no use for it, so the lexicon that the
+/// inventory shares with them does not list it; the provider of the computer system does.
+inline constexpr auto PropSystemManufacturer = static_cast<NodeLexicon::Properties>(400);
+
 /// What is known about a property: its name in JSON, its kind, and the one type of node that has it.
 struct PropertyEntry {
   NodeLexicon::Properties id;

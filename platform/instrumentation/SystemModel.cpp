@@ -20,6 +20,7 @@ constexpr std::array placeholders = {
     std::string_view("Not Specified"),
     std::string_view("O.E.M."),
     std::string_view("System Product Name"),
+    std::string_view("System manufacturer"),
     std::string_view("To Be Filled By O.E.M."),
     std::string_view("To be filled by O.E.M."),
     std::string_view("Undefined"),
@@ -28,6 +29,12 @@ static_assert(std::ranges::is_sorted(placeholders));
 
 // The model that emulators give their device tree.
 constexpr std::string_view emulatedBoard = "linux,dummy-virt";
+
+/// A text that the firmware gives; empty where nobody filled it in.
+std::string firmwareText(Machine& machine, const char* path) {
+  std::string text(machine.root().text(path).value_or(std::string_view()));
+  return std::ranges::binary_search(placeholders, text) ? std::string() : text;
+}
 
 std::string deviceTreeModel(Machine& machine) {
   std::string model(machine.root().text("proc/device-tree/model").value_or(std::string_view()));
@@ -48,8 +55,8 @@ std::string hypervisorModel(Machine& machine) {
 }  // namespace
 
 std::string readSystemModel(Machine& machine) {
-  std::string product(machine.root().text("sys/class/dmi/id/product_name").value_or(std::string_view()));
-  if (!product.empty() && !std::ranges::binary_search(placeholders, product)) {
+  std::string product = firmwareText(machine, "sys/class/dmi/id/product_name");
+  if (!product.empty()) {
     return product;
   }
   const std::string file = machine.root().fileName();
@@ -62,6 +69,10 @@ std::string readSystemModel(Machine& machine) {
     machine.noteUnread(file, error, "it is there on machines whose firmware has DMI tables");
   }
   return hypervisorModel(machine);
+}
+
+std::string readSystemManufacturer(Machine& machine) {
+  return firmwareText(machine, "sys/class/dmi/id/sys_vendor");
 }
 
 }  // namespace Tarn::Inventory

@@ -11,6 +11,9 @@ namespace Tarn::Inventory {
 /// where the kernel says that it runs under a hypervisor. Empty where none of them is known.
 std::string readSystemModel(Machine& machine);
 
+/// The computer's maker, as the firmware names it; empty where it does not.
+std::string readSystemManufacturer(Machine& machine);
+
 }  // namespace Tarn::Inventory
 
 #endif

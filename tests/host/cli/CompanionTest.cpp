@@ -11,12 +11,14 @@
 #include "host/broker/ProviderLibrary.h"
 #include "host/broker/Request.h"
 #include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/PropertyTable.h"
 #include "platform/instrumentation/TreeBuilder.h"
 #include "tests/host/cli/Program.h"
 
 namespace Corvcim {
 namespace {
 
+using Tarn::Inventory::PropSystemManufacturer;
 using Tarn::Inventory::TreeBuilder;
 using namespace Tarn::NodeLexicon;
 
@@ -26,7 +28,7 @@ class Companion : public testing::Test {
  protected:
   Companion() {
     setenv("CORVANE_LOG", "6000:none", 1);
-    use(TreeBuilder().system().text(PropSystemModel, "DeskBox 2").build());
+    use(TreeBuilder().system().text(PropSystemModel, "DeskBox 2").text(PropSystemManufacturer, "Boxes Inc.").build());
   }
 
   /// The library reads its inventory once for each load.
@@ -64,6 +66,7 @@ TEST_F(Companion, TellsAboutTheSystem) {
                                                      "model, maker and state.")});
   properties.push_back({"ElementName", Value::string(Tarn::getSystemName())});
   properties.push_back({"Model", Value::string("DeskBox 2")});
+  properties.push_back({"Manufacturer", Value::string("Boxes Inc.")});
   properties.push_back({"EnabledState", Value::uint16(2)});
   properties.push_back({"RequestedState", Value::uint16(12)});
   properties.push_back({"HealthState", Value::uint16(5)});

@@ -8,7 +8,7 @@ namespace {
 using namespace NodeLexicon;
 using enum PropertyKind;
 
-TEST(PropertyTable, HoldsEveryPropertyOfTheLexicon) {
+TEST(PropertyTable, HoldsEveryPropertyOfTheLexiconAndTheSystemsMaker) {
   struct Row {
     unsigned int id;
     NodeType type;
@@ -39,6 +39,7 @@ TEST(PropertyTable, HoldsEveryPropertyOfTheLexicon) {
       {298, NodeProcessor, Number, "Family"},
       {304, NodeProcessor, Number, "UpgradeMethod"},
       {307, NodeProcessor, Text, "ProcessorName"},
+      {400, NodeSystem, Text, "SystemManufacturer"},
   };
 
   ASSERT_EQ(propertyTable().size(), std::size(expected));

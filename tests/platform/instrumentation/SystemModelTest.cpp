@@ -3,6 +3,7 @@
 
 #include <cerrno>
 
+#include "platform/instrumentation/PropertyTable.h"
 #include "tests/platform/instrumentation/KernelFiles.h"
 
 namespace Tarn::Inventory {
@@ -94,6 +95,20 @@ TEST(SystemModel, ThatMayNotBeReadIsTold) {
 
 TEST(SystemModel, WithStrangeBytesIsValidUtf8) {
   EXPECT_EQ(modelOf(machine().file(productName, "Box\xFF\n")), "Box\xEF\xBF\xBD");
+}
+
+TEST(SystemManufacturer, IsTheFirmwaresVendor) {
+  const Tree tree = machine().file(productName, "Box\n").file("sys/class/dmi/id/sys_vendor", "Boxes Inc.\n").tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemManufacturer), "Boxes Inc.");
+}
+
+TEST(SystemManufacturer, IsNoPlaceholder) {
+  for (const char* text : {"System manufacturer", "To Be Filled By O.E.M.", ""}) {
+    const Tree tree = machine().file("sys/class/dmi/id/sys_vendor", text + std::string("\n")).tree();
+    EXPECT_EQ(textAt(tree, "system", PropSystemManufacturer), std::nullopt) << text;
+  }
+  EXPECT_EQ(textAt(machine().tree(), "system", PropSystemManufacturer), std::nullopt);
 }
 
 }  // namespace
