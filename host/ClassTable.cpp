@@ -1,5 +1,6 @@
 #include "host/ClassTable.h"
 
+#include "host/DmtfClasses.h"
 #include "host/broker/Names.h"
 
 #include <algorithm>
@@ -153,33 +154,6 @@ constexpr ClassDefinition classes[] = {
      "CPUElementCapabilitiesProvider", cpuLibrary, cpuGroup},
 };
 
-struct Inheritance {
-  std::string_view name;
-  std::string_view parent;
-};
-
-// The DMTF classes above ours.
-constexpr Inheritance dmtfClasses[] = {
-    {"CIM_AssociatedCacheMemory", "CIM_AssociatedMemory"},
-    {"CIM_AssociatedMemory", "CIM_Dependency"},
-    {"CIM_Capabilities", "CIM_ManagedElement"},
-    {"CIM_ComputerSystem", "CIM_System"},
-    {"CIM_ConcreteComponent", "CIM_Component"},
-    {"CIM_EnabledLogicalElement", "CIM_LogicalElement"},
-    {"CIM_EnabledLogicalElementCapabilities", "CIM_Capabilities"},
-    {"CIM_LogicalDevice", "CIM_EnabledLogicalElement"},
-    {"CIM_LogicalElement", "CIM_ManagedSystemElement"},
-    {"CIM_ManagedSystemElement", "CIM_ManagedElement"},
-    {"CIM_Memory", "CIM_StorageExtent"},
-    {"CIM_Processor", "CIM_LogicalDevice"},
-    {"CIM_ProcessorCapabilities", "CIM_EnabledLogicalElementCapabilities"},
-    {"CIM_ProcessorCore", "CIM_EnabledLogicalElement"},
-    {"CIM_StorageExtent", "CIM_LogicalDevice"},
-    {"CIM_System", "CIM_EnabledLogicalElement"},
-    {"CIM_SystemComponent", "CIM_Component"},
-    {"CIM_SystemDevice", "CIM_SystemComponent"},
-};
-
 constexpr std::size_t endsOfAnAssociation = 2;
 
 }  // namespace
@@ -204,9 +178,8 @@ std::string_view parentOf(std::string_view name) {
   if (const ClassDefinition* definition = findClass(name)) {
     return definition->parent;
   }
-  const auto* found =
-      std::ranges::find_if(dmtfClasses, [&](const Inheritance& each) { return sameName(each.name, name); });
-  return found == std::end(dmtfClasses) ? std::string_view{} : found->parent;
+  const DmtfClass* above = findDmtfClass(name);
+  return above == nullptr ? std::string_view{} : above->parent;
 }
 
 bool isA(std::string_view name, std::string_view ancestor) {
