@@ -11,6 +11,7 @@
 #include "tests/support/EventList.h"
 #include "tests/support/Paths.h"
 #include "tests/support/ProviderFunctions.h"
+#include "tests/support/Responses.h"
 
 namespace Support {
 
@@ -48,22 +49,6 @@ class ProviderTest : public Scripted::ScriptedTest {
 
   Corvcim::Broker broker;
 };
-
-/// A request that succeeded and was ended with CMReturnDone; the same without, as associations answer.
-Corvcim::Response answered(std::vector<Corvcim::Instance> instances);
-Corvcim::Response answered(std::vector<Corvcim::ObjectPath> paths);
-Corvcim::Response answeredNothing();
-Corvcim::Response withoutDone(Corvcim::Response response);
-
-/// The paths of a response's instances, in order.
-std::vector<Corvcim::ObjectPath> pathsOf(const Corvcim::Response& response);
-
-/// What happened to a request besides its results: status, message and CMReturnDone on one line, such
-/// as "CMPI_RC_ERR_FAILED |the message| done".
-std::string outcome(const Corvcim::Response& response);
-
-/// The recorded calls of one service.
-std::vector<std::string> detailsOf(const std::vector<Corvcim::ServiceCall>& record, const std::string& service);
 
 }  // namespace Support
 
