@@ -8,6 +8,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <variant>
 #include <vector>
 
@@ -78,7 +79,9 @@ class Value {
   using Data = std::variant<std::monostate, bool, std::uint64_t, std::int64_t, double, std::string, std::vector<Value>,
                             PathPointer, InstancePointer>;
 
-  Value(CMPIType type, Data data) : type_(type), data_(std::move(data)) {}
+  // Data is made in place: moving a variant would be one step more for nothing.
+  template <class Content>
+  Value(CMPIType type, Content content) : type_(type), data_(std::move(content)) {}
 
   CMPIType type_ = CMPI_null;
   Data data_;
