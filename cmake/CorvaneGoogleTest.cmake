@@ -3,12 +3,26 @@
 set(CORVANE_GTEST_SOURCE /usr/src/googletest CACHE PATH "GoogleTest sources (Debian package googletest)")
 set(INSTALL_GTEST OFF CACHE BOOL "" FORCE)
 add_subdirectory(${CORVANE_GTEST_SOURCE} ${PROJECT_BINARY_DIR}/googletest EXCLUDE_FROM_ALL SYSTEM)
-if(CORVANE_SANITIZE)
-  foreach(library gtest gmock gtest_main gmock_main)
+foreach(library gtest gmock gtest_main gmock_main)
+  target_compile_options(${library} PRIVATE -O0)
+  if(CORVANE_SANITIZE)
     target_compile_options(${library} PRIVATE -fsanitize=${CORVANE_SANITIZE})
-  endforeach()
-endif()
+  endif()
+endforeach()
 include(GoogleTest)
+
+# Tests are compiled to be built soon, not to be fast, and share one precompiled header: most of a
+# test's compile time is GoogleTest's own headers.
+add_library(corvane_test_options INTERFACE)
+target_compile_options(corvane_test_options INTERFACE -O0 $<$<COMPILE_LANGUAGE:CXX>:-fpch-preprocess>)
+target_link_libraries(corvane_test_options INTERFACE corvane_options gmock gtest_main)
+target_compile_definitions(corvane_test_options INTERFACE
+  CORVANE_SOURCE_DIR="${PROJECT_SOURCE_DIR}" CORVANE_BINARY_DIR="${PROJECT_BINARY_DIR}")
+
+file(WRITE ${PROJECT_BINARY_DIR}/test_headers.cpp "int main() {}\n")
+add_executable(corvane_test_headers EXCLUDE_FROM_ALL ${PROJECT_BINARY_DIR}/test_headers.cpp)
+target_link_libraries(corvane_test_headers PRIVATE corvane_test_options)
+target_precompile_headers(corvane_test_headers PRIVATE $<$<COMPILE_LANGUAGE:CXX>:<gmock/gmock.h$<ANGLE-R>>)
 
 # corvane_test(NAME SOURCES file... [LINK target...] [ISOLATED])
 # One executable with GoogleTest's main. ISOLATED runs each test in a process of its own, for what
@@ -16,9 +30,10 @@ include(GoogleTest)
 function(corvane_test name)
   cmake_parse_arguments(ARG "ISOLATED" "" "SOURCES;LINK" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
-  target_link_libraries(${name} PRIVATE corvane_options ${ARG_LINK} gmock gtest_main)
-  target_compile_definitions(${name} PRIVATE
-    CORVANE_SOURCE_DIR="${PROJECT_SOURCE_DIR}" CORVANE_BINARY_DIR="${PROJECT_BINARY_DIR}")
+  target_link_libraries(${name} PRIVATE corvane_test_options ${ARG_LINK})
+  if(NOT ARG_SOURCES MATCHES "\\.c(;|$)")  # the precompiled header is for C++ alone
+    target_precompile_headers(${name} REUSE_FROM corvane_test_headers)
+  endif()
   if(ARG_ISOLATED)
     gtest_discover_tests(${name} TEST_PREFIX ${name}. DISCOVERY_TIMEOUT 60)
   else()

@@ -15,12 +15,17 @@ if(CMAKE_SYSTEM_PROCESSOR MATCHES "^(x86_64|i.86)$")
   # start than the copy takes.
   target_compile_options(corvane_options INTERFACE -mtune=haswell)
 endif()
+# Nothing that is installed knows where it was built, and two builds of one commit are alike.
+target_compile_options(corvane_options INTERFACE
+  -ffile-prefix-map=${PROJECT_BINARY_DIR}/= -ffile-prefix-map=${PROJECT_SOURCE_DIR}/=)
 target_compile_definitions(corvane_options INTERFACE _FILE_OFFSET_BITS=64)
 target_include_directories(corvane_options INTERFACE ${PROJECT_SOURCE_DIR})
 
 if(CORVANE_SANITIZE)
   target_compile_options(corvane_options INTERFACE
-    -fsanitize=${CORVANE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer -g)
+    -fsanitize=${CORVANE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer
+    # Optimizing what the sanitizers add takes most of the compile time, and the tests are small.
+    -O0 -g1)
   target_link_options(corvane_options INTERFACE -fsanitize=${CORVANE_SANITIZE})
 endif()
 
