@@ -1,0 +1,46 @@
+# Debian packages: cpack in a directory of an install preset.
+#   corvane-cpu-provider  libraries, schema, registration; installs beside that of another architecture
+#   corvane-cpu-tools     corvcim
+
+if(CMAKE_SYSTEM_PROCESSOR MATCHES "^(x86_64|i.86)$" AND CMAKE_SIZEOF_VOID_P EQUAL 4)
+  set(CPACK_DEBIAN_PACKAGE_ARCHITECTURE i386)
+elseif(CMAKE_SYSTEM_PROCESSOR STREQUAL x86_64)
+  set(CPACK_DEBIAN_PACKAGE_ARCHITECTURE amd64)
+endif()
+
+set(CPACK_GENERATOR DEB)
+set(CPACK_PACKAGE_NAME corvane-cpu)
+set(CPACK_PACKAGE_VENDOR Corvane)
+set(CPACK_PACKAGE_CONTACT "Corvane maintainers <maintainers@corvane.example>")
+set(CPACK_PACKAGE_DIRECTORY ${PROJECT_BINARY_DIR}/packages)
+set(CPACK_VERBATIM_VARIABLES ON)
+set(CPACK_STRIP_FILES ON)
+# The configuration lies in /etc whatever the prefix is, so files are staged below a root of their own.
+set(CPACK_SET_DESTDIR ON)
+
+set(CPACK_DEB_COMPONENT_INSTALL ON)
+set(CPACK_COMPONENTS_ALL provider tools)
+set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
+set(CPACK_DEBIAN_PACKAGE_SECTION admin)
+# Spelled out, because dpkg-shlibdeps names Debian's 32-bit libraries for 64-bit systems when it
+# looks at a 32-bit build there. scripts/check-packages compares them with what the files need.
+set(CPACK_DEBIAN_PACKAGE_DEPENDS "libc6 (>= 2.34), libgcc-s1 (>= 3.3.1), libstdc++6 (>= 12)")
+
+set(CPACK_DEBIAN_PROVIDER_PACKAGE_NAME corvane-cpu-provider)
+set(CPACK_COMPONENT_PROVIDER_DESCRIPTION "CMPI provider library for CPU inventory
+ Answers WBEM clients' questions about a machine's processors: packages,
+ cores, caches, capabilities, and how they belong together. A CMPI broker
+ such as SFCB or OpenPegasus loads it; corvcpu-register registers it there.")
+set(CPACK_DEBIAN_PROVIDER_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/packaging/debian/conffiles)
+
+set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME corvane-cpu-tools)
+set(CPACK_COMPONENT_TOOLS_DESCRIPTION "command-line host of the CMPI provider library for CPU inventory
+ corvcim loads the provider library as a CIM broker does, answers WBEM
+ queries on the command line and draws the machine. It needs no broker.")
+set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS
+  "${CPACK_DEBIAN_PACKAGE_DEPENDS}, corvane-cpu-provider (= ${PROJECT_VERSION})")
+
+# What CPack does not know: Multi-Arch, compressed manual pages, a reproducible archive.
+set(CPACK_POST_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/packaging/debian/FinishPackages.cmake)
+
+include(CPack)

@@ -1,0 +1,6 @@
+# Run by CPack on the packages that it made: brings them into the form that Debian's policy asks for.
+
+set(finish "${CMAKE_CURRENT_LIST_DIR}/finish-package")
+foreach(package IN LISTS CPACK_PACKAGE_FILES)
+  execute_process(COMMAND "${finish}" "${package}" COMMAND_ERROR_IS_FATAL ANY)
+endforeach()
