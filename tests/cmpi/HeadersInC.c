@@ -5,7 +5,9 @@
 CMPIStatus refuse(const CMPIBroker* broker);
 CMPICount count(const CMPIObjectPath* path);
 
-CMPIStatus refuse(const CMPIBroker* broker) { CMReturnWithChars(broker, CMPI_RC_ERR_NOT_SUPPORTED, "not supported"); }
+CMPIStatus refuse(const CMPIBroker* broker) {
+  CMReturnWithChars(broker, CMPI_RC_ERR_NOT_SUPPORTED, "not supported");
+}
 
 CMPICount count(const CMPIObjectPath* path) {
   CMPIStatus status = {CMPI_RC_OK, NULL};
