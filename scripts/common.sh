@@ -15,6 +15,7 @@ unset "${!CORVANE_@}"
 if [[ -z ${CMAKE_CXX_COMPILER_LAUNCHER:-} ]] && command -v ccache >/dev/null; then
   export CMAKE_CXX_COMPILER_LAUNCHER=ccache
 fi
+export CCACHE_SLOPPINESS=pch_defines,time_macros # what it takes to cache with precompiled headers
 
 # Debian packages, by what they are needed for; docs/dependencies.md says why each is there.
 build_packages=(cmake g++ g++-multilib ninja-build nlohmann-json3-dev)
@@ -35,7 +36,8 @@ usage() { sed -n '2,/^$/{s/^# \{0,1\}//p;}' "$0"; }
 step() {
   local name=$1 log start=$SECONDS
   shift
-  log=$logs/${name//[^A-Za-z0-9]/-}.log
+  log=${name//: /-}
+  log=$logs/${log// /-}.log
   mkdir -p "$logs"
   printf '%-32s ' "$name"
   if "$@" >"$log" 2>&1 </dev/null; then
