@@ -16,11 +16,14 @@ class Object {
  public:
   Object() = default;
   virtual ~Object() = default;
-  Object(const Object&) = delete;
   Object& operator=(const Object&) = delete;
 
   [[nodiscard]] Arena& arena() const { return *arena_; }
   [[nodiscard]] Broker& broker() const;
+
+ protected:
+  // A copy is in no arena yet.
+  Object(const Object& /*other*/) {}
 
  private:
   friend class Arena;

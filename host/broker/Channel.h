@@ -22,6 +22,8 @@ class Channel {
 
   explicit Channel(int descriptor) : descriptor_(descriptor) {}
   ~Channel();
+  Channel(const Channel&) = delete;
+  Channel& operator=(const Channel&) = delete;
   Channel(Channel&& other) noexcept : descriptor_(std::exchange(other.descriptor_, -1)) {}
   Channel& operator=(Channel&& other) noexcept;
 

@@ -12,7 +12,7 @@ namespace {
 template <class T>
 T read(const void* source) {
   T value;
-  std::memcpy(&value, source, sizeof value);
+  std::memcpy(&value, source, sizeof(T));
   return value;
 }
 

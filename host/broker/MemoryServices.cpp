@@ -1,10 +1,11 @@
 // Memory of the request: what a provider does not free itself goes with its request.
 
+#include <algorithm>
 #include <cstddef>
-#include <cstdint>
-#include <cstdlib>
 #include <cstring>
+#include <exception>
 #include <limits>
+#include <vector>
 
 #include "host/broker/BrokerTables.h"
 #include "host/broker/Call.h"
@@ -14,7 +15,7 @@ namespace {
 
 class Block;
 
-// Stands right before the memory that the provider sees.
+// Stands right before the memory that the provider sees, and is the unit that memory is counted in.
 struct alignas(std::max_align_t) BlockHeader {
   Block* block;
   std::size_t size;
@@ -22,35 +23,25 @@ struct alignas(std::max_align_t) BlockHeader {
 
 class Block : public Object {
  public:
-  explicit Block(std::size_t size) : header_(static_cast<BlockHeader*>(std::calloc(1, sizeof(BlockHeader) + size))) {
-    if (header_ != nullptr) {
-      *header_ = {this, size};
-    }
-  }
-  ~Block() override { std::free(header_); }
+  explicit Block(std::size_t size) : storage_(1 + size / sizeof(BlockHeader) + 1) { storage_.front() = {this, size}; }
 
   static Block* of(void* memory) { return (static_cast<BlockHeader*>(memory) - 1)->block; }
 
-  [[nodiscard]] void* memory() const { return header_ != nullptr ? header_ + 1 : nullptr; }
-  [[nodiscard]] std::size_t size() const { return header_->size; }
+  [[nodiscard]] void* memory() { return storage_.data() + 1; }
+  [[nodiscard]] std::size_t size() const { return storage_.front().size; }
 
  private:
-  BlockHeader* header_;
+  std::vector<BlockHeader> storage_;  // all zero behind the header
 };
 
 class Mark : public Object {};
 
 void* allocate(Broker& broker, std::size_t size) {
-  if (size > static_cast<std::size_t>(std::numeric_limits<std::ptrdiff_t>::max()) - sizeof(BlockHeader)) {
+  try {
+    return broker.currentArena().make<Block>(size)->memory();
+  } catch (const std::exception&) {  // too much, or more than there is
     return nullptr;
   }
-  Arena& arena = broker.currentArena();
-  Block* block = arena.make<Block>(size);
-  if (block->memory() == nullptr) {
-    arena.free(block);
-    return nullptr;
-  }
-  return block->memory();
 }
 
 CMPIGcStat* mark(const CMPIBroker* handle, CMPIStatus* status) {

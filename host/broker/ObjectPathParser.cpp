@@ -112,7 +112,7 @@ class Parser {
     const std::size_t end = std::min(text_.find(',', position_), text_.size());
     const std::string_view word = text_.substr(position_, end - position_);
     position_ = end;
-    if (type == CMPI_string || type == CMPI_ref) {
+    if (const CMPIType known = type.value_or(CMPI_null); known == CMPI_string || known == CMPI_ref) {
       failAt(start, "this key's value is a text and must stand in double quotes");
     }
     if (type.value_or(CMPI_boolean) == CMPI_boolean && (sameName(word, "TRUE") || sameName(word, "FALSE"))) {

@@ -144,27 +144,26 @@ struct ObjectKind {
   std::string (*text)(const void* handle);  // of its content; nullptr: its name is all there is to say
 };
 
-const ObjectKind objectKinds[] = {
-    {&stringOperations, "CMPIString",
-     [](const void* handle) { return static_cast<const StringObject*>(handle)->text; }},
-    {&objectPathOperations, "CMPIObjectPath",
-     [](const void* handle) { return static_cast<const ObjectPathObject*>(handle)->path.text(); }},
-    {&instanceOperations, "CMPIInstance",
-     [](const void* handle) { return static_cast<const InstanceObject*>(handle)->complete().text(); }},
-    {&arrayOperations, "CMPIArray",
-     [](const void* handle) {
-       const auto* array = static_cast<const ArrayObject*>(handle);
-       return Value::array(array->elementType, array->elements).text();
-     }},
-    {&dateTimeOperations, "CMPIDateTime",
-     [](const void* handle) { return static_cast<const DateTimeObject*>(handle)->value.text(); }},
-    {&enumerationOperations, "CMPIEnumeration", nullptr},
-    {&contextOperations, "CMPIContext", nullptr},
-    {&argsOperations, "CMPIArgs", nullptr},
-    {&resultOperations, "CMPIResult", nullptr},
-};
-
 const ObjectKind* kindOf(const void* object) {
+  static const ObjectKind objectKinds[] = {
+      {&stringOperations, "CMPIString",
+       [](const void* handle) { return static_cast<const StringObject*>(handle)->text; }},
+      {&objectPathOperations, "CMPIObjectPath",
+       [](const void* handle) { return static_cast<const ObjectPathObject*>(handle)->path.text(); }},
+      {&instanceOperations, "CMPIInstance",
+       [](const void* handle) { return static_cast<const InstanceObject*>(handle)->complete().text(); }},
+      {&arrayOperations, "CMPIArray",
+       [](const void* handle) {
+         const auto* array = static_cast<const ArrayObject*>(handle);
+         return Value::array(array->elementType, array->elements).text();
+       }},
+      {&dateTimeOperations, "CMPIDateTime",
+       [](const void* handle) { return static_cast<const DateTimeObject*>(handle)->value.text(); }},
+      {&enumerationOperations, "CMPIEnumeration", nullptr},
+      {&contextOperations, "CMPIContext", nullptr},
+      {&argsOperations, "CMPIArgs", nullptr},
+      {&resultOperations, "CMPIResult", nullptr},
+  };
   const auto* record = static_cast<const AnyRecord*>(object);
   for (const ObjectKind& each : objectKinds) {
     if (record != nullptr && record->hdl != nullptr && each.table == record->ft) {
@@ -237,8 +236,8 @@ CMPIString* getMessage(const CMPIBroker* handle, const char* id, const char* def
   return defaultMessage(handle, id, defaultText, status);
 }
 
-CMPIString* getMessage2(const CMPIBroker* handle, const char* id, const CMPIMsgFileHandle /*file*/,
-                        const char* defaultText, CMPIStatus* status, CMPICount /*count*/, ...) {
+CMPIString* getMessage2(const CMPIBroker* handle, const char* id, CMPIMsgFileHandle /*file*/, const char* defaultText,
+                        CMPIStatus* status, CMPICount /*count*/, ...) {
   return defaultMessage(handle, id, defaultText, status);
 }
 
@@ -285,7 +284,7 @@ CMPIStatus openMessageFile(const CMPIBroker* handle, const char* file, CMPIMsgFi
       .refuse(CMPI_RC_ERR_NOT_SUPPORTED, "this broker has no message files");
 }
 
-CMPIStatus closeMessageFile(const CMPIBroker* handle, const CMPIMsgFileHandle /*file*/) {
+CMPIStatus closeMessageFile(const CMPIBroker* handle, CMPIMsgFileHandle /*file*/) {
   Broker* broker = Broker::of(handle);
   if (broker == nullptr) {
     return invalidHandle();

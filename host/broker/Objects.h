@@ -35,6 +35,9 @@ class Encapsulated : public Object {
  public:
   using Record = RecordType;
 
+  ~Encapsulated() override = default;
+  Encapsulated& operator=(const Encapsulated&) = delete;
+
   // NULL for a NULL record and for one without a handle.
   static Derived* of(const Record* record) {
     auto* const part = record == nullptr ? nullptr : static_cast<Encapsulated*>(const_cast<void*>(record->hdl));
@@ -47,6 +50,9 @@ class Encapsulated : public Object {
   template <class Table>
   explicit Encapsulated(const Table& table) : record_{this, &table} {}
 
+  // A copy has a handle of its own.
+  Encapsulated(const Encapsulated& other) : Object(other), record_{static_cast<Derived*>(this), other.record_.ft} {}
+
  private:
   Record record_;
 };
@@ -54,7 +60,6 @@ class Encapsulated : public Object {
 class StringObject : public Encapsulated<CMPIString, StringObject> {
  public:
   explicit StringObject(std::string value) : Encapsulated(stringOperations), text(std::move(value)) {}
-  StringObject(const StringObject& other) : StringObject(other.text) {}
 
   const std::string text;
 };
@@ -63,7 +68,6 @@ class ArrayObject : public Encapsulated<CMPIArray, ArrayObject> {
  public:
   ArrayObject(CMPIType type, std::vector<Value> values)
       : Encapsulated(arrayOperations), elementType(type), elements(std::move(values)) {}
-  ArrayObject(const ArrayObject& other) : ArrayObject(other.elementType, other.elements) {}
 
   const CMPIType elementType;
   std::vector<Value> elements;
@@ -72,7 +76,6 @@ class ArrayObject : public Encapsulated<CMPIArray, ArrayObject> {
 class ObjectPathObject : public Encapsulated<CMPIObjectPath, ObjectPathObject> {
  public:
   explicit ObjectPathObject(ObjectPath value) : Encapsulated(objectPathOperations), path(std::move(value)) {}
-  ObjectPathObject(const ObjectPathObject& other) : ObjectPathObject(other.path) {}
 
   ObjectPath path;
 };
@@ -80,10 +83,6 @@ class ObjectPathObject : public Encapsulated<CMPIObjectPath, ObjectPathObject> {
 class InstanceObject : public Encapsulated<CMPIInstance, InstanceObject> {
  public:
   explicit InstanceObject(Instance contents) : Encapsulated(instanceOperations), value(std::move(contents)) {}
-  InstanceObject(const InstanceObject& other) : InstanceObject(other.value) {
-    filter = other.filter;
-    filterKeys = other.filterKeys;
-  }
 
   // The instance with the path that follows from its properties.
   [[nodiscard]] Instance complete() const { return {instancePath(value.path, value.properties), value.properties}; }
@@ -98,9 +97,6 @@ class EnumerationObject : public Encapsulated<CMPIEnumeration, EnumerationObject
   // Elements are all instances or all references, by `type`.
   EnumerationObject(CMPIType type, std::vector<Value> values)
       : Encapsulated(enumerationOperations), elementType(type), elements(std::move(values)) {}
-  EnumerationObject(const EnumerationObject& other) : EnumerationObject(other.elementType, other.elements) {
-    position = other.position;
-  }
 
   const CMPIType elementType;
   const std::vector<Value> elements;
@@ -111,7 +107,6 @@ class ContextObject : public Encapsulated<CMPIContext, ContextObject> {
  public:
   ContextObject(Request* owner, std::vector<NamedValue> values)
       : Encapsulated(contextOperations), request(owner), entries(std::move(values)) {}
-  ContextObject(const ContextObject& other) : ContextObject(other.request, other.entries) {}
 
   Request* const request;  // whose context it is; a thread that attaches with it works for that request
   std::vector<NamedValue> entries;
@@ -120,7 +115,6 @@ class ContextObject : public Encapsulated<CMPIContext, ContextObject> {
 class ArgsObject : public Encapsulated<CMPIArgs, ArgsObject> {
  public:
   explicit ArgsObject(std::vector<NamedValue> values = {}) : Encapsulated(argsOperations), entries(std::move(values)) {}
-  ArgsObject(const ArgsObject& other) : ArgsObject(other.entries) {}
 
   std::vector<NamedValue> entries;
 };
@@ -135,7 +129,6 @@ class ResultObject : public Encapsulated<CMPIResult, ResultObject> {
 class DateTimeObject : public Encapsulated<CMPIDateTime, DateTimeObject> {
  public:
   explicit DateTimeObject(DateTime moment) : Encapsulated(dateTimeOperations), value(moment) {}
-  DateTimeObject(const DateTimeObject& other) : DateTimeObject(other.value) {}
 
   const DateTime value;
 };

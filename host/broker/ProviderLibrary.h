@@ -28,6 +28,8 @@ class ProviderLibrary {
  public:
   explicit ProviderLibrary(const std::string& file, LoadScope scope = LoadScope::Global);
   ~ProviderLibrary();
+  ProviderLibrary(const ProviderLibrary&) = delete;
+  ProviderLibrary& operator=(const ProviderLibrary&) = delete;
   ProviderLibrary(ProviderLibrary&& other) noexcept;
   ProviderLibrary& operator=(ProviderLibrary&& other) noexcept;
 
