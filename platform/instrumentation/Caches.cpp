@@ -53,16 +53,17 @@ std::optional<unsigned int> unlessZero(std::optional<unsigned int> number) {
 
 class CacheReader {
  public:
-  explicit CacheReader(Machine& machine) : machine_(machine), cpus_(machine.cpus()) {}
+  CacheReader(Machine& machine, const CpuSet& present, const CpuSet& online)
+      : machine_(machine), cpus_(machine.cpus()), present_(present), online_(online) {}
 
-  std::vector<Cache> read(const CpuSet& present, const CpuSet& online) {
-    for (unsigned int cpu = present.first(); cpu != CpuSet::limit; cpu = present.next(cpu)) {
+  std::vector<Cache> read() {
+    for (unsigned int cpu = present_.first(); cpu != CpuSet::limit; cpu = present_.next(cpu)) {
       unsigned int index = 0;
       while (readCache(cpu, index)) {
         ++index;
       }
       // While a CPU is offline most kernels have nothing to say about its caches.
-      if (index == 0 && online.contains(cpu)) {
+      if (index == 0 && online_.contains(cpu)) {
         machine_.noteUnreadOfCpu(cpu, "cache",
                                  "mount sysfs on /sys; "
                                  "some virtual machines have no such directory");
@@ -100,6 +101,7 @@ class CacheReader {
       return true;
     }
     CpuSet cpus = CpuSet::fromList(*sharing).value_or(CpuSet());
+    cpus.keepOnly(present_);
     cpus.add(cpu);
     told.push_back({std::string(*sharing), cpus});
     addCache(cpu, index, std::move(cpus));
@@ -159,6 +161,8 @@ class CacheReader {
 
   Machine& machine_;
   Attributes& cpus_;
+  const CpuSet& present_;
+  const CpuSet& online_;
   std::vector<Cache> caches_;
   std::vector<std::vector<Sharing>> told_;  // by index
   std::vector<Covered> covered_;
@@ -167,7 +171,7 @@ class CacheReader {
 }  // namespace
 
 std::vector<Cache> readCaches(Machine& machine, const CpuSet& present, const CpuSet& online) {
-  return CacheReader(machine).read(present, online);
+  return CacheReader(machine, present, online).read();
 }
 
 }  // namespace Tarn::Inventory

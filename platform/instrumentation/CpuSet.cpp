@@ -101,6 +101,14 @@ void CpuSet::remove(const CpuSet& other) {
   trim();
 }
 
+void CpuSet::keepOnly(const CpuSet& other) {
+  words_.resize(std::min(words_.size(), other.words_.size()));
+  for (std::size_t i = 0; i < words_.size(); ++i) {
+    words_[i] &= other.words_[i];
+  }
+  trim();
+}
+
 bool CpuSet::contains(unsigned int number) const {
   const std::size_t word = number / bits;
   return word < words_.size() && ((words_[word] >> number % bits) & 1U) != 0;

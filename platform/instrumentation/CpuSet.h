@@ -29,6 +29,7 @@ class CpuSet {
   void add(unsigned int number);
   void add(const CpuSet& other);
   void remove(const CpuSet& other);
+  void keepOnly(const CpuSet& other);
 
   bool empty() const { return words_.empty(); }
   bool contains(unsigned int number) const;

@@ -142,16 +142,20 @@ class TopologyReader {
 
   Package& packageOf(const CpuPlace& place) {
     const auto found = std::ranges::find_if(topology_.packages, [&](const Package& package) {
-      return package.id == place.package && (package.id || package.lowestCpu == place.packageCpu);
+      return place.package ? package.id == place.package
+                           : package.cpus.contains(*place.packageCpu) || package.lowestCpu == *place.packageCpu;
     });
     if (found != topology_.packages.end()) {
       return *found;
     }
-    return topology_.packages.emplace_back(Package{place.package, place.packageCpu.value_or(0), {}, {}});
+    const unsigned int none = CpuSet::limit;
+    return topology_.packages.emplace_back(Package{place.package, place.packageCpu.value_or(none), {}, {}});
   }
 
   void addToCore(unsigned int cpu, const CpuPlace& place, Package& package) {
+    // Containers may show fewer CPUs than these lists know.
     CpuSet added = place.siblings.value_or(CpuSet());
+    added.keepOnly(topology_.present);
     added.remove(placed_);
     added.add(cpu);
     package.cpus.add(added);

@@ -199,6 +199,17 @@ TEST(Cache, SharingThatContradictsItselfCountsNoCpuTwice) {
   EXPECT_EQ(nodeAt(tree, "P0.L2@3").cpus, CpuSet{3});
 }
 
+TEST(Cache, CpusThatAreNotPresentDoNotCount) {
+  KernelFiles files;
+  files.cpus("2-3").cpu(2, {.core = 1, .siblings = "2"}).cpu(3, {.core = 2, .siblings = "3"});
+  files.cache(2, 0, {.level = 3, .cpus = "0-3"}).cache(3, 0, {.level = 3, .cpus = "0-3"});
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeCacheMemory), Paths{"P0.L3@2"});
+  EXPECT_EQ(nodeAt(tree, "P0.L3@2").cpus, (CpuSet{2, 3}));
+}
+
 TEST(Cache, SharingThatIsNonsenseLeavesTheCacheToItsCpu) {
   const Tree tree = oneCache({.level = 2, .cpus = "what?"});
   EXPECT_EQ(nodeAt(tree, "P0.L2@0").cpus, CpuSet{0});

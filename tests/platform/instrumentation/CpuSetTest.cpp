@@ -58,6 +58,15 @@ TEST(CpuSet, JoinsAndTakesAway) {
   EXPECT_TRUE(set.empty());
 }
 
+TEST(CpuSet, KeepsOnlyWhatIsCommon) {
+  CpuSet set{1, 2, 70, 200};
+  set.keepOnly(CpuSet{2, 3, 70});
+  EXPECT_EQ(set, (CpuSet{2, 70}));
+
+  set.keepOnly(CpuSet{500});
+  EXPECT_TRUE(set.empty());
+}
+
 TEST(CpuSet, IntersectsWhereANumberIsCommon) {
   EXPECT_TRUE((CpuSet{1, 100}.intersects(CpuSet{100})));
   EXPECT_FALSE((CpuSet{1, 100}.intersects(CpuSet{2})));

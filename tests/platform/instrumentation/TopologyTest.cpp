@@ -219,6 +219,29 @@ TEST(Topology, APackageThatCanNotBeReadNeverMakesAProcessor) {
   EXPECT_EQ(nodeAt(files.tree(), "P3").cpus, (CpuSet{0, 1})) << "unless /proc/cpuinfo tells it";
 }
 
+TEST(Topology, APackageThatCanNotBeReadIsThatOfTheCpusBesideIt) {
+  KernelFiles files;
+  files.cpus("0-1");
+  files.cpu(0, {.package = 3, .core = 0, .siblings = "0"});
+  files.cpu(1, {.package = {}, .core = 1, .siblings = "1", .packageSiblings = "0-1"});
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeProcessor), Paths{"P3"});
+  EXPECT_EQ(pathsOf(tree, NodeProcessorCore), (Paths{"P3.C0", "P3.C1"}));
+}
+
+TEST(Topology, SiblingsThatAreNotPresentDoNotCount) {
+  KernelFiles files;
+  files.cpus("2-3");
+  files.cpu(2, {.package = 0, .core = 1, .siblings = "2,6"}).cpu(3, {.package = 0, .core = 2, .siblings = "3,7"});
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(nodeAt(tree, "P0.C1").cpus, CpuSet{2});
+  EXPECT_EQ(numberAt(tree, "P0", PropHardwareThreads), 2U);
+}
+
 TEST(Topology, CpusAreFoundByTheirDirectoriesWithoutAList) {
   KernelFiles files;
   files.cpu(0, {.package = 0, .core = 0, .siblings = "0"}).cpu(12, {.package = 0, .core = 1, .siblings = "12"});
