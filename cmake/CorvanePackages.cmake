@@ -27,20 +27,14 @@ set(CPACK_DEBIAN_PACKAGE_SECTION admin)
 set(CPACK_DEBIAN_PACKAGE_DEPENDS "libc6 (>= 2.34), libgcc-s1 (>= 3.3.1), libstdc++6 (>= 12)")
 
 set(CPACK_DEBIAN_PROVIDER_PACKAGE_NAME corvane-cpu-provider)
-set(CPACK_COMPONENT_PROVIDER_DESCRIPTION "CMPI provider library for CPU inventory
- Answers WBEM clients' questions about a machine's processors: packages,
- cores, caches, capabilities, and how they belong together. A CMPI broker
- such as SFCB or OpenPegasus loads it; corvcpu-register registers it there.")
 set(CPACK_DEBIAN_PROVIDER_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/packaging/debian/conffiles)
 
 set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME corvane-cpu-tools)
-set(CPACK_COMPONENT_TOOLS_DESCRIPTION "command-line host of the CMPI provider library for CPU inventory
- corvcim loads the provider library as a CIM broker does, answers WBEM
- queries on the command line and draws the machine. It needs no broker.")
 set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS
   "${CPACK_DEBIAN_PACKAGE_DEPENDS}, corvane-cpu-provider (= ${PROJECT_VERSION})")
 
-# What CPack does not know: Multi-Arch, compressed manual pages, a reproducible archive.
+# What CPack does not know: Multi-Arch, a description for each package, compressed manual pages, a
+# reproducible archive.
 set(CPACK_POST_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/packaging/debian/FinishPackages.cmake)
 
 include(CPack)
