@@ -11,10 +11,6 @@
 namespace Corvcim {
 namespace {
 
-bool haveEqualWidths(const std::vector<Box>& boxes) {
-  return std::ranges::all_of(boxes, [&](const Box& box) { return box.width == boxes.front().width; });
-}
-
 int takenWidth(std::span<const Box> row) {
   int width = 0;
   for (const Box& box : row) {
@@ -23,27 +19,35 @@ int takenWidth(std::span<const Box> row) {
   return width;
 }
 
-/// How many of the boxes come into the next row.
-std::size_t rowLength(std::span<const Box> boxes, int maxWidth) {
+std::size_t equalWidths(std::span<const Box> boxes) {
   std::size_t length = 1;
-  while (length < boxes.size() && takenWidth(boxes.first(length + 1)) <= maxWidth) {
+  while (length < boxes.size() && boxes[length].width == boxes.front().width) {
     ++length;
   }
   return length;
 }
 
-std::vector<std::span<Box>> rowsOf(std::vector<Box>& boxes, int maxWidth) {
-  std::vector<std::span<Box>> rows;
-  std::span<Box> rest = boxes;
-  std::size_t columns = 0;
-  if (!boxes.empty() && haveEqualWidths(boxes)) {
-    const int limit = std::max(1, (maxWidth + boxGap) / (boxes.front().width + boxGap));
-    columns = columnsFor(boxes.size(), static_cast<std::size_t>(limit));
+/// As few rows as the limit allows, about equally long.
+std::size_t evenColumns(std::size_t count, std::size_t limit) {
+  const std::size_t rows = (count + limit - 1) / limit;
+  return (count + rows - 1) / rows;
+}
+
+/// Boxes of different widths are different things: one row if that fits, else each kind begins a row.
+std::vector<std::span<Box>> rowsOf(std::span<Box> boxes, int maxWidth) {
+  const bool isMixed = !boxes.empty() && equalWidths(boxes) < boxes.size();
+  if (isMixed && takenWidth(boxes) <= maxWidth) {
+    return {boxes};
   }
-  while (!rest.empty()) {
-    const std::size_t length = columns == 0 ? rowLength(rest, maxWidth) : std::min(columns, rest.size());
-    rows.push_back(rest.first(length));
-    rest = rest.subspan(length);
+  std::vector<std::span<Box>> rows;
+  while (!boxes.empty()) {
+    const std::size_t equal = equalWidths(boxes);
+    const auto limit = static_cast<std::size_t>(std::max(1, (maxWidth + boxGap) / (boxes.front().width + boxGap)));
+    const std::size_t columns = isMixed ? evenColumns(equal, limit) : columnsFor(equal, limit);
+    for (std::size_t first = 0; first < equal; first += columns) {
+      rows.push_back(boxes.subspan(first, std::min(columns, equal - first)));
+    }
+    boxes = boxes.subspan(equal);
   }
   return rows;
 }
