@@ -1,8 +1,8 @@
 #include "host/cli/Commands.h"
 
-#include <stdlib.h>  // setenv
-
 #include <tarn/Common.h>
+
+#include <cstdlib>
 
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"

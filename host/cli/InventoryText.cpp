@@ -65,7 +65,7 @@ std::string nodeText(const Tree& tree, const Node& node) {
     width = std::max(width, columns(name));
   }
   for (const auto& [name, value] : rows) {
-    text += indent + "    " + padRight(name, width) + "  " + value + '\n';
+    text.append(indent).append("    ").append(padRight(name, width)).append("  ").append(value).append("\n");
   }
   return text;
 }

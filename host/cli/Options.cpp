@@ -7,8 +7,6 @@
 namespace Corvcim {
 namespace {
 
-using std::string_view_literals::operator""sv;
-
 std::string quoted(std::string_view text) {
   return "'" + std::string(text) + "'";
 }
@@ -108,7 +106,7 @@ std::vector<std::string> splitAtCommas(std::string_view list) {
     if (!name.empty()) {
       names.emplace_back(name);
     }
-    list = comma == std::string_view::npos ? ""sv : list.substr(comma + 1);
+    list = comma == std::string_view::npos ? std::string_view() : list.substr(comma + 1);
   }
   return names;
 }
