@@ -50,8 +50,8 @@ class LiveReader {
       addCores(package, path);
       addCaches(package, path);
     }
-    for (Unread& entry : machine_.unread().entries()) {
-      tree_.unread(std::move(entry));
+    for (const Unread& entry : machine_.unread().entries()) {
+      tree_.unread(entry);
     }
     return tree_.build();
   }

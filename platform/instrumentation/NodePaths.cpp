@@ -19,11 +19,13 @@ struct Choice {
 
 std::vector<std::string> choose(std::vector<Choice> choices) {
   std::vector<std::string> taken;
+  taken.reserve(choices.size());
   for (const Choice& choice : choices) {
     taken.push_back(choice.preferred);
   }
   std::ranges::sort(taken);
   std::vector<std::string> paths;
+  paths.reserve(choices.size());
   for (Choice& choice : choices) {
     const auto [first, last] = std::equal_range(taken.begin(), taken.end(), choice.preferred);
     const bool good = !choice.preferred.empty() && choice.preferred.size() <= longestPath && last - first == 1;

@@ -14,7 +14,7 @@ using Inventory::TreeBuilder;
 
 class Cursor : public testing::Test {
  protected:
-  Cursor() {
+  void SetUp() override {
     Inventory::setProcessTree(std::make_shared<const Inventory::Tree>(TreeBuilder()
                                                                           .system("system")
                                                                           .text(PropSystemModel, "PowerBox 300")
@@ -35,11 +35,7 @@ class Cursor : public testing::Test {
                                                                           .cache("P1.L2.0")
                                                                           .build()));
   }
-  ~Cursor() override { Inventory::setProcessTree(nullptr); }
-  Cursor(const Cursor&) = delete;
-  Cursor(Cursor&&) = delete;
-  Cursor& operator=(const Cursor&) = delete;
-  Cursor& operator=(Cursor&&) = delete;
+  void TearDown() override { Inventory::setProcessTree(nullptr); }
 
   /// The printable paths from here to the end.
   static std::vector<std::string> rest(Instrumentation& cursor) {
