@@ -89,9 +89,11 @@ class Tree {
   std::span<const ListProperty> lists(const Node& node) const { return stretch(lists_, node.lists); }
 
   /// One property; nullptr where the node has none of that number and kind.
-  const unsigned int* number(const Node& node, NodeLexicon::Properties id) const;
-  const std::string* text(const Node& node, NodeLexicon::Properties id) const;
-  const std::vector<unsigned int>* list(const Node& node, NodeLexicon::Properties id) const;
+  const unsigned int* number(const Node& node, NodeLexicon::Properties id) const { return lookUp(numbers(node), id); }
+  const std::string* text(const Node& node, NodeLexicon::Properties id) const { return lookUp(texts(node), id); }
+  const std::vector<unsigned int>* list(const Node& node, NodeLexicon::Properties id) const {
+    return lookUp(lists(node), id);
+  }
 
   std::span<const Unread> unread() const { return unread_; }
 
@@ -106,6 +108,17 @@ class Tree {
   template <class Value>
   static std::span<const Value> stretch(const std::vector<Value>& table, PropertyRange range) {
     return std::span(table).subspan(range.begin, range.end - range.begin);
+  }
+
+  // A node has a dozen properties at most, side by side: walking them beats searching.
+  template <class Value>
+  static const Value* lookUp(std::span<const Property<Value>> properties, NodeLexicon::Properties id) {
+    for (const Property<Value>& property : properties) {
+      if (property.id == id) {
+        return &property.value;
+      }
+    }
+    return nullptr;
   }
 
   std::vector<Node> nodes_;
