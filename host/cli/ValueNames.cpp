@@ -57,9 +57,20 @@ constexpr Code operationalStatuses[] = {{0, "Unknown"},
                                         {17, "Completed"},
                                         {18, "Power Mode"}};
 
-constexpr Code cpuStatuses[] = {
-    {0, "Unknown"},     {1, "CPU Enabled"}, {2, "CPU Disabled by User"}, {3, "CPU Disabled by BIOS"},
-    {4, "CPU Is Idle"}, {7, "Other"}};
+// The inventory's own numbers, as the library passes them on; not those of CIM_Processor.
+constexpr Code cpuStatuses[] = {{1, "In Use"},
+                                {2, "Starting"},
+                                {3, "Stopping"},
+                                {8, "Dormant"},
+                                {10, "Stopped"},
+                                {12, "Offline"},
+                                {13, "Lost Communication"},
+                                {15, "Empty Socket"},
+                                {16, "Disabled"},
+                                {17, "No Contact"},
+                                {20, "Predictive Failure"},
+                                {21, "Degraded"},
+                                {24, "Failed"}};
 
 constexpr Code coreEnabledStates[] = {{0, "Unknown"},
                                       {2, "Core Enabled"},

@@ -76,7 +76,7 @@ TEST(Corvcim, EnumeratesInstances) {
                     "  CurrentClockSpeed        2000 MHz\n"
                     "  MaxClockSpeed            2300 MHz\n"
                     "  ExternalBusClockSpeed    3600 MHz\n"
-                    "  CPUStatus                1 (CPU Enabled)\n"
+                    "  CPUStatus                1 (In Use)\n"
                     "  Status                   OK\n"
                     "  HealthState              5 (OK)\n"
                     "  OperationalStatus        2 (OK)\n"
