@@ -8,7 +8,7 @@ namespace {
 using namespace Tarn::NodeLexicon;
 using Tarn::Inventory::TreeBuilder;
 
-void addCache(TreeBuilder& builder, const CacheKind& kind, unsigned int processor, unsigned int core) {
+void addCache(TreeBuilder& builder, const CacheKind& kind, std::size_t processor, std::size_t core) {
   builder.cache(cachePath(processor, kind, core))
       .description(kind.description)
       .number(PropCacheAssociativity, kind.associativity)
@@ -21,7 +21,8 @@ void addCache(TreeBuilder& builder, const CacheKind& kind, unsigned int processo
       .text(PropCacheName, kind.name);
 }
 
-void addProcessor(TreeBuilder& builder, unsigned int processor, unsigned int cores) {
+void addProcessor(TreeBuilder& builder, std::size_t processor, std::size_t coresEach) {
+  const auto cores = static_cast<unsigned int>(coresEach);
   builder.processor(processorPath(processor))
       .description("Processor in socket " + std::to_string(processor))
       .number(PropDataWidth, 64)
@@ -40,31 +41,31 @@ void addProcessor(TreeBuilder& builder, unsigned int processor, unsigned int cor
       .list(PropRequestedStatesSupported, {1});
 }
 
-std::string path(unsigned int processor, const std::string& part) {
+std::string path(std::size_t processor, const std::string& part) {
   std::string result = processorPath(processor);
   return part.empty() ? result : result += "." + part;
 }
 
 }  // namespace
 
-std::string processorPath(unsigned int processor) {
+std::string processorPath(std::size_t processor) {
   return "P" + std::to_string(processor);
 }
 
-std::string corePath(unsigned int processor, unsigned int core) {
+std::string corePath(std::size_t processor, std::size_t core) {
   return path(processor, "C" + std::to_string(core));
 }
 
-std::string cachePath(unsigned int processor, const CacheKind& kind, unsigned int core) {
+std::string cachePath(std::size_t processor, const CacheKind& kind, std::size_t core) {
   return path(processor, std::string(kind.name) + "." + std::to_string(core));
 }
 
 Tarn::Inventory::Tree makeMachine(const MachineSize& size) {
   TreeBuilder builder;
   builder.system().text(PropSystemModel, "PowerBox 9000");
-  for (unsigned int processor = 0; processor < size.processors; ++processor) {
+  for (std::size_t processor = 0; processor < size.processors; ++processor) {
     addProcessor(builder, processor, size.coresEach);
-    for (unsigned int core = 0; core < size.coresEach; ++core) {
+    for (std::size_t core = 0; core < size.coresEach; ++core) {
       builder.core(corePath(processor, core)).description("Core " + std::to_string(core));
       for (const CacheKind& kind : coreCaches) {
         addCache(builder, kind, processor, core);

@@ -1,6 +1,7 @@
 #ifndef CORVANE_BENCH_MACHINES_H
 #define CORVANE_BENCH_MACHINES_H
 
+#include <cstddef>
 #include <string>
 
 #include "platform/instrumentation/Tree.h"
@@ -29,21 +30,21 @@ inline constexpr CacheKind coreCaches[] = {
 /// What a machine has of each kind: `processors` packages, and in each `coresEach` cores, a private L2
 /// and two L1 caches for every core, and one L3 for all of them.
 struct MachineSize {
-  unsigned int processors;
-  unsigned int coresEach;
+  std::size_t processors;
+  std::size_t coresEach;
 
-  constexpr unsigned int cores() const { return processors * coresEach; }
-  constexpr unsigned int cachesEach() const { return 1 + 3 * coresEach; }
-  constexpr unsigned int caches() const { return processors * cachesEach(); }
+  constexpr std::size_t cores() const { return processors * coresEach; }
+  constexpr std::size_t cachesEach() const { return 1 + 3 * coresEach; }
+  constexpr std::size_t caches() const { return processors * cachesEach(); }
 };
 
 /// The inventory of such a machine, with every property that a real one has.
 Tarn::Inventory::Tree makeMachine(const MachineSize& size);
 
 /// The paths of a part, by its numbers.
-std::string processorPath(unsigned int processor);
-std::string corePath(unsigned int processor, unsigned int core);
-std::string cachePath(unsigned int processor, const CacheKind& kind, unsigned int core);
+std::string processorPath(std::size_t processor);
+std::string corePath(std::size_t processor, std::size_t core);
+std::string cachePath(std::size_t processor, const CacheKind& kind, std::size_t core);
 
 }  // namespace Corvane::Bench
 

@@ -23,6 +23,7 @@ struct Object {
   Object() = default;
   Object(const Object&) = delete;  // its members point into it
   Object& operator=(const Object&) = delete;
+  ~Object() = default;
 
   CMPIObjectPath path{this, &pathTable};
   CMPIInstance instance{this, &instanceTable};
@@ -76,7 +77,6 @@ const char* getCharPtr(const CMPIString* string, CMPIStatus* /*rc*/) {
 const CMPIStringFT stringTable = {CMPI_VERSION, nullptr, nullptr, getCharPtr};
 
 CMPIString nameSpace{"root/cimv2", &stringTable};
-CMPIString anyString{"", &stringTable};
 
 // Object paths.
 
@@ -259,9 +259,11 @@ CMPIArray* newArray(const CMPIBroker* /*broker*/, CMPICount /*size*/, CMPIType /
   return &anyArray;
 }
 
-CMPIString* newString(const CMPIBroker* /*broker*/, const char* /*text*/, CMPIStatus* /*rc*/) {
+CMPIString* newString(const CMPIBroker* /*broker*/, const char* text, CMPIStatus* /*rc*/) {
   ++counts[NewString];
-  return &anyString;
+  Object& object = pool.next();
+  object.remember(text);
+  return &object.key;
 }
 
 const CMPIBrokerEncFT encapsulationTable = [] {

@@ -10,8 +10,8 @@
 /// A CMPI broker that costs next to nothing: each service counts its call and returns an object that
 /// was there before. What a provider operation takes here is the provider's own time.
 ///
-/// A path remembers its class and its identifying key ("DeviceID" or "InstanceID"), because association
-/// providers read them back; nothing else is kept. Not for more than one thread.
+/// A path remembers its class and its identifying key ("DeviceID" or "InstanceID"), and a new string its
+/// text, because association providers read them back; nothing else is kept. Not for more than one thread.
 namespace Corvane::Bench::NullBroker {
 
 enum Service : std::size_t {

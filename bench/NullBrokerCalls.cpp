@@ -36,7 +36,7 @@ void repeat(const Calls& calls) {
   times(calls[NewObjectPath], [&] { mb->eft->newObjectPath(mb, "root/cimv2", "HALDA_CPUProcessor", &rc); });
   times(calls[NewInstance], [&] { mb->eft->newInstance(mb, path, &rc); });
   times(calls[NewArray], [&] { mb->eft->newArray(mb, 1, CMPI_uint16, &rc); });
-  times(calls[NewString], [&] { mb->eft->newString(mb, text, &rc); });
+  times(calls[NewString], [&] { mb->eft->newString(mb, identifier, &rc); });
   times(calls[GetNameSpace], [&] { path->ft->getNameSpace(path, &rc); });
   times(calls[SetNameSpace], [&] { path->ft->setNameSpace(path, "root/cimv2"); });
   times(calls[SetHostname], [&] { path->ft->setHostname(path, text); });

@@ -81,7 +81,7 @@ void fillTimes(std::size_t times, Fill fillAll) {
 
 void fillProcessors(const MachineSize& machine, std::size_t times) {
   fillTimes<Processor>(times, [&](std::vector<Processor>& records) {
-    for (unsigned int i = 0; i < machine.processors; ++i) {
+    for (std::size_t i = 0; i < machine.processors; ++i) {
       fill(records.emplace_back());
     }
   });
@@ -89,7 +89,7 @@ void fillProcessors(const MachineSize& machine, std::size_t times) {
 
 void fillCores(const MachineSize& machine, std::size_t times) {
   fillTimes<ProcessorCore>(times, [&](std::vector<ProcessorCore>& records) {
-    for (unsigned int i = 0; i < machine.cores(); ++i) {
+    for (std::size_t i = 0; i < machine.cores(); ++i) {
       fill(records.emplace_back());
     }
   });
@@ -97,12 +97,12 @@ void fillCores(const MachineSize& machine, std::size_t times) {
 
 void fillCaches(const MachineSize& machine, std::size_t times) {
   fillTimes<Memory>(times, [&](std::vector<Memory>& records) {
-    for (unsigned int i = 0; i < machine.cores(); ++i) {
+    for (std::size_t i = 0; i < machine.cores(); ++i) {
       for (const CacheKind& kind : coreCaches) {
         fill(records.emplace_back(), kind);
       }
     }
-    for (unsigned int i = 0; i < machine.processors; ++i) {
+    for (std::size_t i = 0; i < machine.processors; ++i) {
       fill(records.emplace_back(), sharedCache);
     }
   });
