@@ -141,24 +141,28 @@ struct AnyRecord {
 struct ObjectKind {
   const void* table;
   const char* name;
-  std::string (*text)(const void* handle);  // of its content; nullptr: its name is all there is to say
+  std::string (*text)(const void* object);  // of its content; nullptr: its name is all there is to say
 };
 
 const ObjectKind* kindOf(const void* object) {
   static const ObjectKind objectKinds[] = {
       {&stringOperations, "CMPIString",
-       [](const void* handle) { return static_cast<const StringObject*>(handle)->text; }},
+       [](const void* object) { return StringObject::of(static_cast<const CMPIString*>(object))->text; }},
       {&objectPathOperations, "CMPIObjectPath",
-       [](const void* handle) { return static_cast<const ObjectPathObject*>(handle)->path.text(); }},
+       [](const void* object) {
+         return ObjectPathObject::of(static_cast<const CMPIObjectPath*>(object))->path.text();
+       }},
       {&instanceOperations, "CMPIInstance",
-       [](const void* handle) { return static_cast<const InstanceObject*>(handle)->complete().text(); }},
+       [](const void* object) {
+         return InstanceObject::of(static_cast<const CMPIInstance*>(object))->complete().text();
+       }},
       {&arrayOperations, "CMPIArray",
-       [](const void* handle) {
-         const auto* array = static_cast<const ArrayObject*>(handle);
+       [](const void* object) {
+         const auto* array = ArrayObject::of(static_cast<const CMPIArray*>(object));
          return Value::array(array->elementType, array->elements).text();
        }},
       {&dateTimeOperations, "CMPIDateTime",
-       [](const void* handle) { return static_cast<const DateTimeObject*>(handle)->value.text(); }},
+       [](const void* object) { return DateTimeObject::of(static_cast<const CMPIDateTime*>(object))->value.text(); }},
       {&enumerationOperations, "CMPIEnumeration", nullptr},
       {&contextOperations, "CMPIContext", nullptr},
       {&argsOperations, "CMPIArgs", nullptr},
@@ -184,8 +188,7 @@ CMPIString* toString(const CMPIBroker* handle, const void* object, CMPIStatus* s
   if (kind == nullptr) {
     return call.refuse(status, CMPI_RC_ERR_INVALID_PARAMETER, "toString: this is no object of this broker");
   }
-  const void* objectHandle = static_cast<const AnyRecord*>(object)->hdl;
-  return call.object<StringObject>(status, kind->text != nullptr ? kind->text(objectHandle) : kind->name);
+  return call.object<StringObject>(status, kind->text != nullptr ? kind->text(object) : kind->name);
 }
 
 CMPIBoolean isOfType(const CMPIBroker* handle, const void* object, const char* type, CMPIStatus* status) {

@@ -51,7 +51,7 @@ class Encapsulated : public Object {
   explicit Encapsulated(const Table& table) : record_{this, &table} {}
 
   // A copy has a handle of its own.
-  Encapsulated(const Encapsulated& other) : Object(other), record_{static_cast<Derived*>(this), other.record_.ft} {}
+  Encapsulated(const Encapsulated& other) : Object(other), record_{this, other.record_.ft} {}
 
  private:
   Record record_;
