@@ -147,22 +147,18 @@ struct ObjectKind {
 const ObjectKind* kindOf(const void* object) {
   static const ObjectKind objectKinds[] = {
       {&stringOperations, "CMPIString",
-       [](const void* object) { return StringObject::of(static_cast<const CMPIString*>(object))->text; }},
+       [](const void* any) { return StringObject::of(static_cast<const CMPIString*>(any))->text; }},
       {&objectPathOperations, "CMPIObjectPath",
-       [](const void* object) {
-         return ObjectPathObject::of(static_cast<const CMPIObjectPath*>(object))->path.text();
-       }},
+       [](const void* any) { return ObjectPathObject::of(static_cast<const CMPIObjectPath*>(any))->path.text(); }},
       {&instanceOperations, "CMPIInstance",
-       [](const void* object) {
-         return InstanceObject::of(static_cast<const CMPIInstance*>(object))->complete().text();
-       }},
+       [](const void* any) { return InstanceObject::of(static_cast<const CMPIInstance*>(any))->complete().text(); }},
       {&arrayOperations, "CMPIArray",
-       [](const void* object) {
-         const auto* array = ArrayObject::of(static_cast<const CMPIArray*>(object));
+       [](const void* any) {
+         const auto* array = ArrayObject::of(static_cast<const CMPIArray*>(any));
          return Value::array(array->elementType, array->elements).text();
        }},
       {&dateTimeOperations, "CMPIDateTime",
-       [](const void* object) { return DateTimeObject::of(static_cast<const CMPIDateTime*>(object))->value.text(); }},
+       [](const void* any) { return DateTimeObject::of(static_cast<const CMPIDateTime*>(any))->value.text(); }},
       {&enumerationOperations, "CMPIEnumeration", nullptr},
       {&contextOperations, "CMPIContext", nullptr},
       {&argsOperations, "CMPIArgs", nullptr},
