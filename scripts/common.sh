@@ -20,7 +20,8 @@ export CCACHE_SLOPPINESS=pch_defines,time_macros # what it takes to cache with p
 # Debian packages, by what they are needed for; docs/dependencies.md says why each is there.
 build_packages=(cmake g++ g++-multilib ninja-build nlohmann-json3-dev)
 test_packages=(googletest)
-check_packages=(clang-format clang-tidy)
+check_packages=(clang-format)
+tidy_packages=(clang-tidy)
 bench_packages=(dpkg-dev)
 
 die() {
