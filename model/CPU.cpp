@@ -28,9 +28,14 @@ class RecordFiller {
       : node_(node), record_(record), function_(function) {}
 
   template <class Value>
-  void set(bool (Record::*setter)(Value), Value value, const char* failure,
+  void set(bool (Record::*setter)(Value), Value&& value, const char* failure,
            unsigned int line = __builtin_LINE()) const {
     report((record_.*setter)(std::move(value)), failure, line, function_);
+  }
+
+  void set(bool (Record::*setter)(unsigned int), const unsigned int& code, const char* failure,
+           unsigned int line = __builtin_LINE()) const {
+    report((record_.*setter)(code), failure, line, function_);
   }
 
   template <class Value>
@@ -40,7 +45,7 @@ class RecordFiller {
     if (!node_.getProperty(property, value)) {
       return false;
     }
-    set<Value>(setter, std::move(value), failure, line);
+    set(setter, std::move(value), failure, line);
     return true;
   }
 
@@ -128,11 +133,10 @@ void setRequestedStatesSupported(const Instrumentation& node, Processor& process
   }
 }
 
-Processor readProcessor(const Instrumentation& node, const char* function) {
-  Processor processor;
+void readProcessor(const Instrumentation& node, Processor& processor, const char* function) {
   const RecordFiller<Processor> fill(node, processor, function);
   const std::string path = printablePath(node);
-  fill.set(&Processor::setProcessorDeviceID, path, "Failed while setting Device ID");
+  fill.set(&Processor::setProcessorDeviceID, std::string(path), "Failed while setting Device ID");
   fill.set(&Processor::setInstanceId, "NERITH:" + path, "Failed while setting Instance Id");
   setFamilyAndName(node, processor, checkIfVirtual(), function);
   fill.copy(PropCurrentClockSpeed, &Processor::setCurrentClockSpeed, "Failed while setting Current Clock Speed");
@@ -154,11 +158,9 @@ Processor readProcessor(const Instrumentation& node, const char* function) {
                  "Failed while setting Number of Enabled Processor cores");
   fill.copyCount(PropHardwareThreads, &Processor::setNumberOfHardwareThreads,
                  "Failed while setting Number of Hardware Threads");
-  return processor;
 }
 
-Memory readMemory(const Instrumentation& node, const char* function) {
-  Memory memory;
+void readMemory(const Instrumentation& node, Memory& memory, const char* function) {
   const RecordFiller<Memory> fill(node, memory, function);
   fill.set(&Memory::setMemoryDeviceID, printablePath(node), "Failed while setting Memory Device ID");
   fill.copy(PropCacheBlockSize, &Memory::setBlockSize, "Failed while setting Cache Block size");
@@ -181,11 +183,9 @@ Memory readMemory(const Instrumentation& node, const char* function) {
   fill.copy(PropCacheWritePolicy, &Memory::setCacheWritePolicy, "Failed while setting Cache Write Policy");
   fill.copy(PropCacheLevel, &Memory::setCacheLevel, "Failed while setting Cache Level");
   fill.copy(PropCacheName, &Memory::setCacheName, "Failed while setting Cache Name");
-  return memory;
 }
 
-ProcessorCore readCore(const Instrumentation& node, const char* function) {
-  ProcessorCore core;
+void readCore(const Instrumentation& node, ProcessorCore& core, const char* function) {
   const RecordFiller<ProcessorCore> fill(node, core, function);
   fill.set(&ProcessorCore::setInstanceID, printablePath(node), "Failed while setting Instance Id");
   fill.set(&ProcessorCore::setElementName, node.getNodeDescription(),
@@ -194,14 +194,26 @@ ProcessorCore readCore(const Instrumentation& node, const char* function) {
   const unsigned int status = node.getNodeStatus();
   if (status == statusUnknown) {
     core.setRequestedState(0);
-    return core;
+    return;
   }
   fill.set(&ProcessorCore::setCoreEnabledState, status, "Failed while setting Core enabled state");
   fill.set(&ProcessorCore::setEnabledState, status, "Failed while setting CPU Enabled State");
   fill.set(&ProcessorCore::setOperationalStatus, status, "Failed while setting CPU OperationalStatus");
   fill.set(&ProcessorCore::setHealthState, status, "Failed while setting CPU Health State");
   fill.set(&ProcessorCore::setRequestedState, status, "Failed while setting CPU Core RequestedState");
-  return core;
+}
+
+/// Appends a record and fills it where it stands; one that could not be read to its end is taken back.
+template <class Record>
+void append(std::vector<Record>& records, void (*read)(const Instrumentation&, Record&, const char*),
+            const Instrumentation& node, const char* function) {
+  Record& record = records.emplace_back();
+  try {
+    read(node, record, function);
+  } catch (...) {
+    records.pop_back();
+    throw;
+  }
 }
 
 }  // namespace
@@ -215,7 +227,7 @@ unsigned short getProcessorInstances(std::vector<Processor>& processors) {
     const bool found = static_cast<bool>(node);
     for (; node; ++node) {
       if (isInUse(node.getNodeStatus())) {
-        processors.push_back(readProcessor(node, __func__));
+        append(processors, readProcessor, node, __func__);
       } else {
         modelEvents.message(LevelWarning, "Dummy CPU Instance");
       }
@@ -236,7 +248,7 @@ unsigned short getMemoryInstances(std::vector<Memory>& memories) {
     node.selectNode(NodeCacheMemory);
     const bool found = static_cast<bool>(node);
     for (; node; ++node) {
-      memories.push_back(readMemory(node, __func__));
+      append(memories, readMemory, node, __func__);
     }
     result = found ? 0 : 1;
   } catch (const std::exception& error) {
@@ -254,7 +266,7 @@ unsigned short getProcessorCoreInstances(std::vector<ProcessorCore>& cores) {
     node.selectNode(NodeProcessorCore);
     const bool found = static_cast<bool>(node);
     for (; node; ++node) {
-      cores.push_back(readCore(node, __func__));
+      append(cores, readCore, node, __func__);
     }
     result = found ? 0 : 1;
   } catch (...) {

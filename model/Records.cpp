@@ -13,14 +13,14 @@ unsigned short low16(unsigned int number) {
   return static_cast<unsigned short>(number);
 }
 
-bool storeNonEmpty(std::string& field, std::string value) {
+bool storeNonEmpty(std::string& field, std::string&& value) {
   field = std::move(value);
   return !field.empty();
 }
 
 template <class Field, class Value>
-bool store(Field& field, Value value) {
-  field = std::move(value);
+bool store(Field& field, Value&& value) {
+  field = std::forward<Value>(value);
   return true;
 }
 

@@ -37,8 +37,9 @@ constexpr Kind<ProcessorCore> coreKind{NodeProcessorCore, getProcessorCoreInstan
 
 /// Collects all records anew and appends the first whose identifier is `path`.
 template <class Record>
-bool appendCollected(const Kind<Record>& kind, const std::string& path, std::vector<Record>& matches) {
-  std::vector<Record> collected;
+bool appendCollected(const Kind<Record>& kind, const std::string& path, std::vector<Record>& collected,
+                     std::vector<Record>& matches) {
+  collected.clear();
   if (kind.collect(collected) != 0) {
     return false;
   }
@@ -66,7 +67,8 @@ unsigned short appendOwner(const std::string& identifier, std::vector<Processor>
   if (!node) {
     return 1;
   }
-  if (!appendCollected(processorKind, printablePath(node), matches)) {
+  std::vector<Processor> collected;
+  if (!appendCollected(processorKind, printablePath(node), collected, matches)) {
     modelEvents.message(LevelError, failure, __builtin_LINE(), function);
     return 1;
   }
@@ -87,8 +89,9 @@ unsigned short appendChildren(const std::string& identifier, const Kind<Record>&
   if (!node) {
     return withoutNodes;
   }
+  std::vector<Record> collected;  // its memory serves the collection for every child
   for (node.setFilter(PathChildren, node.convertStringToPath(owner)); node; ++node) {
-    if (!appendCollected(kind, printablePath(node), matches)) {
+    if (!appendCollected(kind, printablePath(node), collected, matches)) {
       modelEvents.message(LevelError, failure, __builtin_LINE(), function);
       return 1;
     }
