@@ -23,7 +23,8 @@ CPUObjFactory* factoryOfProcessors() {
 }
 
 // The computer system is another provider's: its names and instances come from the broker. Brokers
-// answer a failed call with a failing status, and then with an enumeration or without one.
+// answer a failed call with a failing status, and then with an enumeration or without one. The static is
+// read before the up-call: during it, a registration may write it.
 
 /// Logs and returns false when the broker's answer is a failure.
 bool answered(const CMPIStatus& status, unsigned int line = __builtin_LINE(),
@@ -37,11 +38,11 @@ bool answered(const CMPIStatus& status, unsigned int line = __builtin_LINE(),
 
 CMPIEnumeration* enumerateSystemNames(const CMPIContext* context, const CMPIObjectPath* systemClass,
                                       CMPIStatus* status) {
-  return upCall([&] { return CBEnumInstanceNames(broker, context, systemClass, status); });
+  return upCall([&, caller = broker] { return CBEnumInstanceNames(caller, context, systemClass, status); });
 }
 
 CMPIEnumeration* enumerateSystems(const CMPIContext* context, const CMPIObjectPath* systemClass, CMPIStatus* status) {
-  return upCall([&] { return CBEnumInstances(broker, context, systemClass, nullptr, status); });
+  return upCall([&, caller = broker] { return CBEnumInstances(caller, context, systemClass, nullptr, status); });
 }
 
 /// Hands each element of an enumeration to `handle`, until that returns false.
