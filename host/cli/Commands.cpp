@@ -6,6 +6,7 @@
 
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"
+#include "host/cli/DiffCommand.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
 #include "host/cli/Operations.h"
@@ -59,6 +60,8 @@ Outcome runCommand(const Options& options, std::size_t width) {
       return {writeClassList(options.format), {}};
     case Verb::Inventory:
       return {inventoryOutput(options.format), {}};
+    case Verb::Diff:
+      return diffInventories(options);
     case Verb::Tree:
       return {treeOutput(options.format, width), {}};
     default:

@@ -14,6 +14,7 @@ namespace Corvcim {
 struct Outcome {
   std::string output;
   std::vector<std::string> errors;
+  bool differs = false;  ///< two inventories were compared, and are not the same
 };
 
 /// Runs the command. Sets CORVANE_INVENTORY and CORVANE_LANGUAGE in this process as the options ask.

@@ -15,14 +15,6 @@ using Tarn::Inventory::Node;
 using Tarn::Inventory::NodeIndex;
 using Tarn::Inventory::Tree;
 
-std::string listText(const std::vector<unsigned int>& numbers) {
-  std::string text;
-  for (const unsigned int number : numbers) {
-    text += (text.empty() ? "" : ", ") + std::to_string(number);
-  }
-  return text.empty() ? "(none)" : text;
-}
-
 std::string propertyName(Tarn::NodeLexicon::Properties id) {
   const Tarn::Inventory::PropertyEntry* entry = Tarn::Inventory::findProperty(id);
   return entry == nullptr ? "property " + std::to_string(id) : std::string(entry->name);
@@ -45,7 +37,7 @@ Rows rowsOf(const Tree& tree, const Node& node) {
     rows.emplace_back(propertyName(property.id), std::to_string(property.value));
   }
   for (const auto& property : tree.lists(node)) {
-    rows.emplace_back(propertyName(property.id), listText(property.value));
+    rows.emplace_back(propertyName(property.id), numberListText(property.value));
   }
   return rows;
 }
@@ -81,11 +73,11 @@ std::string writeInventoryText(const Tree& tree) {
   return unread.empty() ? text : text + '\n' + unread;
 }
 
-std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread) {
+std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread, std::string_view heading) {
   if (unread.empty()) {
     return "";
   }
-  std::string text = "Not read:\n";
+  std::string text = std::string(heading) + ":\n";
   for (const Tarn::Inventory::Unread& entry : unread) {
     text += "  " + toPrintable(entry.file) + ": " + toPrintable(entry.reason) + '\n';
     if (!entry.remedy.empty()) {

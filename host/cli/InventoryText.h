@@ -3,6 +3,7 @@
 
 #include <span>
 #include <string>
+#include <string_view>
 
 #include "platform/instrumentation/Tree.h"
 
@@ -11,8 +12,8 @@ namespace Corvcim {
 /// The inventory for people: every node with its state and its properties, and what could not be read.
 std::string writeInventoryText(const Tarn::Inventory::Tree& tree);
 
-/// What could not be read, why, and what would make it readable, under a heading; empty for nothing.
-std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread);
+/// What could not be read, why, and what would make it readable, under the heading; empty for nothing.
+std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread, std::string_view heading = "Not read");
 
 }  // namespace Corvcim
 

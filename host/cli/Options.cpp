@@ -27,12 +27,25 @@ std::string usageLine(const VerbSyntax& verb) {
   throw UsageError(std::string(verb.name) + ": " + text + "; " + usageLine(verb));
 }
 
+/// The verbs that an option is for, and what is said to the others.
+struct Scope {
+  bool (*holds)(const VerbSyntax& verb);
+  std::string_view explanation;
+};
+
+constexpr Scope everyVerb = {[](const VerbSyntax&) { return true; }, ""};
+constexpr Scope associationVerbs = {[](const VerbSyntax& verb) { return verb.isAssociation; },
+                                    "it belongs to ai, ain, ri and rin"};
+constexpr Scope oneInventory = {[](const VerbSyntax& verb) { return verb.verb != Verb::Diff; },
+                                "A and B say which inventories"};
+constexpr Scope onlyDiff = {[](const VerbSyntax& verb) { return verb.verb == Verb::Diff; }, "it belongs to diff"};
+
 /// An option: its spellings, and what it does with its value. An option without a value is given "".
 struct Option {
   std::string_view longName;
   std::string_view shortName;
   bool hasValue;
-  bool isAssociation;
+  const Scope& scope;
   void (*apply)(Options& options, const std::string& value);
 };
 
@@ -52,19 +65,37 @@ void setNameSpace(Options& options, const std::string& name) {
   options.nameSpace = name;
 }
 
+std::vector<std::string> splitAtCommas(std::string_view list) {
+  std::vector<std::string> names;
+  while (!list.empty()) {
+    const std::size_t comma = list.find(',');
+    const std::string_view name = list.substr(0, comma);
+    if (!name.empty()) {
+      names.emplace_back(name);
+    }
+    list = comma == std::string_view::npos ? std::string_view() : list.substr(comma + 1);
+  }
+  return names;
+}
+
 constexpr Option optionTable[] = {
-    {"--library", "-l", true, false, [](Options& o, const std::string& value) { o.library = value; }},
-    {"--companion", "", true, false, [](Options& o, const std::string& value) { o.companion = value; }},
-    {"--inventory", "-i", true, false, [](Options& o, const std::string& value) { o.inventory = value; }},
-    {"--language", "", true, false, [](Options& o, const std::string& value) { o.language = value; }},
-    {"--namespace", "-n", true, false, setNameSpace},
-    {"--output", "-o", true, false, setFormat},
-    {"--help", "-h", false, false, [](Options& o, const std::string&) { o.wantsHelp = true; }},
-    {"--version", "-V", false, false, [](Options& o, const std::string&) { o.wantsVersion = true; }},
-    {"", "-ac", true, true, [](Options& o, const std::string& value) { o.association.associationClass = value; }},
-    {"", "-arc", true, true, [](Options& o, const std::string& value) { o.association.resultClass = value; }},
-    {"", "-ar", true, true, [](Options& o, const std::string& value) { o.association.role = value; }},
-    {"", "-arr", true, true, [](Options& o, const std::string& value) { o.association.resultRole = value; }},
+    {"--library", "-l", true, everyVerb, [](Options& o, const std::string& value) { o.library = value; }},
+    {"--companion", "", true, everyVerb, [](Options& o, const std::string& value) { o.companion = value; }},
+    {"--inventory", "-i", true, oneInventory, [](Options& o, const std::string& value) { o.inventory = value; }},
+    {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
+    {"--namespace", "-n", true, everyVerb, setNameSpace},
+    {"--output", "-o", true, everyVerb, setFormat},
+    {"--ignore", "", true, onlyDiff,
+     [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
+    {"--help", "-h", false, everyVerb, [](Options& o, const std::string&) { o.wantsHelp = true; }},
+    {"--version", "-V", false, everyVerb, [](Options& o, const std::string&) { o.wantsVersion = true; }},
+    {"", "-ac", true, associationVerbs,
+     [](Options& o, const std::string& value) { o.association.associationClass = value; }},
+    {"", "-arc", true, associationVerbs,
+     [](Options& o, const std::string& value) { o.association.resultClass = value; }},
+    {"", "-ar", true, associationVerbs, [](Options& o, const std::string& value) { o.association.role = value; }},
+    {"", "-arr", true, associationVerbs,
+     [](Options& o, const std::string& value) { o.association.resultRole = value; }},
 };
 
 /// An argument that was recognised as an option, with the value that was glued to it, if any.
@@ -98,17 +129,12 @@ bool isOption(std::string_view argument) {
   return argument.size() > 1 && argument.front() == '-';
 }
 
-std::vector<std::string> splitAtCommas(std::string_view list) {
-  std::vector<std::string> names;
-  while (!list.empty()) {
-    const std::size_t comma = list.find(',');
-    const std::string_view name = list.substr(0, comma);
-    if (!name.empty()) {
-      names.emplace_back(name);
-    }
-    list = comma == std::string_view::npos ? std::string_view() : list.substr(comma + 1);
+/// One of several words with a blank between them.
+std::string_view wordAt(std::string_view words, std::size_t index) {
+  for (; index != 0; --index) {
+    words.remove_prefix(words.find(' ') + 1);
   }
-  return names;
+  return words.substr(0, words.find(' '));
 }
 
 /// The words that are no options: the verb and its operands.
@@ -126,7 +152,7 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
     return;
   }
   if (count < verb->minimumOperands) {
-    fail(*verb, std::string(verb->operands.substr(0, verb->operands.find(' '))) + " is missing");
+    fail(*verb, std::string(wordAt(verb->operands, count)) + " is missing");
   }
   if (count > verb->maximumOperands) {
     fail(*verb, "unexpected argument " + quoted(operands[verb->maximumOperands + 1]));
@@ -134,20 +160,30 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
   if (count >= 1) {
     options.target = operands[1];
   }
-  if (count >= 2) {
+  if (count >= 2 && verb->verb == Verb::Diff) {
+    options.secondTarget = operands[2];
+  } else if (count >= 2) {
     options.hasPropertyList = true;
     options.properties = splitAtCommas(operands[2]);
   }
 }
 
-void checkCombination(const Options& options, const std::string& associationOption) {
+/// An option as it was written.
+struct Given {
+  const Option* option;
+  std::string spelling;
+};
+
+void checkCombination(const Options& options, const std::vector<Given>& given) {
   if (options.wantsHelp || options.wantsVersion) {
     return;
   }
   const VerbSyntax& verb = *options.verb;
   const std::string name = verb.name.empty() ? "the overview" : std::string(verb.name);
-  if (!associationOption.empty() && !verb.isAssociation) {
-    fail(name + " takes no option " + quoted(associationOption) + ": it belongs to ai, ain, ri and rin");
+  for (const auto& [option, spelling] : given) {
+    if (!option->scope.holds(verb)) {
+      fail(name + " takes no option " + quoted(spelling) + ": " + std::string(option->scope.explanation));
+    }
   }
   if (!options.language.empty() && (options.format == Format::Mof || options.format == Format::Json)) {
     fail("'--language' is for text: mof and json are the same in every language");
@@ -180,7 +216,7 @@ void settleReferenceOptions(Options& options) {
 Options parseOptions(std::span<const char* const> arguments) {
   Options options;
   std::vector<std::string> operands;
-  std::string associationOption;
+  std::vector<Given> given;
   for (std::size_t i = 0; i < arguments.size(); ++i) {
     const std::string_view argument = arguments[i];
     if (argument == "--") {
@@ -201,13 +237,11 @@ Options parseOptions(std::span<const char* const> arguments) {
     if (!match.option->hasValue && match.value) {
       fail("option " + quoted(match.option->longName) + " takes no value");
     }
-    if (match.option->isAssociation) {
-      associationOption = argument;
-    }
+    given.push_back({match.option, std::string(argument.substr(0, argument.find('=')))});
     match.option->apply(options, match.value.value_or(""));
   }
   takeOperands(options, operands);
-  checkCombination(options, associationOption);
+  checkCombination(options, given);
   settleReferenceOptions(options);
   return options;
 }

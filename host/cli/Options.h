@@ -27,10 +27,12 @@ struct Options {
   std::string nameSpace = "root/cimv2";
   Format format = Format::Text;
   const VerbSyntax* verb = &overviewSyntax();
-  std::string target;  ///< the class or the path; empty for verbs without one
+  std::string target;        ///< the class, the path or the first source; empty for verbs without one
+  std::string secondTarget;  ///< the second source of diff
   bool hasPropertyList = false;
   std::vector<std::string> properties;  ///< an empty list selects the keys alone
   AssociationOptions association;
+  std::vector<std::string> ignoredFields;  ///< what diff leaves out
   bool wantsHelp = false;
   bool wantsVersion = false;
 };

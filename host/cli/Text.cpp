@@ -98,6 +98,14 @@ std::string shorten(const std::string& text, std::size_t width) {
   return width == 0 ? "" : text.substr(0, end) + "…";
 }
 
+std::string numberListText(const std::vector<unsigned int>& numbers) {
+  std::string text;
+  for (const unsigned int number : numbers) {
+    text += (text.empty() ? "" : ", ") + std::to_string(number);
+  }
+  return text.empty() ? "(none)" : text;
+}
+
 std::string counted(std::uint64_t count, std::string_view noun) {
   return std::to_string(count) + ' ' + std::string(noun) + (count == 1 ? "" : "s");
 }

@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace Corvcim {
 
@@ -23,6 +24,9 @@ std::string padRight(std::string text, std::size_t width);
 
 /// Valid UTF-8, shortened at the end to at most that many columns; what was cut shows as "…".
 std::string shorten(const std::string& text, std::size_t width);
+
+/// "1, 2, 8"; "(none)" for an empty list.
+std::string numberListText(const std::vector<unsigned int>& numbers);
 
 /// "1 core", "2 cores".
 std::string counted(std::uint64_t count, std::string_view noun);

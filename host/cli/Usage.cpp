@@ -21,6 +21,7 @@ constexpr std::string_view optionHelp =
     "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
     "  -l, --library FILE      the provider library\n"
     "      --companion FILE    the library with HALDA_ComputerSystem\n"
+    "      --ignore FIELD,...  what diff leaves out, such as CurrentClockSpeed\n"
     "      --language ID       language of captions and descriptions, such as de_AT\n"
     "  -h, --help              this help; after a verb: the help of that verb\n"
     "  -V, --version           the version\n";
@@ -35,7 +36,8 @@ constexpr std::string_view associationHelp =
 
 constexpr std::string_view ending =
     "\n"
-    "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong.\n"
+    "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong;\n"
+    "of diff: 0 no differences, 1 differences, 2 trouble.\n"
     "\n"
     "Examples:\n"
     "  corvcim ei HALDA_CPUProcessor DeviceID,Name,MaxClockSpeed\n"

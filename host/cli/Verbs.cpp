@@ -24,6 +24,13 @@ constexpr std::string_view referenceDetails =
     "PATH is an object path as ein prints it; the namespace may be left out.\n"
     "Without -arc (or -ac) every association class that PATH's class takes part in is asked.\n";
 
+constexpr std::string_view diffDetails =
+    "A and B are sources as --inventory takes them: live, root:DIR, json:FILE.\n"
+    "Parts are matched by their paths. --ignore CurrentClockSpeed,description leaves\n"
+    "fields out; clocks change by themselves.\n"
+    "\n"
+    "Exit status: 0 no differences, 1 differences, 2 trouble.\n";
+
 constexpr VerbSyntax overview = {"", Verb::Overview, "", 0, 0, "one screen about the processors", textOnly, false, ""};
 
 constexpr VerbSyntax syntaxes[] = {
@@ -41,6 +48,7 @@ constexpr VerbSyntax syntaxes[] = {
     {"rin", Verb::ReferenceNames, "PATH", 1, 1, "the paths of those", dataFormats, true, referenceDetails},
     {"inventory", Verb::Inventory, "", 0, 0,
      "the inventory that the library reads; -o json writes a file for json:FILE", plainFormats, false, ""},
+    {"diff", Verb::Diff, "A B", 2, 2, "what differs between two inventories", plainFormats, false, diffDetails},
     {"tree", Verb::Tree, "", 0, 0, "system, processors, cores and caches as a drawing", drawingFormats, false,
      "Caches stand above the cores that share them, as the inventory tells it.\n"},
 };

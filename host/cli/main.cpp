@@ -13,6 +13,14 @@ namespace {
 
 enum ExitStatus { Success = 0, Failed = 1, WrongUsage = 2 };
 
+/// Comparisons say with 1 that something differs, as diff(1) does, so that their failures are 2.
+constexpr int Differs = 1;
+constexpr int ComparisonFailed = 2;
+
+int failureStatus(const Corvcim::Options& options) {
+  return options.verb->verb == Corvcim::Verb::Diff ? ComparisonFailed : Failed;
+}
+
 int run(const Corvcim::Options& options) {
   if (options.wantsVersion) {
     Corvcim::writeOutput(Corvcim::versionText());
@@ -28,21 +36,24 @@ int run(const Corvcim::Options& options) {
   for (const std::string& error : outcome.errors) {
     Corvcim::writeError(error);
   }
-  return outcome.errors.empty() ? Success : Failed;
+  return !outcome.errors.empty() ? failureStatus(options) : outcome.differs ? Differs : Success;
 }
 
 }  // namespace
 
 int main(int count, char** arguments) {
   Corvcim::occupyStandardStreams();
+  int failed = Failed;
   try {
     const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
-    return run(Corvcim::parseOptions(all.subspan(all.empty() ? 0 : 1)));
+    const Corvcim::Options options = Corvcim::parseOptions(all.subspan(all.empty() ? 0 : 1));
+    failed = failureStatus(options);
+    return run(options);
   } catch (const Corvcim::UsageError& error) {
     Corvcim::writeError(error.what());
     return WrongUsage;
   } catch (const std::exception& error) {
     Corvcim::writeError(error.what());
-    return Failed;
+    return failed;
   }
 }

@@ -29,7 +29,7 @@ _corvcim_inventory() {
 
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
-  local verbs="classes ei ein gi ai ain ri rin inventory tree"
+  local verbs="classes ei ein gi ai ain ri rin inventory diff tree"
   local options="--inventory --output --namespace --library --companion --language --help --version"
 
   for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
@@ -43,7 +43,7 @@ _corvcim() {
     -o | --output)
       case $verb in
         tree) _corvcim_offer "text svg dot" ;;
-        classes | inventory) _corvcim_offer "text json" ;;
+        classes | inventory | diff) _corvcim_offer "text json" ;;
         *) _corvcim_offer "text mof json svg dot" ;;
       esac
       return
@@ -51,6 +51,7 @@ _corvcim() {
     -l | --library | --companion) _corvcim_files "$current" && return ;;
     -n | --namespace) _corvcim_offer "root/cimv2" && return ;;
     --language) _corvcim_offer "en de" && return ;;
+    --ignore) _corvcim_offer "CurrentClockSpeed description cpus status" && return ;;
     -ac | -arc) _corvcim_classes && return ;;
     -ar | -arr)
       _corvcim_offer "Antecedent Dependent GroupComponent PartComponent ManagedElement Capabilities"
@@ -62,10 +63,13 @@ _corvcim() {
     case $verb in
       ai | ain) options+=" -ac -arc -ar -arr" ;;
       ri | rin) options+=" -ac -arc -ar" ;;
+      diff) options+=" --ignore" ;;
     esac
     _corvcim_offer "$options"
   elif [[ -z $verb ]]; then
     _corvcim_offer "$verbs"
+  elif [[ $verb == diff ]]; then
+    _corvcim_inventory
   elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin) ]]; then
     _corvcim_classes
   fi

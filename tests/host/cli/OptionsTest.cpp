@@ -138,6 +138,27 @@ TEST(Options, AssociationOptionsBelongToAssociationVerbs) {
             "ei takes no option '-ac': it belongs to ai, ain, ri and rin; see 'corvcim --help'");
 }
 
+TEST(Options, DiffTakesTwoSources) {
+  const Options options = parse({"diff", "live", "--ignore=status,cpus", "json:b.json"});
+
+  EXPECT_EQ(options.target, "live");
+  EXPECT_EQ(options.secondTarget, "json:b.json");
+  EXPECT_FALSE(options.hasPropertyList);
+  EXPECT_THAT(options.ignoredFields, ElementsAre("status", "cpus"));
+}
+
+TEST(Options, DiffNamesWhatIsMissing) {
+  EXPECT_EQ(complaint({"diff"}), "diff: A is missing; usage: corvcim [OPTION...] diff A B");
+  EXPECT_EQ(complaint({"diff", "live"}), "diff: B is missing; usage: corvcim [OPTION...] diff A B");
+}
+
+TEST(Options, OptionsOfOneVerbAreRefusedByTheOthers) {
+  EXPECT_EQ(complaint({"diff", "live", "live", "--inventory=live"}),
+            "diff takes no option '--inventory': A and B say which inventories; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"tree", "--ignore", "cpus"}),
+            "tree takes no option '--ignore': it belongs to diff; see 'corvcim --help'");
+}
+
 TEST(Options, LanguagesBelongToText) {
   EXPECT_EQ(complaint({"ei", "A", "--language", "de", "-o", "json"}),
             "'--language' is for text: mof and json are the same in every language; see 'corvcim --help'");
