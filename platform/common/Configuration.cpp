@@ -19,15 +19,19 @@ namespace {
 constexpr std::string_view kDefaultFile = "/etc/corvane/corvane.conf";
 constexpr std::size_t kLargestFile = 1 << 20;
 
-constexpr std::array<std::string_view, 8> kKeys = {
+constexpr std::array<std::string_view, 12> kKeys = {
     "inventory",          // which machine the library describes
     "language",           // of captions and descriptions
     "log.destination",    // the log sink
+    "log.keep",           //
     "log.level",          //
     "log.rate",           //
+    "log.size",           //
     "trace.destination",  // the trace sink
+    "trace.keep",         //
     "trace.level",        //
     "trace.rate",         //
+    "trace.size",         //
 };
 
 std::string knownKeys() {

@@ -5,8 +5,9 @@
 #include <utility>
 
 #include "platform/common/Environment.h"
-#include "platform/cvlog/LineSink.h"
+#include "platform/cvlog/FileSink.h"
 #include "platform/cvlog/RateLimitedSink.h"
+#include "platform/cvlog/StandardErrorSink.h"
 #include "platform/cvlog/SystemLogSink.h"
 
 namespace CVLog {
@@ -18,14 +19,15 @@ using Tarn::Common::environmentOverride;
 
 constexpr int kNothing = std::numeric_limits<int>::max();
 
-std::unique_ptr<Sink> openDestination(const Destination& destination) {
+std::unique_ptr<Sink> openDestination(const SinkSettings& settings) {
+  const Destination& destination = settings.destination;
   switch (destination.kind) {
     case DestinationKind::kStandardError:
       return std::make_unique<StandardErrorSink>();
     case DestinationKind::kSystemLog:
       return std::make_unique<SystemLogSink>();
     case DestinationKind::kFile:
-      return std::make_unique<FileSink>(destination.path);
+      return std::make_unique<FileSink>(destination.path, settings.rotation);
     case DestinationKind::kNone:
       break;
   }
@@ -33,7 +35,7 @@ std::unique_ptr<Sink> openDestination(const Destination& destination) {
 }
 
 std::unique_ptr<Sink> openSink(const SinkSettings& settings) {
-  std::unique_ptr<Sink> sink = openDestination(settings.destination);
+  std::unique_ptr<Sink> sink = openDestination(settings);
   if (sink && settings.perMinute != 0) {
     return std::make_unique<RateLimitedSink>(std::move(sink), settings.perMinute);
   }

@@ -2,7 +2,9 @@
 
 #include <array>
 #include <charconv>
+#include <cstdint>
 #include <functional>
+#include <limits>
 
 #include "platform/common/Ascii.h"
 
@@ -11,23 +13,56 @@ namespace {
 
 using Tarn::Common::Configuration;
 using Tarn::Common::ConfigurationProblem;
+using Tarn::Common::lower;
 using Tarn::Common::Setting;
 
 constexpr std::string_view kLevelsWanted = "error, warning, info, debug or a number";
 constexpr std::string_view kDestinationsWanted = "none, stderr, syslog or file:PATH";
+constexpr std::string_view kSizesWanted = "a size from 4K on, such as 500K, 16M or 1G, or 0 for no limit";
+constexpr std::string_view kKeepWanted = "how many old files are kept, 1 to 999";
 constexpr std::string_view kFilePrefix = "file:";
+
+constexpr unsigned kMostOldFiles = 999;
+// A file for every few messages is a mistake: a unit was forgotten.
+constexpr std::uint64_t kSmallestFile = 4096;
+constexpr std::uint64_t kLargestFile = std::numeric_limits<std::int64_t>::max();
 
 std::string expected(const Setting& setting, std::string_view wanted) {
   return "\"" + setting.value + "\" does not count: expected " + std::string(wanted);
 }
 
-std::optional<unsigned> parseRate(std::string_view text) {
-  unsigned rate = 0;
-  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), rate);
+std::optional<std::uint64_t> parseNumber(std::string_view text) {
+  std::uint64_t number = 0;
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
   if (error != std::errc() || end != text.data() + text.size()) {
     return std::nullopt;
   }
-  return rate;
+  return number;
+}
+
+std::optional<unsigned> parseRate(std::string_view text) {
+  const std::optional<std::uint64_t> rate = parseNumber(text);
+  return rate && *rate <= std::numeric_limits<unsigned>::max() ? std::optional(static_cast<unsigned>(*rate))
+                                                               : std::nullopt;
+}
+
+std::optional<unsigned> parseKeep(std::string_view text) {
+  const std::optional<unsigned> keep = parseRate(text);
+  return keep && *keep >= 1 && *keep <= kMostOldFiles ? keep : std::nullopt;
+}
+
+/// Bytes, or so many K, M or G of 1024 each; below the least size only 0.
+std::optional<std::uint64_t> parseSize(std::string_view text) {
+  constexpr std::string_view kUnits = "kmg";
+  const std::size_t unit = text.empty() ? std::string_view::npos : kUnits.find(lower(text.back()));
+  const bool hasUnit = unit != std::string_view::npos;
+  const unsigned shift = hasUnit ? 10U * (static_cast<unsigned>(unit) + 1U) : 0U;
+  const std::optional<std::uint64_t> count = parseNumber(text.substr(0, text.size() - (hasUnit ? 1 : 0)));
+  if (!count || *count > kLargestFile >> shift) {
+    return std::nullopt;
+  }
+  const std::uint64_t size = *count << shift;
+  return size == 0 || size >= kSmallestFile ? std::optional(size) : std::nullopt;
 }
 
 /// Collects the settings of one sink, the file's first, then the override's.
@@ -39,6 +74,8 @@ class SinkReader {
     take(file.find(section + ".level"), kLevelsWanted, parseLevel, sink_.level);
     take(file.find(section + ".destination"), kDestinationsWanted, parseDestination, sink_.destination);
     take(file.find(section + ".rate"), "a number of messages a minute, 0 for no limit", parseRate, rate_);
+    take(file.find(section + ".size"), kSizesWanted, parseSize, sink_.rotation.size);
+    take(file.find(section + ".keep"), kKeepWanted, parseKeep, sink_.rotation.keep);
   }
 
   void readOverride(const Setting& setting) {

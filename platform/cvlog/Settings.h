@@ -8,6 +8,7 @@
 
 #include "platform/common/Configuration.h"
 #include "platform/cvlog/Level.h"
+#include "platform/cvlog/Rotation.h"
 
 namespace CVLog {
 
@@ -20,11 +21,15 @@ struct Destination {
   friend bool operator==(const Destination&, const Destination&) = default;
 };
 
+// A forgotten trace must not fill a disk: 80 MiB at most, with the defaults.
+inline constexpr Rotation kDefaultRotation = {.size = std::uint64_t{16} << 20U, .keep = 4};
+
 /// What one sink takes and where it goes.
 struct SinkSettings {
   int level = kLevelDebug;  ///< the lowest level that is taken
   Destination destination;
-  unsigned perMinute = 0;  ///< messages; 0 is no limit
+  unsigned perMinute = 0;                ///< messages; 0 is no limit
+  Rotation rotation = kDefaultRotation;  ///< of a file
 
   friend bool operator==(const SinkSettings&, const SinkSettings&) = default;
 };

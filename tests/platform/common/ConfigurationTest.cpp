@@ -26,8 +26,8 @@ void expectSetting(const Configuration& configuration, std::string_view key, std
 }
 
 constexpr const char* kKnownKeys =
-    "(known keys: inventory, language, log.destination, log.level, log.rate, trace.destination, trace.level, "
-    "trace.rate)";
+    "(known keys: inventory, language, log.destination, log.keep, log.level, log.rate, log.size, trace.destination, "
+    "trace.keep, trace.level, trace.rate, trace.size)";
 
 TEST(Configuration, HoldsTheValuesOfItsLines) {
   const Configuration configuration = Configuration::parse(

@@ -2,8 +2,10 @@
 #include <gtest/gtest.h>
 #include <syslog.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <climits>
+#include <filesystem>
 #include <string>
 
 #include "tests/platform/cvlog/LoggerFixture.h"
@@ -12,9 +14,12 @@
 namespace {
 
 using CVLog::CVLogger;
+using testing::AllOf;
 using testing::ElementsAre;
 using testing::Field;
+using testing::Gt;
 using testing::IsEmpty;
+using testing::Le;
 using testing::MatchesRegex;
 using testing::SizeIs;
 
@@ -33,6 +38,36 @@ TEST_F(Logger, LimitsWhatItSendsToTheSystemLog) {
     log(6000, "again");
   }
   EXPECT_THAT(recordedSystemLog(), SizeIs(60));
+}
+
+TEST_F(Logger, LimitsWhatItSendsElsewhereWhereItIsToldTo) {
+  configure("log.level = debug\nlog.destination = file:" + path("log") +
+            "\nlog.rate = 2\ntrace.destination = stderr\ntrace.rate = 3\n");
+  testing::internal::CaptureStderr();
+  for (int number = 0; number < 10; ++number) {
+    log(3000, "logged");
+    trace(3000, "traced");
+  }
+  const std::string traced = testing::internal::GetCapturedStderr();
+  EXPECT_EQ(std::count(traced.begin(), traced.end(), '\n'), 3);
+  EXPECT_EQ(content("log"),
+            "TIME debug Corvane.Test function file.cpp:12 logged\n"
+            "TIME debug Corvane.Test function file.cpp:12 logged\n");
+}
+
+TEST_F(Logger, RotatesTheFileOfEachSink) {
+  configure("log.destination = file:" + path("log") +
+            "\nlog.size = 4K\nlog.keep = 2\ntrace.destination = file:" + path("trace") + "\ntrace.size = 0\n");
+  const std::string text(1300, 'x');
+  for (int number = 0; number < 20; ++number) {
+    log(6000, text);
+    trace(6000, text);
+  }
+  for (const char* name : {"log", "log.1", "log.2"}) {
+    EXPECT_THAT(std::filesystem::file_size(path(name)), AllOf(Gt(0U), Le(4096U))) << name;
+  }
+  EXPECT_FALSE(std::filesystem::exists(path("log.3")));
+  EXPECT_GT(std::filesystem::file_size(path("trace")), 20 * text.size());
 }
 
 TEST_F(Logger, WritesEachSinkToItsFile) {

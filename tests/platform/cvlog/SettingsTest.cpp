@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdint>
+#include <map>
 #include <optional>
 #include <string>
 
@@ -12,14 +14,17 @@ using CVLog::defaultLog;
 using CVLog::defaultTrace;
 using CVLog::Destination;
 using CVLog::DestinationKind;
+using CVLog::kDefaultRotation;
 using CVLog::makeSettings;
 using CVLog::parseDestination;
+using CVLog::Rotation;
 using CVLog::Settings;
 using CVLog::SinkSettings;
 using Tarn::Common::Configuration;
 using Tarn::Common::ConfigurationProblem;
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::SizeIs;
 
 const Destination kFileX = {DestinationKind::kFile, "/x:y"};
 
@@ -49,6 +54,47 @@ TEST(LogSettings, LimitTheSystemLogUnlessTheyAreToldNotTo) {
   EXPECT_EQ(fromFile("trace.destination = syslog\n").trace.perMinute, 60U);
   EXPECT_EQ(fromFile("trace.destination = syslog\ntrace.rate = 0\n").trace.perMinute, 0U);
   EXPECT_EQ(fromFile("log.destination = stderr\n").log.perMinute, 0U);
+}
+
+TEST(LogSettings, LimitFilesUnlessTheyAreToldNotTo) {
+  EXPECT_EQ(fromFile("").trace.rotation, (Rotation{.size = 16 * 1024 * 1024, .keep = 4}));
+  const Settings settings = fromFile("log.size = 0\nlog.keep = 999\ntrace.size = 2G\ntrace.keep = 1\n");
+  EXPECT_EQ(settings.log.rotation, (Rotation{.size = 0, .keep = 999}));
+  EXPECT_EQ(settings.trace.rotation, (Rotation{.size = std::uint64_t{2} << 30U, .keep = 1}));
+  EXPECT_THAT(settings.problems, IsEmpty());
+}
+
+TEST(LogSettings, HaveSizesInBytesAndTheirMultiples) {
+  const std::map<std::string, std::uint64_t> sizes = {{"4096", 4096},
+                                                      {"4K", 4096},
+                                                      {"5k", 5120},
+                                                      {"1m", 1 << 20U},
+                                                      {"8589934591G", 0x7fff'ffff'c000'0000U},
+                                                      {"9223372036854775807", 0x7fff'ffff'ffff'ffffU},
+                                                      {"0", 0},
+                                                      {"0K", 0}};
+  for (const auto& [text, size] : sizes) {
+    EXPECT_EQ(fromFile("log.size = " + text + "\n").log.rotation.size, size) << text;
+  }
+  for (const char* broken : {"", "K", "4095", "3K", "-1", "+4096", "4 K", "4KB", "1T", "1.5M", "8589934592G",
+                             "9223372036854775808", "99999999999999999999"}) {
+    const Settings settings = fromFile("log.size = " + std::string(broken) + "\n");
+    EXPECT_EQ(settings.log.rotation, kDefaultRotation) << broken;
+    EXPECT_THAT(settings.problems, SizeIs(1)) << broken;
+  }
+}
+
+TEST(LogSettings, NameWhatARotationCanBe) {
+  EXPECT_THAT(fromFile("log.size = 10\ntrace.keep = 0\nlog.keep = 1000\n").problems,
+              ElementsAre(ConfigurationProblem{"corvane.conf:1",
+                                               "\"10\" does not count: expected a size from 4K on, such as 500K, 16M "
+                                               "or 1G, or 0 for no limit"},
+                          ConfigurationProblem{"corvane.conf:3",
+                                               "\"1000\" does not count: expected how many old files are kept, 1 to "
+                                               "999"},
+                          ConfigurationProblem{"corvane.conf:2",
+                                               "\"0\" does not count: expected how many old files are kept, 1 to "
+                                               "999"}));
 }
 
 TEST(LogSettings, OverridesComeBeforeTheFile) {

@@ -1,0 +1,226 @@
+#include "platform/cvlog/FileSink.h"
+
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <filesystem>
+#include <optional>
+#include <stdexcept>
+#include <system_error>
+
+#include "platform/cvlog/Level.h"
+#include "platform/cvlog/SystemLogSink.h"
+#include "platform/cvlog/WriteLine.h"
+
+namespace CVLog {
+namespace {
+
+using Tarn::Common::FileDescriptor;
+
+constexpr std::chrono::minutes kRetryAfter(1);
+
+// Non-blocking, or a pipe without a reader would hold the broker.
+constexpr int kAppending = O_WRONLY | O_APPEND | O_CLOEXEC | O_NOCTTY | O_NONBLOCK;
+constexpr mode_t kMode = S_IRUSR | S_IWUSR | S_IRGRP;
+
+[[noreturn]] void fail(const std::string& what) {
+  throw std::system_error(errno, std::generic_category(), what);
+}
+
+std::optional<struct stat> statusOf(int descriptor) {
+  struct stat status {};
+  return fstat(descriptor, &status) == 0 ? std::optional(status) : std::nullopt;
+}
+
+std::optional<struct stat> statusOf(const std::string& path) {
+  struct stat status {};
+  return stat(path.c_str(), &status) == 0 ? std::optional(status) : std::nullopt;
+}
+
+bool isRegular(const std::optional<struct stat>& status) {
+  return status && S_ISREG(status->st_mode);
+}
+
+bool isSameFile(const std::optional<struct stat>& a, const std::optional<struct stat>& b) {
+  return a && b && a->st_dev == b->st_dev && a->st_ino == b->st_ino;
+}
+
+FileDescriptor openLog(const std::string& path) {
+  FileDescriptor file(open(path.c_str(), kAppending | O_CREAT, kMode));
+  if (!file) {
+    fail("log file " + path + " cannot be opened");
+  }
+  const std::optional<struct stat> status = statusOf(file.number());
+  if (!isRegular(status) && !(status && S_ISCHR(status->st_mode))) {
+    throw std::runtime_error("log file " + path + " is not a regular file");
+  }
+  return file;
+}
+
+/// Opens the file of that name in the place of another, or makes it with the owner, group and mode of the other, so
+/// that who could write to that one can write to this.
+FileDescriptor openSuccessor(const std::string& path, const struct stat& predecessor) {
+  FileDescriptor next(open(path.c_str(), kAppending | O_CREAT | O_EXCL, kMode));
+  if (!next) {
+    next = FileDescriptor(open(path.c_str(), kAppending));
+    if (!next) {
+      fail("cannot be opened again");
+    }
+    return next;
+  }
+  constexpr uid_t kAsItIs = -1;
+  constexpr mode_t kPermissions = S_IRWXU | S_IRWXG | S_IRWXO;
+  // Only a privileged process gives files away; the group may be one of the owner's.
+  if (fchown(next.number(), predecessor.st_uid, predecessor.st_gid) == 0 ||
+      fchown(next.number(), kAsItIs, predecessor.st_gid) == 0) {
+    fchmod(next.number(), predecessor.st_mode & kPermissions);
+  }
+  return next;
+}
+
+/// The lock of a file, where nobody else has it.
+class FileLock {
+ public:
+  explicit FileLock(int descriptor) : descriptor_(descriptor), isHeld_(flock(descriptor, LOCK_EX | LOCK_NB) == 0) {
+    if (!isHeld_ && errno != EWOULDBLOCK) {
+      fail("cannot be locked for its rotation");
+    }
+  }
+  FileLock(const FileLock&) = delete;
+  FileLock& operator=(const FileLock&) = delete;
+  // Closing is not enough: a child that was forked in the meantime has the descriptor, too.
+  ~FileLock() { flock(descriptor_, LOCK_UN); }
+
+  explicit operator bool() const { return isHeld_; }
+
+ private:
+  int descriptor_;
+  bool isHeld_;
+};
+
+/// Holds a flag that was free; whoever finds it taken goes on without it.
+class HeldFlag {
+ public:
+  explicit HeldFlag(std::atomic_flag& flag) : flag_(flag), isHeld_(!flag.test_and_set(std::memory_order_acquire)) {}
+  HeldFlag(const HeldFlag&) = delete;
+  HeldFlag& operator=(const HeldFlag&) = delete;
+  ~HeldFlag() {
+    if (isHeld_) {
+      flag_.clear(std::memory_order_release);
+    }
+  }
+
+  explicit operator bool() const { return isHeld_; }
+
+ private:
+  std::atomic_flag& flag_;
+  bool isHeld_;
+};
+
+/// The path without symbolic links: what is rotated is the file, not a link to it.
+std::string realPath(const std::string& path) {
+  std::error_code error;
+  const std::filesystem::path real = std::filesystem::canonical(path, error);
+  return error ? path : real.string();
+}
+
+}  // namespace
+
+FileSink::FileSink(const std::string& path, Rotation rotation)
+    : path_(std::filesystem::absolute(path).string()), rotation_(rotation), file_(openLog(path)) {}
+
+void FileSink::write(const Message& message) {
+  const std::string line = formatLine(message) + '\n';
+  followName(line.size());
+  writeLine(file_.number(), line);
+}
+
+void FileSink::followName(std::size_t lineSize) {
+  const std::optional<struct stat> current = statusOf(file_.number());
+  if (!isRegular(current)) {
+    return;
+  }
+  const bool isStale = !isSameFile(current, statusOf(path_));
+  if (!isStale && !wouldOutgrow(current->st_size, lineSize)) {
+    return;
+  }
+  const Clock::rep retryAt = retryAt_.load(std::memory_order_relaxed);
+  if (retryAt != 0 && Clock::now().time_since_epoch().count() < retryAt) {
+    return;
+  }
+  const HeldFlag replacing(isBeingReplaced_);
+  if (!replacing) {
+    return;
+  }
+  try {
+    isStale ? reopen() : rotate(lineSize);
+    retryAt_.store(0, std::memory_order_relaxed);
+  } catch (const std::exception& error) {
+    retryAt_.store((Clock::now() + kRetryAfter).time_since_epoch().count(), std::memory_order_relaxed);
+    if (retryAt == 0) {
+      report(error.what());
+    }
+  }
+}
+
+bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
+  return rotation_.size != 0 && size > 0 && static_cast<std::uint64_t>(size) + lineSize > rotation_.size;
+}
+
+void FileSink::reopen() {
+  if (const std::optional<struct stat> predecessor = statusOf(file_.number())) {
+    adopt(openSuccessor(path_, *predecessor));
+  }
+}
+
+void FileSink::rotate(std::size_t lineSize) {
+  // Opened anew: a lock belongs to what open(2) made, and that of file_ may be shared with a forked process.
+  const FileDescriptor locked(open(path_.c_str(), kAppending));
+  if (!locked) {
+    fail("cannot be opened for its rotation");
+  }
+  const FileLock lock(locked.number());
+  if (!lock) {
+    return;  // somebody else is at it
+  }
+  const std::optional<struct stat> current = statusOf(locked.number());
+  if (!isSameFile(current, statusOf(path_))) {
+    reopen();  // somebody else was faster
+  } else if (!wouldOutgrow(current->st_size, lineSize)) {
+    adopt(locked);  // somebody else was faster still
+  } else {
+    const std::string real = realPath(path_);
+    makeOld(real, rotation_.keep);
+    adopt(openSuccessor(real, *current));
+  }
+}
+
+void FileSink::adopt(const FileDescriptor& next) {
+  if (!isRegular(statusOf(next.number()))) {
+    throw std::runtime_error("is not a regular file any more");
+  }
+  int number = -1;
+  do {
+    number = dup3(next.number(), file_.number(), O_CLOEXEC);
+  } while (number < 0 && errno == EINTR);
+  if (number < 0) {
+    fail("cannot be replaced");
+  }
+}
+
+void FileSink::report(std::string_view why) const {
+  const std::string text =
+      "log file " + path_ + ' ' + std::string(why) + "; messages go to the file that is open, however large";
+  SystemLogSink().write({.time = std::chrono::system_clock::now(),
+                         .level = kLevelWarning,
+                         .component = "Corvane.Logger",
+                         .function = __func__,
+                         .file = "FileSink.cpp",
+                         .line = __LINE__,
+                         .text = text});
+}
+
+}  // namespace CVLog

@@ -1,0 +1,55 @@
+#ifndef CORVANE_PLATFORM_CVLOG_FILESINK_H
+#define CORVANE_PLATFORM_CVLOG_FILESINK_H
+
+#include <sys/types.h>
+
+#include <atomic>
+#include <chrono>
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+#include "platform/common/FileDescriptor.h"
+#include "platform/cvlog/Rotation.h"
+#include "platform/cvlog/Sink.h"
+
+namespace CVLog {
+
+/// A regular file or a terminal, appended to, one line and one write(2) for each message: several threads and
+/// several processes may share one file.
+///
+/// A regular file is followed by its name: once it was renamed or removed, by another process that shares it or by a
+/// tool for log files, the next message goes to a new file of that name. A file that would outgrow the limit of its
+/// rotation makes way for a new one first; a lock on the file sees to it that one of the processes does so. Nobody
+/// waits for that: who finds the lock taken, or cannot rename or open, writes on to the file that is open. The system
+/// log hears once why a file could not be replaced, and the attempt is repeated a minute later at the earliest.
+class FileSink final : public Sink {
+ public:
+  /// Opens the file, creates it where needed (readable for its owner and group). A relative path counts from the
+  /// directory that the process is in now.
+  /// Throws std::runtime_error or a child of it, whose text names the file and says why.
+  explicit FileSink(const std::string& path, Rotation rotation = {});
+
+  void write(const Message& message) override;
+
+ private:
+  void followName(std::size_t lineSize);
+  void reopen();
+  void rotate(std::size_t lineSize);
+  void adopt(const Tarn::Common::FileDescriptor& next);
+  [[nodiscard]] bool wouldOutgrow(off_t size, std::size_t lineSize) const;
+  void report(std::string_view why) const;
+
+  using Clock = std::chrono::steady_clock;
+
+  const std::string path_;  // absolute
+  const Rotation rotation_;
+  // Other files take the place of the first one under its number, so that writers need no lock.
+  const Tarn::Common::FileDescriptor file_;
+  std::atomic_flag isBeingReplaced_;
+  std::atomic<Clock::rep> retryAt_{0};  // 0: the last replacement did not fail
+};
+
+}  // namespace CVLog
+
+#endif

@@ -1,0 +1,142 @@
+#include "platform/cvlog/FileSink.h"
+
+#include <fcntl.h>
+#include <gmock/gmock.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <filesystem>
+#include <stdexcept>
+#include <string>
+
+#include "tests/platform/cvlog/LogDirectory.h"
+#include "tests/platform/cvlog/RecordedSystemLog.h"
+
+namespace {
+
+using CVLog::FileSink;
+using testing::IsEmpty;
+
+using LogFile = LogDirectory;
+
+std::string errorOf(const std::string& path) {
+  try {
+    const FileSink sink(path);
+    return "no error";
+  } catch (const std::runtime_error& error) {
+    return error.what();
+  }
+}
+
+mode_t modeOf(const std::string& path) {
+  struct stat status {};
+  EXPECT_EQ(stat(path.c_str(), &status), 0) << path;
+  return status.st_mode & 0777U;
+}
+
+TEST_F(LogFile, IsAppendedToInLines) {
+  {
+    FileSink sink(path("log"));
+    sink.write(message("a"));
+  }
+  FileSink again(path("log"));
+  again.write(message("b"));
+  EXPECT_EQ(content("log"), line("a") + line("b"));
+}
+
+TEST_F(LogFile, IsMadeSoThatStrangersCannotReadIt) {
+  const FileSink sink(path("log"));
+  EXPECT_EQ(modeOf(path("log")) & 0137U, 0U);
+}
+
+TEST_F(LogFile, ThatCannotBeOpenedIsNamedWithTheReason) {
+  EXPECT_EQ(errorOf(path("missing/log")),
+            "log file " + path("missing/log") + " cannot be opened: No such file or directory");
+  EXPECT_EQ(errorOf(directory_), "log file " + directory_ + " cannot be opened: Is a directory");
+}
+
+TEST_F(LogFile, DoesNotWaitForTheReaderOfAPipe) {
+  const std::string pipe = path("pipe");
+  ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+  EXPECT_EQ(errorOf(pipe), "log file " + pipe + " cannot be opened: No such device or address");
+  const int reader = open(pipe.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+  EXPECT_EQ(errorOf(pipe), "log file " + pipe + " is not a regular file");
+  close(reader);
+}
+
+TEST_F(LogFile, GoesOnWhenTheDiskIsFull) {
+  FileSink sink("/dev/full", {.size = 1});
+  EXPECT_NO_THROW(sink.write(message("a")));
+}
+
+TEST_F(LogFile, ThatWasMovedAwayIsMadeAnewWithItsMode) {
+  FileSink sink(path("log"));
+  sink.write(message("a"));
+  chmod(path("log").c_str(), 0666);
+  std::filesystem::rename(path("log"), path("log.old"));
+  sink.write(message("b"));
+  sink.write(message("c"));
+  EXPECT_EQ(content("log.old"), line("a"));
+  EXPECT_EQ(content("log"), line("b") + line("c"));
+  EXPECT_EQ(modeOf(path("log")), 0666U);
+}
+
+TEST_F(LogFile, ThatWasRemovedIsMadeAnew) {
+  FileSink sink(path("log"));
+  sink.write(message("a"));
+  std::filesystem::remove(path("log"));
+  sink.write(message("b"));
+  EXPECT_EQ(content("log"), line("b"));
+}
+
+TEST_F(LogFile, ThatSomebodyElseHasMadeAnewIsFoundByItsName) {
+  FileSink sink(path("log"));
+  sink.write(message("a"));
+  std::filesystem::rename(path("log"), path("log.old"));
+  std::ofstream(path("log")) << "another's\n";
+  sink.write(message("b"));
+  EXPECT_EQ(content("log.old"), line("a"));
+  EXPECT_EQ(content("log"), "another's\n" + line("b"));
+}
+
+TEST_F(LogFile, IsFollowedAlsoWhenTheProcessGoesToAnotherDirectory) {
+  const std::filesystem::path before = std::filesystem::current_path();
+  std::filesystem::create_directory(path("elsewhere"));
+  std::filesystem::current_path(directory_);
+  FileSink sink("log");
+  std::filesystem::current_path(path("elsewhere"));
+  sink.write(message("a"));
+  std::filesystem::remove(path("log"));
+  sink.write(message("b"));
+  std::filesystem::current_path(before);
+  EXPECT_EQ(content("log"), line("b"));
+  EXPECT_THAT(content("elsewhere/log"), IsEmpty());
+}
+
+TEST_F(LogFile, WhoseNameWasTakenBySomethingElseStaysOpen) {
+  FileSink sink(path("log"));
+  std::filesystem::rename(path("log"), path("log.old"));
+  std::filesystem::create_directory(path("log"));
+  const std::size_t reportsBefore = recordedSystemLog().size();
+  sink.write(message("a"));
+  sink.write(message("b"));
+  EXPECT_EQ(content("log.old"), line("a") + line("b"));
+  ASSERT_EQ(recordedSystemLog().size(), reportsBefore + 1);
+  EXPECT_THAT(recordedSystemLog().back().text,
+              testing::EndsWith(" log file " + path("log") +
+                                " cannot be opened again: Is a directory; messages go to the file that is open, "
+                                "however large"));
+}
+
+TEST_F(LogFile, IsNotFollowedOntoAPipe) {
+  FileSink sink(path("log"));
+  std::filesystem::rename(path("log"), path("log.old"));
+  ASSERT_EQ(mkfifo(path("log").c_str(), 0600), 0);
+  const int reader = open(path("log").c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+  sink.write(message("a"));
+  close(reader);
+  EXPECT_EQ(content("log.old"), line("a"));
+  EXPECT_THAT(recordedSystemLog().back().text, testing::HasSubstr(" is not a regular file any more; "));
+}
+
+}  // namespace
