@@ -48,7 +48,7 @@ TEST_P(Fixture, PathsAreShort) {
 
 INSTANTIATE_TEST_SUITE_P(All, Fixture,
                          testing::Values("arm64-board", "container", "dual-socket-server", "hybrid-laptop",
-                                         "kvm-two-cpus", "offline-cpus", "virtual-machine"),
+                                         "kvm-two-cpus", "large-server", "offline-cpus", "virtual-machine"),
                          [](const auto& fixture) {
                            std::string name = fixture.param;
                            std::erase(name, '-');
