@@ -54,7 +54,7 @@ unsigned int firstField(unsigned int number, unsigned int most, unsigned int mar
   return number > most ? marker : number;
 }
 
-constexpr std::uint64_t firstSizeLimit = 0x7FFF * 64;
+constexpr std::uint64_t firstSizeLimit = 0x7FFFULL * 64;
 
 std::uint64_t encodedSize(std::uint64_t kibibytes, std::uint64_t granularityBit) {
   return kibibytes < granularityBit ? kibibytes : granularityBit | kibibytes / 64;

@@ -1,0 +1,155 @@
+#include "platform/instrumentation/smbios/Cache.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "tests/platform/instrumentation/smbios/Decoding.h"
+
+namespace Tarn::Smbios {
+namespace {
+
+using Support::SmbiosCache;
+
+class Decoded {
+ public:
+  explicit Decoded(const SmbiosCache& cache) : tables_(tableOf(cache)) {}
+
+  const Cache& operator*() const { return tables_->caches.at(0); }
+  const Cache* operator->() const { return &**this; }
+  std::vector<std::string> problems() const { return tables_.problems(); }
+
+ private:
+  Decoding tables_;
+};
+
+TEST(SmbiosCache, HasEveryField) {
+  const Decoded cache(SmbiosCache{.frame = {.handle = 0x0A},
+                                  .level = 3,
+                                  .socketed = true,
+                                  .location = 1,
+                                  .mode = 2,
+                                  .maximumKiB = 4096,
+                                  .installedKiB = 2048,
+                                  .currentSram = 0x08,
+                                  .speed = 12});
+
+  EXPECT_EQ(valueOf(cache->socket), "L1 Cache");
+  EXPECT_EQ(valueOf(cache->level), 3);
+  EXPECT_EQ(valueOf(cache->socketed), 1);
+  EXPECT_EQ(*cache->location, CacheLocation::External);
+  EXPECT_EQ(valueOf(cache->enabled), 1);
+  EXPECT_EQ(*cache->mode, CacheMode::VariesWithAddress);
+  EXPECT_EQ(valueOf(cache->maximumSize), 4096);
+  EXPECT_EQ(valueOf(cache->installedSize), 2048);
+  EXPECT_EQ(valueOf(cache->supportedSram), 0x20);
+  EXPECT_EQ(valueOf(cache->currentSram), 0x08);
+  EXPECT_EQ(valueOf(cache->speed), 12);
+  EXPECT_EQ(valueOf(cache->errorCorrection), 5);
+  EXPECT_EQ(*cache->type, CacheType::Unified);
+  EXPECT_EQ(valueOf(cache->associativity), 7);
+  EXPECT_EQ(valueOf(cache->ways), 8);
+  EXPECT_EQ(placeOf(cache->structure, cache->mode), "SMBIOS type 7, handle 0x000a, offset 0x05");
+  EXPECT_EQ(hexOf(cache->mode.raw), "aa02");
+  EXPECT_THAT(cache.problems(), testing::IsEmpty());
+}
+
+TEST(SmbiosCache, ConfigurationIsReadBitByBit) {
+  const Decoded off(SmbiosCache{.enabled = false, .mode = 0});
+  const Decoded unknown(SmbiosCache{.level = 8, .location = 3, .mode = 3});
+  const Decoded reserved(SmbiosCache{.location = 2});
+
+  EXPECT_EQ(valueOf(off->level), 1);
+  EXPECT_EQ(valueOf(off->enabled), 0);
+  EXPECT_EQ(valueOf(off->socketed), 0);
+  EXPECT_EQ(*off->mode, CacheMode::WriteThrough);
+  EXPECT_EQ(*off->location, CacheLocation::Internal);
+  EXPECT_EQ(valueOf(unknown->level), 8);
+  EXPECT_FALSE(unknown->mode);
+  EXPECT_FALSE(unknown->location);
+  EXPECT_FALSE(reserved->location);
+}
+
+TEST(SmbiosCache, SizeStandsInOneOfTwoFields) {
+  struct Case {
+    std::uint64_t kibibytes;
+    std::size_t offset;
+    std::string raw;
+  };
+  const Case cases[] = {
+      {0, 0x09, "0000"},
+      {32, 0x09, "2000"},
+      {0x7FFF, 0x09, "ff7f"},
+      {0x8000, 0x09, "0082"},
+      {0x7FFE * 64ULL, 0x09, "feff"},
+      {0x7FFF * 64ULL, 0x17, "c0ff1f00"},
+      {4ULL << 20, 0x17, "00004000"},
+      {1ULL << 31, 0x17, "00000082"},
+      {0x7FFFFFFFULL * 64, 0x17, "ffffffff"},
+  };
+  for (const Case& c : cases) {
+    const Decoded cache(SmbiosCache{.maximumKiB = c.kibibytes, .installedKiB = c.kibibytes});
+
+    EXPECT_EQ(cache->installedSize.value, c.kibibytes);
+    EXPECT_EQ(cache->installedSize.offset, c.offset) << c.kibibytes;
+    EXPECT_EQ(hexOf(cache->installedSize.raw), c.raw);
+    EXPECT_EQ(cache->maximumSize.value, c.kibibytes);
+    EXPECT_EQ(cache->maximumSize.offset, c.offset == 0x09 ? 0x07U : 0x13U) << c.kibibytes;
+  }
+}
+
+TEST(SmbiosCache, ALargeSizeWithoutASecondFieldIsWhatTheFirstSays) {
+  const Decoded cache(SmbiosCache{.frame = {.length = 0x13}, .installedKiB = 4ULL << 20});
+
+  EXPECT_EQ(valueOf(cache->installedSize), 0x7FFF * 64);
+  EXPECT_EQ(cache->installedSize.offset, 0x09U);
+}
+
+TEST(SmbiosCache, EveryAssociativityIsTold) {
+  // By code: the number of ways, -1 where the code names none.
+  const long long ways[] = {-1, -1, -1, 1, 2, 4, -1, 8, 16, 12, 24, 32, 48, 64, 20, -1};
+  for (std::uint8_t code = 0; code < std::size(ways); ++code) {
+    const Decoded cache(SmbiosCache{.associativity = code});
+
+    EXPECT_EQ(valueOf(cache->ways), ways[code]) << unsigned{code};
+    EXPECT_EQ(valueOf(cache->associativity), code == 0 || code == 2 ? -1 : code) << unsigned{code};
+  }
+}
+
+TEST(SmbiosCache, TypesThatAreNotListedAreAbsent) {
+  const std::optional<CacheType> types[] = {
+      {}, CacheType::Other, {}, CacheType::Instruction, CacheType::Data, CacheType::Unified, {}};
+  for (std::uint8_t code = 0; code < std::size(types); ++code) {
+    const Decoded cache(SmbiosCache{.type = code});
+
+    EXPECT_EQ(cache->type.value, types[code]) << unsigned{code};
+    EXPECT_EQ(std::to_integer<unsigned int>(cache->type.raw[0]), code);
+  }
+}
+
+TEST(SmbiosCache, CodesThatMeanUnknownAreAbsent) {
+  const Decoded cache(SmbiosCache{.supportedSram = 0x02, .currentSram = 0x22, .speed = 0, .errorCorrection = 2});
+
+  EXPECT_FALSE(cache->supportedSram);
+  EXPECT_FALSE(cache->currentSram);
+  EXPECT_FALSE(cache->speed);
+  EXPECT_FALSE(cache->errorCorrection);
+}
+
+TEST(SmbiosCache, HasExactlyTheFieldsThatItsLengthReaches) {
+  const std::size_t ends[] = {0x05, 0x07, 0x09, 0x0B, 0x0D, 0x0F, 0x10, 0x11, 0x12, 0x13};
+  for (std::size_t length = 4; length <= 0x20; ++length) {
+    const Decoded cache(SmbiosCache{.frame = {.length = static_cast<std::uint8_t>(length)}, .speed = 3});
+    const Cache& c = *cache;
+    const bool there[] = {!c.socket.raw.empty(),        !c.level.raw.empty(),           !c.maximumSize.raw.empty(),
+                          !c.installedSize.raw.empty(), !c.supportedSram.raw.empty(),   !c.currentSram.raw.empty(),
+                          !c.speed.raw.empty(),         !c.errorCorrection.raw.empty(), !c.type.raw.empty(),
+                          !c.associativity.raw.empty()};
+    for (std::size_t i = 0; i < std::size(ends); ++i) {
+      EXPECT_EQ(there[i], length >= ends[i]) << "field " << i << ", length " << length;
+    }
+    EXPECT_EQ(cache.problems().empty(), length >= 0x0F) << length;
+  }
+}
+
+}  // namespace
+}  // namespace Tarn::Smbios
