@@ -69,8 +69,10 @@ std::string writeInventoryText(const Tree& tree) {
   for (const Node& node : tree.nodes()) {
     text += nodeText(tree, node);
   }
-  const std::string unread = writeUnread(tree.unread());
-  return unread.empty() ? text : text + '\n' + unread;
+  for (const std::string& section : {writeUnread(tree.unread()), writeDisagreements(tree.disagreements())}) {
+    text += section.empty() ? "" : '\n' + section;
+  }
+  return text;
 }
 
 std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread, std::string_view heading) {
@@ -83,6 +85,19 @@ std::string writeUnread(std::span<const Tarn::Inventory::Unread> unread, std::st
     if (!entry.remedy.empty()) {
       text += "    " + toPrintable(entry.remedy) + '\n';
     }
+  }
+  return text;
+}
+
+std::string writeDisagreements(std::span<const Tarn::Inventory::Disagreement> disagreements) {
+  if (disagreements.empty()) {
+    return "";
+  }
+  std::string text = "Sources disagree:\n";
+  for (const Tarn::Inventory::Disagreement& entry : disagreements) {
+    text += "  " + toPrintable(entry.path) + ' ' + toPrintable(entry.property) + '\n';
+    text += "    " + toPrintable(entry.chosen) + "  taken from " + toPrintable(entry.chosenSource) + '\n';
+    text += "    " + toPrintable(entry.other) + "  said by " + toPrintable(entry.otherSource) + '\n';
   }
   return text;
 }

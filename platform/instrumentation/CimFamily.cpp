@@ -181,7 +181,7 @@ std::span<const FamilyRow> familyTable() {
   return rows;
 }
 
-unsigned int cimFamily(std::string_view vendor, std::string_view name, int family, int model) {
+const FamilyRow* findFamilyRow(std::string_view vendor, std::string_view name, int family, int model) {
   const std::string plain = withoutMarks(name);
   const auto weight = [](const FamilyRow& row) {
     return std::tuple(row.brand.size(), row.family != any, row.model != any);
@@ -194,7 +194,12 @@ unsigned int cimFamily(std::string_view vendor, std::string_view name, int famil
       best = &row;
     }
   }
-  return best == nullptr ? CimFamily::unknown : best->code;
+  return best;
+}
+
+unsigned int cimFamily(std::string_view vendor, std::string_view name, int family, int model) {
+  const FamilyRow* row = findFamilyRow(vendor, name, family, model);
+  return row == nullptr ? CimFamily::unknown : row->code;
 }
 
 }  // namespace Tarn::Inventory

@@ -31,6 +31,9 @@ struct FamilyRow {
 /// The rows, sorted by vendor, brand, family and model.
 std::span<const FamilyRow> familyTable();
 
+/// The row that counts for this processor; nullptr where none fits.
+const FamilyRow* findFamilyRow(std::string_view vendor, std::string_view name, int family, int model);
+
 /// The CIM family code; CimFamily::unknown where no row fits. `family` and `model` may be any.
 unsigned int cimFamily(std::string_view vendor, std::string_view name, int family, int model);
 

@@ -5,8 +5,6 @@
 #include <cmath>
 #include <string_view>
 
-#include "platform/instrumentation/ArmParts.h"
-
 namespace Tarn::Inventory {
 
 namespace {
@@ -69,6 +67,11 @@ std::string registerText(unsigned int value) {
   return text;
 }
 
+void setFamily(CpuIdentity& cpu, int family = FamilyRow::any, int model = FamilyRow::any) {
+  cpu.familyRow = findFamilyRow(cpu.vendor, cpu.name, family, model);
+  cpu.family = cpu.familyRow == nullptr ? CimFamily::unknown : cpu.familyRow->code;
+}
+
 // CPUID keeps what exceeds family 15 and model 15 in fields of their own.
 unsigned int x86Signature(unsigned int family, unsigned int model, unsigned int stepping) {
   const unsigned int extendedFamily = family > 0xF ? family - 0xF : 0;
@@ -84,7 +87,7 @@ void identifyX86(const Fields& fields, CpuIdentity& cpu) {
     return number ? static_cast<int>(*number) : FamilyRow::any;
   };
   cpu.name = fields["model name"] == "unknown" ? std::string_view() : fields["model name"];
-  cpu.family = cimFamily(cpu.vendor, cpu.name, known(family), known(model));
+  setFamily(cpu, known(family), known(model));
   cpu.stepping = stepping ? std::to_string(*stepping) : std::string();
   if (family && model && stepping) {
     cpu.processorId = registerText(x86Signature(*family, *model, *stepping));
@@ -110,6 +113,7 @@ void identifyArm(const Fields& fields, CpuIdentity& cpu) {
   const auto revision = fields.number("CPU revision");
   const auto version = fields.number("CPU architecture");
   const ArmPart* known = implementer && part ? findArmPart(*implementer, *part) : nullptr;
+  cpu.armPart = known;
   cpu.name = known != nullptr ? known->name : std::string_view();
   if (version) {
     cpu.family = armFamily(known, *version);
@@ -127,7 +131,7 @@ void identifyArm(const Fields& fields, CpuIdentity& cpu) {
 void identifyPowerPc(const Fields& fields, CpuIdentity& cpu) {
   cpu.vendor = "PowerPC";
   cpu.name = fields["cpu"];
-  cpu.family = cimFamily(cpu.vendor, cpu.name, FamilyRow::any, FamilyRow::any);
+  setFamily(cpu);
   const std::string_view revision = fields["revision"];
   cpu.stepping = revision.substr(0, revision.find(' '));
   cpu.clockSpeed = fields.megahertz("clock");
@@ -137,7 +141,7 @@ void identifyPowerPc(const Fields& fields, CpuIdentity& cpu) {
 }
 
 void identifyS390(const Fields& fields, CpuIdentity& cpu) {
-  cpu.family = cimFamily(cpu.vendor, cpu.name, FamilyRow::any, FamilyRow::any);
+  setFamily(cpu);
   cpu.width = fields.hasWord("features", "zarch") ? 64 : 31;
   cpu.clockSpeed = fields.megahertz("cpu MHz dynamic");
 }
@@ -146,14 +150,14 @@ void identifyRiscV(const Fields& fields, CpuIdentity& cpu) {
   const bool is64 = fields["isa"].starts_with("rv64");
   cpu.vendor = is64 ? "RISC-V 64" : "RISC-V 32";
   cpu.name = fields["uarch"];
-  cpu.family = cimFamily(cpu.vendor, cpu.name, FamilyRow::any, FamilyRow::any);
+  setFamily(cpu);
   cpu.width = is64 ? 64 : 32;
 }
 
 void identifyLoongArch(const Fields& fields, CpuIdentity& cpu) {
   cpu.vendor = "Loongson";
   cpu.name = fields["Model Name"];
-  cpu.family = cimFamily(cpu.vendor, cpu.name, FamilyRow::any, FamilyRow::any);
+  setFamily(cpu);
   cpu.stepping = fields["CPU Revision"];
   cpu.width = fields["ISA"].find("loongarch64") != std::string_view::npos ? 64 : 32;
   cpu.clockSpeed = fields.megahertz("CPU MHz");

@@ -45,11 +45,11 @@ class DuplicateCheck {
 
 class Reader {
  public:
-  explicit Reader(const std::string& file) : file_(file) {}
+  Reader(const std::string& file, Detail detail) : file_(file), builder_(detail) {}
 
   Tree read(const Json& document) {
     const Json::json_pointer top;
-    checkMembers(document, top, {"format", "version", "unread", "nodes"});
+    checkMembers(document, top, {"format", "version", "unread", "disagreements", "nodes"});
     if (text(document, top, "format") != "corvane-inventory") {
       refuse(top / "format", "is not \"corvane-inventory\"");
     }
@@ -58,6 +58,9 @@ class Reader {
     }
     if (document.contains("unread")) {
       readUnread(array(document, top, "unread"), top / "unread");
+    }
+    if (document.contains("disagreements")) {
+      readDisagreements(array(document, top, "disagreements"), top / "disagreements");
     }
     readNodes(array(document, top, "nodes"), top / "nodes", std::nullopt);
     return builder_.build();
@@ -131,6 +134,17 @@ class Reader {
     }
   }
 
+  void readDisagreements(const Json& entries, const Pointer& where) {
+    for (std::size_t i = 0; i < entries.size(); ++i) {
+      const Json& entry = entries[i];
+      const Pointer at = where / i;
+      checkMembers(entry, at, {"path", "property", "chosen", "chosenSource", "other", "otherSource"});
+      builder_.disagreement({text(entry, at, "path"), text(entry, at, "property"), text(entry, at, "chosen"),
+                             text(entry, at, "chosenSource"), text(entry, at, "other"),
+                             text(entry, at, "otherSource")});
+    }
+  }
+
   // Nodes below one of the type `parent`, or at the top.
   void readNodes(const Json& nodes, const Pointer& where, std::optional<NodeType> parent) {
     for (std::size_t i = 0; i < nodes.size(); ++i) {
@@ -147,8 +161,12 @@ class Reader {
       refuse(where / "path", "is the path of " + earlier->second + ", too");
     }
     explained(where / "path", [&] { builder_.node(type, path); });
-    builder_.status(number(node, where, "status"));
-    builder_.description(node.contains("description") ? text(node, where, "description") : std::string());
+    builder_.status(number(node, where, "status")).from([&] { return stated(node["status"], where / "status"); });
+    if (node.contains("description")) {
+      builder_.description(text(node, where, "description")).from([&] {
+        return stated(node["description"], where / "description");
+      });
+    }
     if (node.contains("cpus")) {
       readCpus(text(node, where, "cpus"), where / "cpus");
     }
@@ -194,6 +212,7 @@ class Reader {
         refuse(where / name, "is not the name of a property");
       }
       explained(where / name, [&, &given = value, &at = name] { readProperty(*entry, given, where / at); });
+      builder_.from([&, &given = value, &at = name] { return stated(given, where / at); });
     }
   }
 
@@ -219,6 +238,10 @@ class Reader {
     return numbers;
   }
 
+  Origin stated(const Json& value, const Pointer& where) const {
+    return {file_ + ", " + where.to_string(), value.dump(), "as the file states it"};
+  }
+
   // What the builder refuses, with the place in the file.
   template <class Action>
   void explained(const Pointer& where, Action action) const {
@@ -236,10 +259,10 @@ class Reader {
 
 }  // namespace
 
-Tree readJson(std::string_view text, const std::string& name) {
+Tree readJson(std::string_view text, const std::string& name, Detail detail) {
   try {
     const Json document = Json::parse(text, DuplicateCheck());
-    return Reader(name).read(document);
+    return Reader(name, detail).read(document);
   } catch (const Json::exception& error) {
     throw InventoryError(whatFailed, name, "it is not JSON: " + withoutTag(error.what()), whatToDo);
   } catch (const std::invalid_argument& refused) {

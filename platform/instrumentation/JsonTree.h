@@ -14,8 +14,8 @@ std::string writeJson(const Tree& tree);
 
 /// The tree that the JSON text states. Strict: what it does not know it refuses. `name` is the file's
 /// name for messages. Throws InventoryError that says where (line and column, or the JSON pointer of the
-/// offending value), why, and what is expected there.
-Tree readJson(std::string_view text, const std::string& name);
+/// offending value), why, and what is expected there. The origin of a value is its place in the file.
+Tree readJson(std::string_view text, const std::string& name, Detail detail = Detail::Values);
 
 }  // namespace Tarn::Inventory
 

@@ -25,14 +25,21 @@ class Writer {
 
   std::string write() {
     text_ = "{\n  \"format\": \"corvane-inventory\",\n  \"version\": 1,\n  \"unread\": [";
-    const char* separator = "\n";
-    for (const Unread& entry : tree_.unread()) {
-      text_ += separator;
-      text_ += "    {\"file\": " + jsonText(entry.file) + ", \"reason\": " + jsonText(entry.reason) +
-               ", \"remedy\": " + jsonText(entry.remedy) + '}';
-      separator = ",\n";
+    writeEntries(tree_.unread(), [](const Unread& entry) {
+      return members({{"file", entry.file}, {"reason", entry.reason}, {"remedy", entry.remedy}});
+    });
+    if (!tree_.disagreements().empty()) {
+      text_ += ",\n  \"disagreements\": [";
+      writeEntries(tree_.disagreements(), [](const Disagreement& entry) {
+        return members({{"path", entry.path},
+                        {"property", entry.property},
+                        {"chosen", entry.chosen},
+                        {"chosenSource", entry.chosenSource},
+                        {"other", entry.other},
+                        {"otherSource", entry.otherSource}});
+      });
     }
-    text_ += tree_.unread().empty() ? "],\n  \"nodes\": [" : "\n  ],\n  \"nodes\": [";
+    text_ += ",\n  \"nodes\": [";
     const auto size = static_cast<NodeIndex>(tree_.nodes().size());
     writeNodes(0, size, 1);
     text_ += "]\n}\n";
@@ -40,6 +47,27 @@ class Writer {
   }
 
  private:
+  using Members = std::initializer_list<std::pair<const char*, std::string_view>>;
+
+  static std::string members(Members members) {
+    std::string text;
+    for (const auto& [name, value] : members) {
+      text += (text.empty() ? "{" : ", ") + jsonText(name) + ": " + jsonText(value);
+    }
+    return text + '}';
+  }
+
+  // One on each line, and the bracket behind them.
+  template <class Entries, class Describe>
+  void writeEntries(const Entries& entries, Describe describe) {
+    const char* separator = "\n    ";
+    for (const auto& entry : entries) {
+      text_ += separator + describe(entry);
+      separator = ",\n    ";
+    }
+    text_ += entries.empty() ? "]" : "\n  ]";
+  }
+
   // The nodes of a stretch, each with what is below it; the list's brackets are the caller's.
   void writeNodes(NodeIndex begin, NodeIndex end, std::size_t depth) {
     if (begin == end) {

@@ -14,8 +14,9 @@ namespace Tarn::Inventory {
 ///     root:FILE     the same in one file (Archive.h)
 ///     json:FILE     a tree written as JSON (JsonTree.h)
 ///
+/// With Detail::WithOrigins the tree also tells of each value where it comes from.
 /// Throws InventoryError where the text names no source, or its source can not be read.
-Tree loadInventory(std::string_view specification);
+Tree loadInventory(std::string_view specification, Detail detail = Detail::Values);
 
 }  // namespace Tarn::Inventory
 

@@ -3,12 +3,16 @@
 #include <algorithm>
 #include <array>
 #include <string_view>
+#include <utility>
 
 #include "platform/instrumentation/CpuIdentity.h"
+#include "platform/instrumentation/PropertyTable.h"
 
 namespace Tarn::Inventory {
 
 namespace {
+
+using namespace NodeLexicon;
 
 constexpr std::string_view virtualMachine = "Virtual Machine";
 
@@ -30,39 +34,57 @@ static_assert(std::ranges::is_sorted(placeholders));
 // The model that emulators give their device tree.
 constexpr std::string_view emulatedBoard = "linux,dummy-virt";
 
-/// A text that the firmware gives; empty where nobody filled it in.
-std::string firmwareText(Machine& machine, const char* path) {
-  std::string text(machine.root().text(path).value_or(std::string_view()));
-  return std::ranges::binary_search(placeholders, text) ? std::string() : text;
+/// A text and the account of where it comes from.
+struct Found {
+  std::string text;
+  Facts::Explain explain;
+};
+
+Facts::Explain inFile(const Machine& machine, const char* path, const char* rule) {
+  return [&machine, path, rule] { return machine.originIn(path, rule); };
 }
 
-std::string deviceTreeModel(Machine& machine) {
-  std::string model(machine.root().text("proc/device-tree/model").value_or(std::string_view()));
-  return model == emulatedBoard ? model + " (" + std::string(virtualMachine) + ')' : model;
+/// A text that the firmware gives; empty where nobody filled it in.
+Found firmwareText(Machine& machine, const char* path) {
+  const std::string text(machine.root().text(path).value_or(std::string_view()));
+  return {isPlaceholder(text) ? std::string() : text, inFile(machine, path, "as it stands")};
+}
+
+Found deviceTreeModel(Machine& machine) {
+  constexpr const char* path = "proc/device-tree/model";
+  const std::string model(machine.root().text(path).value_or(std::string_view()));
+  if (model == emulatedBoard) {
+    return {model + " (" + std::string(virtualMachine) + ')',
+            inFile(machine, path, "the board that emulators provide: marked as a virtual machine")};
+  }
+  return {model, inFile(machine, path, "as it stands")};
 }
 
 // Without firmware that names a model the hypervisor is all that is known of the machine.
-std::string hypervisorModel(Machine& machine) {
-  const std::string type(machine.root().text("sys/hypervisor/type").value_or(std::string_view()));
+Found hypervisorModel(Machine& machine) {
+  constexpr const char* path = "sys/hypervisor/type";
+  const std::string type(machine.root().text(path).value_or(std::string_view()));
   if (!type.empty()) {
-    return std::string(virtualMachine) + " (" + type + ')';
+    return {std::string(virtualMachine) + " (" + type + ')', inFile(machine, path, "the hypervisor's name")};
   }
   const CpuInfo& info = machine.cpuInfo();
   const bool isVirtual = !info.cpus().empty() && identifyCpu(info, info.cpus().first()).hypervisor;
-  return std::string(isVirtual ? virtualMachine : std::string_view());
+  return {std::string(isVirtual ? virtualMachine : std::string_view()), [&machine] {
+            constexpr std::array<std::string_view, 1> fields = {"flags/hypervisor"};
+            return machine.originInCpuInfo(machine.cpuInfo().cpus().first(), fields,
+                                           "with the flag hypervisor it is a virtual machine");
+          }};
 }
 
-}  // namespace
-
-std::string readSystemModel(Machine& machine) {
-  std::string product = firmwareText(machine, "sys/class/dmi/id/product_name");
-  if (!product.empty()) {
+Found systemModel(Machine& machine) {
+  Found product = firmwareText(machine, "sys/class/dmi/id/product_name");
+  if (!product.text.empty()) {
     return product;
   }
   const std::string file = machine.root().fileName();
   const FileError error = machine.root().error();
-  std::string model = deviceTreeModel(machine);
-  if (!model.empty()) {
+  Found model = deviceTreeModel(machine);
+  if (!model.text.empty()) {
     return model;
   }
   if (error != 0) {
@@ -71,8 +93,19 @@ std::string readSystemModel(Machine& machine) {
   return hypervisorModel(machine);
 }
 
-std::string readSystemManufacturer(Machine& machine) {
-  return firmwareText(machine, "sys/class/dmi/id/sys_vendor");
+}  // namespace
+
+bool isPlaceholder(std::string_view text) {
+  return std::ranges::binary_search(placeholders, text);
+}
+
+Facts readSystemFacts(Machine& machine) {
+  Facts facts;
+  Found model = systemModel(machine);
+  facts.text(PropSystemModel, std::move(model.text), std::move(model.explain));
+  Found maker = firmwareText(machine, "sys/class/dmi/id/sys_vendor");
+  facts.text(PropSystemManufacturer, std::move(maker.text), std::move(maker.explain));
+  return facts;
 }
 
 }  // namespace Tarn::Inventory

@@ -1,18 +1,20 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_SYSTEMMODEL_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_SYSTEMMODEL_H
 
-#include <string>
+#include <string_view>
 
+#include "platform/instrumentation/Facts.h"
 #include "platform/instrumentation/Machine.h"
 
 namespace Tarn::Inventory {
 
-/// The computer's model: the firmware's product name, else the device tree's model, else "Virtual Machine"
-/// where the kernel says that it runs under a hypervisor. Empty where none of them is known.
-std::string readSystemModel(Machine& machine);
+/// What the kernel says of the computer: its model (the firmware's product name, else the device tree's
+/// model, else "Virtual Machine" where the kernel says that it runs under a hypervisor) and its maker. The
+/// origins look into the machine, which must outlive them.
+Facts readSystemFacts(Machine& machine);
 
-/// The computer's maker, as the firmware names it; empty where it does not.
-std::string readSystemManufacturer(Machine& machine);
+/// Whether a text is what firmware vendors leave in a field that they did not fill in.
+bool isPlaceholder(std::string_view text);
 
 }  // namespace Tarn::Inventory
 

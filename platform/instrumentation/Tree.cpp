@@ -1,6 +1,7 @@
 #include "platform/instrumentation/Tree.h"
 
 #include <algorithm>
+#include <tuple>
 
 namespace Tarn::Inventory {
 
@@ -27,6 +28,19 @@ NodeIndex Tree::find(std::string_view internalPath) const {
   const auto pathOf = [this](NodeIndex index) { return std::string_view(nodes_[index].internalPath); };
   const auto found = std::ranges::lower_bound(byPath_, internalPath, {}, pathOf);
   return found == byPath_.end() || pathOf(*found) != internalPath ? noNode : *found;
+}
+
+const Origin* Tree::origin(NodeIndex node, NodeLexicon::Properties id) const {
+  const auto keyOf = [](const OriginEntry& entry) { return std::tuple(entry.node, entry.id); };
+  const auto found = std::ranges::lower_bound(origins_, std::tuple(node, id), {}, keyOf);
+  return found == origins_.end() || keyOf(*found) != std::tuple(node, id) ? nullptr : &found->origin;
+}
+
+bool Tree::operator==(const Tree& other) const {
+  const auto contents = [](const Tree& tree) {
+    return std::tie(tree.nodes_, tree.numbers_, tree.texts_, tree.lists_, tree.unread_, tree.disagreements_);
+  };
+  return contents(*this) == contents(other);
 }
 
 }  // namespace Tarn::Inventory

@@ -70,6 +70,30 @@ struct Unread {
   bool operator==(const Unread&) const = default;
 };
 
+/// How much a source tells: the values alone, or with each of them where it comes from.
+enum class Detail { Values, WithOrigins };
+
+/// Where a value comes from, for people.
+struct Origin {
+  std::string source;  ///< file and place in it: "/proc/cpuinfo, processor 0",
+                       ///< "SMBIOS type 4, handle 0x0043, offset 0x12"
+  std::string raw;     ///< the datum as it stands there: "model name: Some CPU", "0x64 0x00"; empty where
+                       ///< the value says that something is not there
+  std::string rule;    ///< how the datum became the value: the table row or the computation
+  bool operator==(const Origin&) const = default;
+};
+
+/// Two sources that contradict each other, for people.
+struct Disagreement {
+  std::string path;      ///< of the node, as people see it
+  std::string property;  ///< its name as in propertyTable(), "status", or words where it is no one value
+  std::string chosen;    ///< the value that stands in the tree; "(none)" where there is none
+  std::string chosenSource;
+  std::string other;  ///< the value that does not
+  std::string otherSource;
+  bool operator==(const Disagreement&) const = default;
+};
+
 /// The inventory: system, processors, and below each processor its cores and caches. Immutable once
 /// built (by TreeBuilder), so any number of threads may read it.
 class Tree {
@@ -96,11 +120,29 @@ class Tree {
   }
 
   std::span<const Unread> unread() const { return unread_; }
+  std::span<const Disagreement> disagreements() const { return disagreements_; }
 
-  bool operator==(const Tree&) const = default;
+  /// Where a value of the node comes from; nullptr where the node has no such value, or the tree was read
+  /// with Detail::Values.
+  const Origin* origin(NodeIndex node, NodeLexicon::Properties id) const;
+  const Origin* statusOrigin(NodeIndex node) const { return origin(node, statusKey); }
+  const Origin* descriptionOrigin(NodeIndex node) const { return origin(node, descriptionKey); }
+
+  /// Whether both say the same; where it comes from does not count.
+  bool operator==(const Tree& other) const;
 
  private:
   friend class TreeBuilder;
+
+  // What is not a property and has an origin all the same. No property has these numbers.
+  static constexpr auto statusKey = static_cast<NodeLexicon::Properties>(0);
+  static constexpr auto descriptionKey = static_cast<NodeLexicon::Properties>(1);
+
+  struct OriginEntry {
+    NodeIndex node;
+    NodeLexicon::Properties id;
+    Origin origin;
+  };
 
   static constexpr unsigned int nodeTypes = 4;
   static std::optional<unsigned int> slot(NodeLexicon::NodeType type);
@@ -128,6 +170,8 @@ class Tree {
   std::array<std::vector<NodeIndex>, nodeTypes> byType_;
   std::vector<NodeIndex> byPath_;  // sorted by path
   std::vector<Unread> unread_;
+  std::vector<Disagreement> disagreements_;
+  std::vector<OriginEntry> origins_;  // sorted by node and number
 };
 
 }  // namespace Tarn::Inventory

@@ -98,6 +98,7 @@ TreeBuilder& TreeBuilder::node(NodeType type, std::string_view path) {
   added.numbers = endOf(tree_.numbers_);
   added.texts = endOf(tree_.texts_);
   added.lists = endOf(tree_.lists_);
+  lastValue_.reset();
   tree_.nodes_.push_back(std::move(added));
   tree_.byType_[*slot].push_back(index);
   for (NodeIndex up = index; up != noNode; up = tree_.nodes_[up].parent) {
@@ -108,16 +109,19 @@ TreeBuilder& TreeBuilder::node(NodeType type, std::string_view path) {
 
 TreeBuilder& TreeBuilder::status(unsigned int status) {
   last().status = status;
+  lastValue_ = Tree::statusKey;
   return *this;
 }
 
 TreeBuilder& TreeBuilder::description(std::string_view text) {
   last().description = validUtf8(text);
+  lastValue_ = Tree::descriptionKey;
   return *this;
 }
 
 TreeBuilder& TreeBuilder::cpus(CpuSet cpus) {
   last().cpus = std::move(cpus);
+  lastValue_.reset();
   return *this;
 }
 
@@ -125,6 +129,7 @@ TreeBuilder& TreeBuilder::number(Properties id, unsigned int value) {
   Node& node = last();
   checkProperty(node, id, PropertyKind::Number);
   insert(tree_.numbers_, node.numbers, node, id, value);
+  lastValue_ = id;
   return *this;
 }
 
@@ -132,6 +137,7 @@ TreeBuilder& TreeBuilder::text(Properties id, std::string_view value) {
   Node& node = last();
   checkProperty(node, id, PropertyKind::Text);
   insert(tree_.texts_, node.texts, node, id, validUtf8(value));
+  lastValue_ = id;
   return *this;
 }
 
@@ -139,6 +145,7 @@ TreeBuilder& TreeBuilder::list(Properties id, std::vector<unsigned int> value) {
   Node& node = last();
   checkProperty(node, id, PropertyKind::List);
   insert(tree_.lists_, node.lists, node, id, std::move(value));
+  lastValue_ = id;
   return *this;
 }
 
@@ -147,8 +154,26 @@ TreeBuilder& TreeBuilder::unread(const Unread& entry) {
   return *this;
 }
 
+TreeBuilder& TreeBuilder::disagreement(const Disagreement& entry) {
+  tree_.disagreements_.push_back({validUtf8(entry.path), validUtf8(entry.property), validUtf8(entry.chosen),
+                                  validUtf8(entry.chosenSource), validUtf8(entry.other), validUtf8(entry.otherSource)});
+  return *this;
+}
+
+void TreeBuilder::addOrigin(Origin origin) {
+  const Node& node = last();
+  if (!lastValue_) {
+    refuse(node.type, node.path(), "an origin follows the value that it explains");
+  }
+  const auto index = static_cast<NodeIndex>(tree_.nodes_.size() - 1);
+  tree_.origins_.push_back(
+      {index, *lastValue_, {validUtf8(origin.source), validUtf8(origin.raw), validUtf8(origin.rule)}});
+  lastValue_.reset();
+}
+
 Tree TreeBuilder::build() {
-  Tree tree = std::exchange(*this, TreeBuilder()).tree_;
+  Tree tree = std::exchange(*this, TreeBuilder(detail_)).tree_;
+  std::ranges::sort(tree.origins_, {}, [](const auto& entry) { return std::pair(entry.node, entry.id); });
   tree.byPath_.resize(tree.nodes_.size());
   for (NodeIndex index = 0; index < tree.byPath_.size(); ++index) {
     tree.byPath_[index] = index;

@@ -1,8 +1,9 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_TREEBUILDER_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_TREEBUILDER_H
 
-#include <string>
+#include <optional>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "platform/instrumentation/Tree.h"
@@ -20,6 +21,10 @@ namespace Tarn::Inventory {
 ///         .cache("P0.L3.0").number(PropCacheLevel, 5).cpus({0, 1})
 ///         .build();
 ///
+/// A builder that collects origins asks for each value where it comes from, right behind the value:
+///
+///     builder.number(PropMaxClockSpeed, 3500).from([&] { return fileOrigin(...); });
+///
 /// Processors go below the system, or stand at the top where there is none; cores and caches go below
 /// the processor added last. What can not be is refused with std::invalid_argument and a text that
 /// names the node: a second system, a system after a processor, a core without a processor, a path
@@ -27,6 +32,8 @@ namespace Tarn::Inventory {
 /// unknown, given twice, of another kind or of another node type.
 class TreeBuilder {
  public:
+  explicit TreeBuilder(Detail detail = Detail::Values) : detail_(detail) {}
+
   TreeBuilder& system(std::string_view path = "system");
   TreeBuilder& processor(std::string_view path);
   TreeBuilder& core(std::string_view path);
@@ -43,15 +50,31 @@ class TreeBuilder {
   TreeBuilder& text(NodeLexicon::Properties id, std::string_view value);
   TreeBuilder& list(NodeLexicon::Properties id, std::vector<unsigned int> value);
 
+  /// Says where the status, description or property given last comes from. `explain` returns an Origin;
+  /// it is called only if origins are collected.
+  template <class Explain>
+  TreeBuilder& from(Explain&& explain) {
+    if (detail_ == Detail::WithOrigins) {
+      addOrigin(std::forward<Explain>(explain)());
+    }
+    return *this;
+  }
+
   /// Reports something that the source could not read.
   TreeBuilder& unread(const Unread& entry);
+
+  /// Reports that two sources contradict each other.
+  TreeBuilder& disagreement(const Disagreement& entry);
 
   /// The tree; the builder is empty afterwards.
   Tree build();
 
  private:
   Node& last();
+  void addOrigin(Origin origin);
 
+  Detail detail_;
+  std::optional<NodeLexicon::Properties> lastValue_;  // what the next origin is about
   Tree tree_;
   NodeIndex system_ = noNode;
   NodeIndex processor_ = noNode;

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "host/cli/InventoryText.h"
+#include "platform/instrumentation/TreeBuilder.h"
 #include "tests/host/cli/Machines.h"
 
 namespace Corvcim {
@@ -159,6 +160,26 @@ TEST(InventoryText, ShowsEveryNodeWithItsProperties) {
             "    core P0.C0\n"
             "        description  x\\ty\n"
             "        cpus         0\n");
+}
+
+TEST(InventoryText, ShowsWhereSourcesDisagreeBehindWhatWasNotRead) {
+  const auto tree = Tarn::Inventory::TreeBuilder()
+                        .system()
+                        .unread({"/sys/a", "permission denied", "run as root"})
+                        .disagreement({"P0", "ProcessorName", "A\n", "/proc/cpuinfo", "B", "SMBIOS type 4"})
+                        .build();
+
+  EXPECT_EQ(writeInventoryText(tree),
+            "system system\n"
+            "\n"
+            "Not read:\n"
+            "  /sys/a: permission denied\n"
+            "    run as root\n"
+            "\n"
+            "Sources disagree:\n"
+            "  P0 ProcessorName\n"
+            "    A\\n  taken from /proc/cpuinfo\n"
+            "    B  said by SMBIOS type 4\n");
 }
 
 }  // namespace

@@ -7,6 +7,7 @@
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/LiveSource.h"
 #include "platform/instrumentation/Source.h"
+#include "tests/platform/instrumentation/Origins.h"
 #include "tests/platform/instrumentation/Scratch.h"
 
 namespace Tarn::Inventory {
@@ -30,6 +31,15 @@ TEST_P(Fixture, GivesItsWholeTree) {
 
 TEST_P(Fixture, TreeReadsBackAsTheSame) {
   EXPECT_EQ(loadInventory("json:" + file("tree.json")), loadInventory("root:" + file("root.txt")));
+}
+
+TEST_P(Fixture, TellsOfEveryValueWhereItComesFrom) {
+  for (const std::string& source : {"root:" + file("root.txt"), "json:" + file("tree.json")}) {
+    const Tree tree = loadInventory(source, Detail::WithOrigins);
+
+    EXPECT_EQ(unexplainedValues(tree), std::vector<std::string>()) << source;
+    EXPECT_EQ(tree, loadInventory(source)) << source;
+  }
 }
 
 TEST_P(Fixture, ArchiveIsWrittenBackAsTheSameFiles) {

@@ -55,6 +55,26 @@ TEST(JsonReader, ReadsWhatCouldNotBeRead) {
   EXPECT_EQ(tree.unread()[0], (Unread{"f", "r", "m"}));
 }
 
+TEST(JsonReader, TheOriginOfAValueIsItsPlaceInTheFile) {
+  const std::string text = document(R"({"type": "processor", "path": "P0", "status": 12, "description": "CPU",
+      "properties": {"Family": 179, "ProcessorName": "A \"B\"", "RequestedStatesSupported": [1, 2]}},
+      {"type": "processor", "path": "P1", "status": 1})");
+
+  const Tree tree = readJson(text, "box.json", Detail::WithOrigins);
+
+  const char* const rule = "as the file states it";
+  EXPECT_EQ(*tree.statusOrigin(0), (Origin{"box.json, /nodes/0/status", "12", rule}));
+  EXPECT_EQ(*tree.descriptionOrigin(0), (Origin{"box.json, /nodes/0/description", "\"CPU\"", rule}));
+  EXPECT_EQ(*tree.origin(0, PropFamily), (Origin{"box.json, /nodes/0/properties/Family", "179", rule}));
+  EXPECT_EQ(*tree.origin(0, PropProcessorName),
+            (Origin{"box.json, /nodes/0/properties/ProcessorName", R"("A \"B\"")", rule}));
+  EXPECT_EQ(*tree.origin(0, PropRequestedStatesSupported),
+            (Origin{"box.json, /nodes/0/properties/RequestedStatesSupported", "[1,2]", rule}));
+  EXPECT_EQ(tree.statusOrigin(1)->source, "box.json, /nodes/1/status");
+  EXPECT_EQ(tree.descriptionOrigin(1), nullptr);
+  EXPECT_EQ(tree, readJson(text, "box.json"));
+}
+
 TEST(JsonReader, ReadsTheExampleOfTheDocumentation) {
   const std::string page = contentsOf(CORVANE_SOURCE_DIR "/docs/inventory.md");
   const std::string fence = "```json\n";
@@ -107,7 +127,13 @@ INSTANTIATE_TEST_SUITE_P(
         Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "note": 1})", ", /note",
                "is not a member that is known here"},
         Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "unread": [{"file": "f"}]})",
-               ", /unread/0/reason", "is missing"}));
+               ", /unread/0/reason", "is missing"},
+        Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "disagreements": 1})", ", /disagreements",
+               "is not a list"},
+        Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "disagreements": [{"path": "P0"}]})",
+               ", /disagreements/0/property", "is missing"},
+        Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "disagreements": [{"who": "P0"}]})",
+               ", /disagreements/0/who", "is not a member that is known here"}));
 
 INSTANTIATE_TEST_SUITE_P(
     Nodes, BrokenJson,

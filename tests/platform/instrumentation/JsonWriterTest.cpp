@@ -65,6 +65,26 @@ TEST(JsonWriter, IsReadBackAsTheSameTree) {
   EXPECT_EQ(readJson(writeJson(withoutSystem), "x"), withoutSystem);
 }
 
+TEST(JsonWriter, WritesDisagreementsWhereThereAreSome) {
+  const Tree tree = TreeBuilder()
+                        .disagreement({"P0", "Family", "198", "/proc/cpuinfo", "205", "SMBIOS type 4"})
+                        .disagreement({"P1", "status", "1", "a", "16", "b"})
+                        .build();
+
+  EXPECT_EQ(writeJson(tree), R"json({
+  "format": "corvane-inventory",
+  "version": 1,
+  "unread": [],
+  "disagreements": [
+    {"path": "P0", "property": "Family", "chosen": "198", "chosenSource": "/proc/cpuinfo", "other": "205", "otherSource": "SMBIOS type 4"},
+    {"path": "P1", "property": "status", "chosen": "1", "chosenSource": "a", "other": "16", "otherSource": "b"}
+  ],
+  "nodes": []
+}
+)json");
+  EXPECT_EQ(readJson(writeJson(tree), "x"), tree);
+}
+
 TEST(JsonWriter, StrangeBytesNeverBreakIt) {
   std::string strange;
   for (int byte = 0; byte < 256; ++byte) {

@@ -50,6 +50,8 @@ class KernelFiles {
   KernelFiles& fail(const std::string& path, FileError error);
   KernelFiles& remove(const std::string& prefix);
 
+  const MemoryFileSystem::Files& files() const { return files_; }
+
   /// The tree that the live source reads from them.
   Tree tree() const;
 

@@ -85,6 +85,58 @@ TEST(TreeBuilder, KeepsTextsAsValidUtf8) {
   EXPECT_EQ(*tree.text(tree.node(0), PropSystemModel), "B\xEF\xBF\xBD");
 }
 
+TEST(TreeBuilder, KeepsTheOriginOfEachValueWhereOriginsAreCollected) {
+  const auto origin = [](const char* source) { return [source] { return Origin{source, "raw", "rule"}; }; };
+  const Tree tree = TreeBuilder(Detail::WithOrigins)
+                        .processor("P0")
+                        .status(Status::offline)
+                        .from(origin("status"))
+                        .description("Processor 0")
+                        .from(origin("description"))
+                        .number(PropMaxClockSpeed, 3000)
+                        .from(origin("clock"))
+                        .number(PropDataWidth, 64)
+                        .text(PropProcessorName, "Some CPU")
+                        .from(origin("name\xFF"))
+                        .list(PropRequestedStatesSupported, {1})
+                        .from(origin("states"))
+                        .core("P0.C0")
+                        .build();
+
+  EXPECT_EQ(*tree.statusOrigin(0), (Origin{"status", "raw", "rule"}));
+  EXPECT_EQ(tree.descriptionOrigin(0)->source, "description");
+  EXPECT_EQ(tree.origin(0, PropMaxClockSpeed)->source, "clock");
+  EXPECT_EQ(tree.origin(0, PropProcessorName)->source, "name\xEF\xBF\xBD");
+  EXPECT_EQ(tree.origin(0, PropRequestedStatesSupported)->source, "states");
+  EXPECT_EQ(tree.origin(0, PropDataWidth), nullptr) << "none was given";
+  EXPECT_EQ(tree.statusOrigin(1), nullptr);
+  EXPECT_EQ(tree.origin(noNode, PropDataWidth), nullptr);
+}
+
+TEST(TreeBuilder, AsksForNoOriginUnlessOriginsAreCollected) {
+  const Tree tree =
+      TreeBuilder().processor("P0").status(1).from([]() -> Origin { throw std::logic_error("was asked"); }).build();
+
+  EXPECT_EQ(tree.statusOrigin(0), nullptr);
+}
+
+TEST(TreeBuilder, OriginsDoNotCountWhenTreesAreCompared) {
+  const auto make = [](Detail detail) {
+    return TreeBuilder(detail).system().status(1).from([] { return Origin{"a", "b", "c"}; }).build();
+  };
+
+  EXPECT_EQ(make(Detail::WithOrigins), make(Detail::Values));
+}
+
+TEST(TreeBuilder, DisagreementsCountWhenTreesAreCompared) {
+  const Disagreement entry{"P0", "Family", "1", "here", "2", "there"};
+  const Tree tree = TreeBuilder().system().disagreement(entry).build();
+
+  ASSERT_EQ(tree.disagreements().size(), 1U);
+  EXPECT_EQ(tree.disagreements()[0], entry);
+  EXPECT_NE(tree, TreeBuilder().system().build());
+}
+
 TEST(TreeBuilder, IsEmptyAfterBuilding) {
   TreeBuilder builder;
   const Tree first = builder.system().processor("P0").build();
@@ -144,6 +196,16 @@ INSTANTIATE_TEST_SUITE_P(
                 [](TreeBuilder& b) { b.processor("P0").list(PropFamily, {1}); }},
         Refusal{"processor \"P0\": property Family is given twice",
                 [](TreeBuilder& b) { b.processor("P0").number(PropFamily, 1).number(PropFamily, 1); }},
+        Refusal{"processor \"P0\": an origin follows the value that it explains",
+                [](TreeBuilder& b) {
+                  b = TreeBuilder(Detail::WithOrigins);
+                  b.processor("P0").from([] { return Origin(); });
+                }},
+        Refusal{"processor \"P0\": an origin follows the value that it explains",
+                [](TreeBuilder& b) {
+                  b = TreeBuilder(Detail::WithOrigins);
+                  b.processor("P0").status(1).cpus({0}).from([] { return Origin(); });
+                }},
         Refusal{"inventory: there is no node yet to describe", [](TreeBuilder& b) { b.status(1); }}));
 
 }  // namespace

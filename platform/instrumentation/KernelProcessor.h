@@ -1,0 +1,26 @@
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNELPROCESSOR_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_KERNELPROCESSOR_H
+
+#include <optional>
+
+#include "platform/instrumentation/CpuIdentity.h"
+#include "platform/instrumentation/Facts.h"
+#include "platform/instrumentation/KernelView.h"
+
+namespace Tarn::Inventory {
+
+/// What the kernel says of a processor package: its words on the package's first online CPU, or where it
+/// has several kinds of core, on the first of each kind.
+struct KernelProcessor {
+  CpuIdentity identity;  ///< of the first online CPU; everything unknown where all are offline
+  Facts facts;           ///< its properties; the origins look into the view, which must outlive them
+};
+
+KernelProcessor readKernelProcessor(const KernelView& kernel, const Package& package);
+
+/// What tells that these CPUs are one processor.
+Origin originOfPackage(const KernelView& kernel, const Package& package, std::string rule);
+
+}  // namespace Tarn::Inventory
+
+#endif
