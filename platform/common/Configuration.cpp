@@ -6,17 +6,15 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
-#include <optional>
 #include <system_error>
 
 #include "platform/common/Ascii.h"
-#include "platform/common/Environment.h"
+#include "platform/common/ConfigurationFile.h"
 #include "platform/common/FileDescriptor.h"
 
 namespace Tarn::Common {
 namespace {
 
-constexpr std::string_view kDefaultFile = "/etc/corvane/corvane.conf";
 constexpr std::size_t kLargestFile = 1 << 20;
 
 constexpr std::array<std::string_view, 12> kKeys = {
@@ -80,17 +78,6 @@ Content readContent(const std::string& file) {
   return {{}, "is larger than a configuration file can be (1 MiB)"};
 }
 
-Configuration readOfThisProcess() {
-  if (const std::optional<std::string> file = environmentOverride("CORVANE_CONFIG")) {
-    return Configuration::read(*file);
-  }
-  const std::string file(kDefaultFile);
-  if (access(file.c_str(), F_OK) != 0) {
-    return {};
-  }
-  return Configuration::read(file);
-}
-
 }  // namespace
 
 Configuration Configuration::parse(std::string_view text, const std::string& file) {
@@ -137,7 +124,7 @@ const Setting* Configuration::find(std::string_view key) const {
 }
 
 const Configuration& configuration() {
-  static const Configuration ofThisProcess = readOfThisProcess();
+  static const Configuration ofThisProcess = ConfigurationFile::ofThisProcess().read();
   return ofThisProcess;
 }
 

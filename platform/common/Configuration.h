@@ -43,9 +43,9 @@ class Configuration {
   std::vector<ConfigurationProblem> problems_;
 };
 
-/// The configuration of this process, read at the first call: the file that CORVANE_CONFIG names, else
-/// /etc/corvane/corvane.conf where there is one. Safe from several threads. Its problems are reported by
-/// the logger, with the first message.
+/// The configuration of this process as it was at the first call (see ConfigurationFile::ofThisProcess), for settings
+/// that stay as they are while the process runs. Safe from several threads. Its problems are reported by the logger,
+/// which follows the file.
 const Configuration& configuration();
 
 }  // namespace Tarn::Common

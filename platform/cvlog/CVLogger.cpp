@@ -1,7 +1,10 @@
 #include <cvlog/CVLogger.h>
 
+#include <atomic>
 #include <cerrno>
+#include <ctime>
 #include <exception>
+#include <limits>
 
 #include "platform/cvlog/Logger.h"
 
@@ -24,6 +27,15 @@ std::string_view textOrNothing(const char* text) {
   return text == nullptr ? std::string_view() : text;
 }
 
+constexpr unsigned kNever = std::numeric_limits<unsigned>::max();
+
+/// Seconds of a clock that nobody sets, read without a system call.
+unsigned secondsNow() {
+  timespec now{};
+  clock_gettime(CLOCK_MONOTONIC_COARSE, &now);
+  return static_cast<unsigned>(now.tv_sec);
+}
+
 using Deliver = void (Logger::*)(const Message&);
 
 void deliver(Deliver operation, const char* function, const char* file, int line, const std::string& component,
@@ -44,6 +56,23 @@ void deliver(Deliver operation, const char* function, const char* file, int line
 }
 
 }  // namespace
+
+void CVLogger::followConfiguration() {
+  static std::atomic<unsigned> lastLook{kNever};
+  const unsigned now = secondsNow();
+  if (lastLook.load(std::memory_order_relaxed) == now) [[likely]] {
+    return;
+  }
+  if (lastLook.exchange(now, std::memory_order_relaxed) == now) {
+    return;
+  }
+  const KeptErrno kept;
+  try {
+    Logger::instance().followConfiguration();
+  } catch (const std::exception&) {
+    // Out of memory: the configuration in force stays until the file changes again.
+  }
+}
 
 void CVLogger::deliverToLog(const char* function, const char* file, int line, const std::string& component, int level,
                             const std::string& text) {

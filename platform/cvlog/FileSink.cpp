@@ -11,6 +11,7 @@
 #include <stdexcept>
 #include <system_error>
 
+#include "platform/cvlog/HeldFlag.h"
 #include "platform/cvlog/Level.h"
 #include "platform/cvlog/SystemLogSink.h"
 #include "platform/cvlog/WriteLine.h"
@@ -98,25 +99,6 @@ class FileLock {
 
  private:
   int descriptor_;
-  bool isHeld_;
-};
-
-/// Holds a flag that was free; whoever finds it taken goes on without it.
-class HeldFlag {
- public:
-  explicit HeldFlag(std::atomic_flag& flag) : flag_(flag), isHeld_(!flag.test_and_set(std::memory_order_acquire)) {}
-  HeldFlag(const HeldFlag&) = delete;
-  HeldFlag& operator=(const HeldFlag&) = delete;
-  ~HeldFlag() {
-    if (isHeld_) {
-      flag_.clear(std::memory_order_release);
-    }
-  }
-
-  explicit operator bool() const { return isHeld_; }
-
- private:
-  std::atomic_flag& flag_;
   bool isHeld_;
 };
 

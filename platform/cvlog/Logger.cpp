@@ -2,10 +2,12 @@
 
 #include <limits>
 #include <stdexcept>
+#include <string_view>
 #include <utility>
 
 #include "platform/common/Environment.h"
 #include "platform/cvlog/FileSink.h"
+#include "platform/cvlog/HeldFlag.h"
 #include "platform/cvlog/RateLimitedSink.h"
 #include "platform/cvlog/StandardErrorSink.h"
 #include "platform/cvlog/SystemLogSink.h"
@@ -13,7 +15,7 @@
 namespace CVLog {
 namespace {
 
-using Tarn::Common::configuration;
+using Tarn::Common::ConfigurationFile;
 using Tarn::Common::ConfigurationProblem;
 using Tarn::Common::environmentOverride;
 
@@ -42,21 +44,23 @@ std::unique_ptr<Sink> openSink(const SinkSettings& settings) {
   return sink;
 }
 
+constexpr std::string_view kComponent = "Corvane.Logger";
+constexpr std::string_view kThisFile = "Logger.cpp";
+
 }  // namespace
 
 Logger& Logger::instance() {
-  static Logger logger(
-      makeSettings(configuration(), environmentOverride("CORVANE_LOG"), environmentOverride("CORVANE_TRACE")));
+  static Logger logger(ConfigurationFile::ofThisProcess(), environmentOverride("CORVANE_LOG"),
+                       environmentOverride("CORVANE_TRACE"));
   return logger;
 }
 
-Logger::Logger(const Settings& settings) {
-  std::vector<ConfigurationProblem> problems = settings.problems;
-  log_ = makeRoute(settings.log, defaultLog(), problems);
-  trace_ = makeRoute(settings.trace, defaultTrace(), problems);
-  report(problems);
-  CVLogger::logThreshold_.store(log_.threshold(), std::memory_order_relaxed);
-  CVLogger::traceThreshold_.store(trace_.threshold(), std::memory_order_relaxed);
+Logger::Logger(ConfigurationFile file, std::optional<std::string> logOverride, std::optional<std::string> traceOverride)
+    : file_(std::move(file)),
+      logOverride_(std::move(logOverride)),
+      traceOverride_(std::move(traceOverride)),
+      routes_(makeRoutes(nullptr)) {
+  setThresholds(routes_.inForce());
 }
 
 Logger::~Logger() {
@@ -64,17 +68,48 @@ Logger::~Logger() {
   CVLogger::traceThreshold_.store(kNothing, std::memory_order_relaxed);
 }
 
+void Logger::followConfiguration() {
+  const HeldFlag following(isFollowing_);
+  if (!following) {
+    return;
+  }
+  if (file_.hasChanged()) {
+    routes_.replace(makeRoutes(&routes_.inForce()));
+    setThresholds(routes_.inForce());
+    noteThatFileWasRead();
+  }
+  routes_.discardUnused();
+}
+
 int Logger::Route::threshold() const {
   return sink ? level : kNothing;
 }
 
-Logger::Route Logger::makeRoute(const SinkSettings& wanted, const SinkSettings& fallback,
+void Logger::setThresholds(const Routes& routes) {
+  CVLogger::logThreshold_.store(routes.log.threshold(), std::memory_order_relaxed);
+  CVLogger::traceThreshold_.store(routes.trace.threshold(), std::memory_order_relaxed);
+}
+
+std::unique_ptr<const Logger::Routes> Logger::makeRoutes(const Routes* before) {
+  const Settings settings = makeSettings(file_.read(), logOverride_, traceOverride_);
+  std::vector<ConfigurationProblem> problems = settings.problems;
+  auto routes = std::make_unique<Routes>();
+  routes->log = makeRoute(settings.log, defaultLog(), before != nullptr ? &before->log : nullptr, problems);
+  routes->trace = makeRoute(settings.trace, defaultTrace(), before != nullptr ? &before->trace : nullptr, problems);
+  report(problems);
+  return routes;
+}
+
+Logger::Route Logger::makeRoute(const SinkSettings& wanted, const SinkSettings& fallback, const Route* before,
                                 std::vector<ConfigurationProblem>& problems) {
+  if (before != nullptr && before->wanted == wanted && !before->isFallback) {
+    return *before;
+  }
   try {
-    return {wanted.level, openSink(wanted)};
+    return {.wanted = wanted, .isFallback = false, .level = wanted.level, .sink = openSink(wanted)};
   } catch (const std::runtime_error& error) {
     problems.push_back({error.what(), "the default destination is used"});
-    return {fallback.level, openSink(fallback)};
+    return {.wanted = wanted, .isFallback = true, .level = fallback.level, .sink = openSink(fallback)};
   }
 }
 
@@ -88,18 +123,34 @@ void Logger::report(const std::vector<ConfigurationProblem>& problems) {
     const std::string text = "Configuration: " + problem.where + ": " + problem.why;
     sink->write({.time = std::chrono::system_clock::now(),
                  .level = kLevelError,
-                 .component = "Corvane.Logger",
+                 .component = kComponent,
                  .function = __func__,
-                 .file = "Logger.cpp",
+                 .file = kThisFile,
                  .line = __LINE__,
                  .text = text});
   }
 }
 
-void Logger::deliver(const Route& route, const Message& message) {
-  if (route.sink && message.level >= route.level) {
-    route.sink->write(message);
-  }
+void Logger::noteThatFileWasRead() {
+  const std::string text = "Configuration: " + file_.path() + " was read again";
+  const Message message = {.time = std::chrono::system_clock::now(),
+                           .level = kLevelInfo,
+                           .component = kComponent,
+                           .function = __func__,
+                           .file = kThisFile,
+                           .line = __LINE__,
+                           .text = text};
+  log(message);
+  trace(message);
+}
+
+void Logger::deliver(Route Routes::*sink, const Message& message) {
+  routes_.with([&](const Routes& routes) {
+    const Route& route = routes.*sink;
+    if (route.sink && message.level >= route.level) {
+      route.sink->write(message);
+    }
+  });
 }
 
 }  // namespace CVLog

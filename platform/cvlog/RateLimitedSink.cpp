@@ -1,5 +1,6 @@
 #include "platform/cvlog/RateLimitedSink.h"
 
+#include <exception>
 #include <string>
 #include <utility>
 
@@ -13,22 +14,37 @@ using std::chrono::system_clock;
 RateLimitedSink::RateLimitedSink(std::unique_ptr<Sink> target, unsigned perMinute)
     : target_(std::move(target)), perMinute_(perMinute) {}
 
+RateLimitedSink::~RateLimitedSink() {
+  if (dropped_ == 0) {
+    return;
+  }
+  try {
+    noteDropped(system_clock::now(), dropped_);
+  } catch (const std::exception&) {
+    // Out of memory, and nobody left to tell.
+  }
+}
+
 void RateLimitedSink::write(const Message& message) {
   const Verdict verdict = judge(message.time);
   if (verdict.droppedBefore != 0) {
-    const std::string text = std::to_string(verdict.droppedBefore) + " messages were dropped; the limit is " +
-                             std::to_string(perMinute_) + " a minute";
-    target_->write({.time = message.time,
-                    .level = kLevelWarning,
-                    .component = "Corvane.Logger",
-                    .function = __func__,
-                    .file = "RateLimitedSink.cpp",
-                    .line = __LINE__,
-                    .text = text});
+    noteDropped(message.time, verdict.droppedBefore);
   }
   if (verdict.passes) {
     target_->write(message);
   }
+}
+
+void RateLimitedSink::noteDropped(system_clock::time_point time, unsigned count) {
+  const std::string text =
+      std::to_string(count) + " messages were dropped; the limit is " + std::to_string(perMinute_) + " a minute";
+  target_->write({.time = time,
+                  .level = kLevelWarning,
+                  .component = "Corvane.Logger",
+                  .function = __func__,
+                  .file = "RateLimitedSink.cpp",
+                  .line = __LINE__,
+                  .text = text});
 }
 
 RateLimitedSink::Verdict RateLimitedSink::judge(system_clock::time_point time) {

@@ -9,10 +9,14 @@
 namespace CVLog {
 
 /// Passes on so many messages a minute and drops the rest. The first message of a later minute is
-/// preceded by a note that says how many were dropped.
+/// preceded by a note that says how many were dropped; where none comes, the note ends the output.
 class RateLimitedSink final : public Sink {
  public:
   RateLimitedSink(std::unique_ptr<Sink> target, unsigned perMinute);
+
+  RateLimitedSink(const RateLimitedSink&) = delete;
+  RateLimitedSink& operator=(const RateLimitedSink&) = delete;
+  ~RateLimitedSink() override;
 
   void write(const Message& message) override;
 
@@ -23,6 +27,7 @@ class RateLimitedSink final : public Sink {
     unsigned droppedBefore;
   };
   Verdict judge(std::chrono::system_clock::time_point time);
+  void noteDropped(std::chrono::system_clock::time_point time, unsigned count);
 
   const std::unique_ptr<Sink> target_;
   const unsigned perMinute_;

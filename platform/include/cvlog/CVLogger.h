@@ -10,14 +10,18 @@ namespace CVLog {
 /// The agent's logger: two sinks, log and trace, each with a level threshold and a destination of its own.
 ///
 /// Levels rise with importance; a sink takes the messages that reach its threshold. Both are configured
-/// with the first message, never at load. All calls are safe from several threads, throw nothing and do
-/// not wait but for the destination's own write. A message that its sink does not take costs one comparison.
+/// with the first message, never at load, and follow their configuration from then on. All calls are safe
+/// from several threads, throw nothing and do not wait but for the destination's own write. A message that
+/// its sink does not take costs one comparison, and those that look after the configuration a coarse clock.
 class CVLogger {
  public:
   /// Delivers one message to the log sink. `extra`, `extraLength` and `reserved` are kept for the
   /// agent's binary attachments and are not used.
   static void logLevelMessage(const char* function, const char* file, int line, const std::string& component, int level,
                               char* /*extra*/, int /*extraLength*/, int /*reserved*/, const std::string& text) {
+    if (level >= kLooksAfterConfiguration) {
+      followConfiguration();
+    }
     if (logTakes(level)) [[unlikely]] {
       deliverToLog(function, file, line, component, level, text);
     }
@@ -39,6 +43,10 @@ class CVLogger {
  private:
   friend class Logger;
 
+  // Once a second the first message to the log that has at least this level looks whether the configuration
+  // has changed. Each operation of a provider begins with one; the many below would only pay for the clock.
+  static constexpr int kLooksAfterConfiguration = 4000;
+  static void followConfiguration();
   static void deliverToLog(const char* function, const char* file, int line, const std::string& component, int level,
                            const std::string& text);
   static void deliverToTrace(const char* function, const char* file, int line, const std::string& component, int level,

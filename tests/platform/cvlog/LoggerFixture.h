@@ -46,6 +46,12 @@ class LoggerProcess : public testing::Test {
     return text;
   }
 
+  /// What the configuration changes into, as an editor does it: another file in the place of the first.
+  void reconfigure(const std::string& text) const {
+    std::ofstream(path("next.conf")) << text;
+    std::filesystem::rename(path("next.conf"), path("corvane.conf"));
+  }
+
   std::string directory_ = testing::TempDir() + "logger_" + std::to_string(getpid());
 };
 

@@ -122,14 +122,6 @@ TEST_F(Logger, KnowsWhichLevelsItTakesOnceItIsConfigured) {
   EXPECT_FALSE(CVLogger::traceTakes(6000));
 }
 
-TEST_F(Logger, ReadsItsConfigurationAtTheFirstMessageAndNeverAgain) {
-  configure("log.destination = none\n");
-  log(6000, "lost");
-  configure("log.destination = syslog\n");
-  log(6000, "lost, too");
-  EXPECT_THAT(recordedSystemLog(), IsEmpty());
-}
-
 TEST_F(Logger, ReportsABrokenConfigurationOnceAndObeysTheRest) {
   configure("# a comment\nlog.levle = debug\nlog.level = 4000\nlog.destination = printer\n");
   log(4000, "logged");

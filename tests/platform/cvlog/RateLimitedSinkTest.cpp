@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -27,11 +28,11 @@ class RecordingSink : public CVLog::Sink {
 class RateLimit : public testing::Test {
  protected:
   void writeAt(int second, std::string_view text) {
-    sink_.write({.time = system_clock::time_point(seconds(1'000'000 + second)), .level = 6000, .text = text});
+    sink_->write({.time = system_clock::time_point(seconds(1'000'000 + second)), .level = 6000, .text = text});
   }
 
   std::vector<std::string> texts_;
-  RateLimitedSink sink_{std::make_unique<RecordingSink>(texts_), 2};
+  std::optional<RateLimitedSink> sink_{std::in_place, std::make_unique<RecordingSink>(texts_), 2U};
 };
 
 TEST_F(RateLimit, PassesSoManyMessagesAMinute) {
@@ -48,6 +49,21 @@ TEST_F(RateLimit, SaysInTheNextMinuteHowManyWereDropped) {
   writeAt(60, "f");
   writeAt(61, "g");
   EXPECT_THAT(texts_, ElementsAre("a", "b", "3 messages were dropped; the limit is 2 a minute", "f", "g"));
+}
+
+TEST_F(RateLimit, SaysAtItsEndHowManyWereDroppedSinceItSaidSo) {
+  for (const char* text : {"a", "b", "c", "d", "e"}) {
+    writeAt(0, text);
+  }
+  sink_.reset();
+  EXPECT_THAT(texts_, ElementsAre("a", "b", "3 messages were dropped; the limit is 2 a minute"));
+}
+
+TEST_F(RateLimit, EndsSilentlyWhereNothingWasDropped) {
+  writeAt(0, "a");
+  writeAt(0, "b");
+  sink_.reset();
+  EXPECT_THAT(texts_, ElementsAre("a", "b"));
 }
 
 TEST_F(RateLimit, SurvivesAClockThatIsSetBack) {
