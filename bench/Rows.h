@@ -68,6 +68,7 @@ void addLogRows();
 void addCollectionRows();
 void addProviderRows();
 void addTreeRows();
+void addSmbiosRows();
 void addProcessRows();
 
 }  // namespace Corvane::Bench

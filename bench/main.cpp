@@ -43,6 +43,7 @@ int main(int argc, char** argv) {
   Corvane::Bench::addProviderRows();
   Corvane::Bench::addCollectionRows();
   Corvane::Bench::addTreeRows();
+  Corvane::Bench::addSmbiosRows();
   Corvane::Bench::addProcessRows();
   Corvane::Bench::runRows(abi, json);
 }

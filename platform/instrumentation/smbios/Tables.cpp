@@ -41,11 +41,19 @@ void checkCaches(const Tables& tables, Problems& problems) {
   }
 }
 
+// Records are large: moving them each time a list grows would take longer than decoding them.
+template <class Record>
+void reserveFor(std::uint8_t type, const std::vector<Structure>& structures, std::vector<Record>& records) {
+  records.reserve(static_cast<std::size_t>(std::ranges::count(structures, type, &Structure::type)));
+}
+
 Tables decodeTable(const EntryPoint& entryPoint, Bytes table, Problems& problems) {
   Tables tables;
   tables.entryPoint = entryPoint;
   tables.structures = walk(entryPoint, table, problems);
   checkHandles(tables.structures, problems);
+  reserveFor(StructureType::processor, tables.structures, tables.processors);
+  reserveFor(StructureType::cache, tables.structures, tables.caches);
   for (const Structure& structure : tables.structures) {
     switch (structure.type) {
       case StructureType::system:
