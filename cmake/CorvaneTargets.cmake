@@ -5,7 +5,8 @@ target_compile_options(corvane_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
   # Brokers load provider libraries with RTLD_GLOBAL: whatever is exported can be interposed, and a
   # unique-linkage symbol keeps the library mapped after dlclose.
-  -fvisibility=hidden $<$<COMPILE_LANGUAGE:CXX>:-fvisibility-inlines-hidden> -fno-gnu-unique)
+  -fvisibility=hidden $<$<COMPILE_LANGUAGE:CXX>:-fvisibility-inlines-hidden>
+  $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-fno-gnu-unique>)  # clang makes no such symbols
 if(CMAKE_CXX_COMPILER_ID STREQUAL GNU AND CMAKE_CXX_COMPILER_VERSION VERSION_LESS 13)
   # GCC 12 sees overlapping copies in every concatenation of a literal and a std::string (its bug 105651).
   target_compile_options(corvane_options INTERFACE -Wno-restrict)
@@ -27,6 +28,13 @@ if(CORVANE_SANITIZE)
     # Optimizing what the sanitizers add takes most of the compile time, and the tests are small.
     -O0 -g1)
   target_link_options(corvane_options INTERFACE -fsanitize=${CORVANE_SANITIZE})
+endif()
+
+if(CORVANE_FUZZ)
+  target_compile_options(corvane_options INTERFACE
+    -Wno-sign-conversion  # part of clang's -Wconversion, not of GCC's
+    -fsanitize=fuzzer-no-link,address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer -O1 -g1)
+  target_link_options(corvane_options INTERFACE -fsanitize=address,undefined)
 endif()
 
 # The product's sources, compiled against one implementation of the six platform headers.

@@ -19,6 +19,7 @@ class MemoryFileSystem final : public FileSystem {
   struct Entry {
     std::string contents;
     FileError error = 0;  ///< what an attempt to read it gives
+    bool operator==(const Entry&) const = default;
   };
   using Files = std::map<std::string, Entry, std::less<>>;
 
