@@ -19,6 +19,7 @@ export CCACHE_SLOPPINESS=pch_defines,time_macros # what it takes to cache with p
 
 # Debian packages, by what they are needed for; docs/dependencies.md says why each is there.
 build_packages=(cmake g++ g++-multilib ninja-build nlohmann-json3-dev)
+hwloc_packages=(libhwloc-dev) # corvcim builds without it, and then says so
 test_packages=(googletest)
 check_packages=(clang-format)
 tidy_packages=(clang-tidy)

@@ -3,9 +3,11 @@
 #include <tarn/Common.h>
 
 #include <cstdlib>
+#include <memory>
 
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"
+#include "host/cli/CrashReport.h"
 #include "host/cli/DiffCommand.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
@@ -15,6 +17,7 @@
 #include "host/cli/TreeDot.h"
 #include "host/cli/TreeSvg.h"
 #include "host/cli/TreeText.h"
+#include "host/hwloc/HwlocSource.h"
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/ProcessTree.h"
 
@@ -34,9 +37,19 @@ void setEnvironment(const Options& options) {
   }
 }
 
-std::string inventoryOutput(Format format) {
-  const auto tree = Tarn::Inventory::processTree();
-  return format == Format::Json ? Tarn::Inventory::writeJson(*tree) : writeInventoryText(*tree);
+std::shared_ptr<const Tarn::Inventory::Tree> inventoryTree(const Options& options) {
+  if (options.description.empty()) {
+    return Tarn::Inventory::processTree();
+  }
+  // hwloc trusts that a description is complete.
+  const CrashReport report("can not read the inventory: " + options.description +
+                           ": hwloc crashed on it; correct the description");
+  return std::make_shared<const Tarn::Inventory::Tree>(readHwloc(options.description));
+}
+
+std::string inventoryOutput(const Options& options) {
+  const auto tree = inventoryTree(options);
+  return options.format == Format::Json ? Tarn::Inventory::writeJson(*tree) : writeInventoryText(*tree);
 }
 
 std::string treeOutput(Format format, std::size_t width) {
@@ -59,7 +72,7 @@ Outcome runCommand(const Options& options, std::size_t width) {
     case Verb::Classes:
       return {writeClassList(options.format), {}};
     case Verb::Inventory:
-      return {inventoryOutput(options.format), {}};
+      return {inventoryOutput(options), {}};
     case Verb::Diff:
       return diffInventories(options);
     case Verb::Tree:

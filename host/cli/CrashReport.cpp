@@ -17,6 +17,10 @@ std::array<char, 512> message;
 std::size_t length = 0;
 std::array<struct sigaction, signals.size()> previous;
 
+// A stack that has run out has no room for the handler.
+std::array<std::byte, std::size_t{64} * 1024> ownStack;
+stack_t previousStack;
+
 void append(std::string_view text) {
   constexpr std::size_t roomForLineEnd = 1;
   length += text.copy(message.data() + length, message.size() - roomForLineEnd - length);
@@ -34,8 +38,13 @@ CrashReport::CrashReport(std::string_view text) {
   append("corvcim: ");
   append(text);
   message[length++] = '\n';
+  stack_t stack = {};
+  stack.ss_sp = ownStack.data();
+  stack.ss_size = ownStack.size();
+  sigaltstack(&stack, &previousStack);
   struct sigaction action = {};
   action.sa_handler = report;
+  action.sa_flags = SA_ONSTACK;
   for (std::size_t i = 0; i < signals.size(); ++i) {
     sigaction(signals[i], &action, &previous[i]);
   }
@@ -45,6 +54,7 @@ CrashReport::~CrashReport() {
   for (std::size_t i = 0; i < signals.size(); ++i) {
     sigaction(signals[i], &previous[i], nullptr);
   }
+  sigaltstack(&previousStack, nullptr);
 }
 
 }  // namespace Corvcim

@@ -38,6 +38,8 @@ constexpr Scope associationVerbs = {[](const VerbSyntax& verb) { return verb.isA
                                     "it belongs to ai, ain, ri and rin"};
 constexpr Scope oneInventory = {[](const VerbSyntax& verb) { return verb.verb != Verb::Diff; },
                                 "A and B say which inventories"};
+constexpr Scope onlyInventory = {[](const VerbSyntax& verb) { return verb.verb == Verb::Inventory; },
+                                 "it belongs to inventory"};
 constexpr Scope onlyDiff = {[](const VerbSyntax& verb) { return verb.verb == Verb::Diff; }, "it belongs to diff"};
 
 /// An option: its spellings, and what it does with its value. An option without a value is given "".
@@ -85,6 +87,7 @@ constexpr Option optionTable[] = {
     {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
     {"--namespace", "-n", true, everyVerb, setNameSpace},
     {"--output", "-o", true, everyVerb, setFormat},
+    {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.description = value; }},
     {"--ignore", "", true, onlyDiff,
      [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
     {"--help", "-h", false, everyVerb, [](Options& o, const std::string&) { o.wantsHelp = true; }},
@@ -184,6 +187,9 @@ void checkCombination(const Options& options, const std::vector<Given>& given) {
     if (!option->scope.holds(verb)) {
       fail(name + " takes no option " + quoted(spelling) + ": " + std::string(option->scope.explanation));
     }
+  }
+  if (!options.description.empty() && !options.inventory.empty()) {
+    fail("'--from' and '--inventory' both name a source");
   }
   if (!options.language.empty() && (options.format == Format::Mof || options.format == Format::Json)) {
     fail("'--language' is for text: mof and json are the same in every language");

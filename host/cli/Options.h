@@ -20,10 +20,11 @@ struct AssociationOptions {
 
 /// One command line, understood.
 struct Options {
-  std::string library;    ///< the provider library; empty: the one that belongs to this program
-  std::string companion;  ///< the library with HALDA_ComputerSystem; empty: the one beside it
-  std::string inventory;  ///< as CORVANE_INVENTORY takes it; empty: as the environment says
-  std::string language;   ///< as CORVANE_LANGUAGE takes it; empty: as the environment says
+  std::string library;      ///< the provider library; empty: the one that belongs to this program
+  std::string companion;    ///< the library with HALDA_ComputerSystem; empty: the one beside it
+  std::string inventory;    ///< as CORVANE_INVENTORY takes it; empty: as the environment says
+  std::string description;  ///< what the verb inventory converts, as readHwloc takes it; empty: nothing
+  std::string language;     ///< as CORVANE_LANGUAGE takes it; empty: as the environment says
   std::string nameSpace = "root/cimv2";
   Format format = Format::Text;
   const VerbSyntax* verb = &overviewSyntax();

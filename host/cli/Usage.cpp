@@ -21,6 +21,8 @@ constexpr std::string_view optionHelp =
     "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
     "  -l, --library FILE      the provider library\n"
     "      --companion FILE    the library with HALDA_ComputerSystem\n"
+    "      --from DESCRIPTION  what inventory converts: hwloc:FILE (XML of lstopo) or\n"
+    "                          hwloc-synthetic:\"package:2 core:4 pu:2\"\n"
     "      --ignore FIELD,...  what diff leaves out, such as CurrentClockSpeed\n"
     "      --language ID       language of captions and descriptions, such as de_AT\n"
     "  -h, --help              this help; after a verb: the help of that verb\n"

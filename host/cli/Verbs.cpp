@@ -24,6 +24,12 @@ constexpr std::string_view referenceDetails =
     "PATH is an object path as ein prints it; the namespace may be left out.\n"
     "Without -arc (or -ac) every association class that PATH's class takes part in is asked.\n";
 
+constexpr std::string_view inventoryDetails =
+    "--from converts what hwloc describes, so that the library can be tried on it:\n"
+    "  corvcim inventory -o json --from hwloc:machine.xml > machine.json\n"
+    "  corvcim -i json:machine.json\n"
+    "  corvcim inventory --from hwloc-synthetic:\"package:2 l3:1 l2:4 core:1 pu:2\"\n";
+
 constexpr std::string_view diffDetails =
     "A and B are sources as --inventory takes them: live, root:DIR, json:FILE.\n"
     "Parts are matched by their paths. --ignore CurrentClockSpeed,description leaves\n"
@@ -47,7 +53,8 @@ constexpr VerbSyntax syntaxes[] = {
      true, referenceDetails},
     {"rin", Verb::ReferenceNames, "PATH", 1, 1, "the paths of those", dataFormats, true, referenceDetails},
     {"inventory", Verb::Inventory, "", 0, 0,
-     "the inventory that the library reads; -o json writes a file for json:FILE", plainFormats, false, ""},
+     "the inventory that the library reads; -o json writes a file for json:FILE", plainFormats, false,
+     inventoryDetails},
     {"diff", Verb::Diff, "A B", 2, 2, "what differs between two inventories", plainFormats, false, diffDetails},
     {"tree", Verb::Tree, "", 0, 0, "system, processors, cores and caches as a drawing", drawingFormats, false,
      "Caches stand above the cores that share them, as the inventory tells it.\n"},

@@ -27,6 +27,17 @@ _corvcim_inventory() {
   fi
 }
 
+_corvcim_description() {
+  if [[ $current == : ]]; then
+    _corvcim_files ""
+  elif [[ ${COMP_WORDS[COMP_CWORD - 1]} == : ]]; then
+    _corvcim_files "$current"
+  else
+    _corvcim_offer "hwloc: hwloc-synthetic:"
+    compopt -o nospace
+  fi
+}
+
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
   local verbs="classes ei ein gi ai ain ri rin inventory diff tree"
@@ -51,6 +62,7 @@ _corvcim() {
     -l | --library | --companion) _corvcim_files "$current" && return ;;
     -n | --namespace) _corvcim_offer "root/cimv2" && return ;;
     --language) _corvcim_offer "en de" && return ;;
+    --from) _corvcim_description && return ;;
     --ignore) _corvcim_offer "CurrentClockSpeed description cpus status" && return ;;
     -ac | -arc) _corvcim_classes && return ;;
     -ar | -arr)
@@ -64,6 +76,7 @@ _corvcim() {
       ai | ain) options+=" -ac -arc -ar -arr" ;;
       ri | rin) options+=" -ac -arc -ar" ;;
       diff) options+=" --ignore" ;;
+      inventory) options+=" --from" ;;
     esac
     _corvcim_offer "$options"
   elif [[ -z $verb ]]; then
