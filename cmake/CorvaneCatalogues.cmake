@@ -7,7 +7,8 @@
 #   msgid "IDENTIFIER"
 #   msgstr "text"
 # where a text may go on in further quoted lines, lines that begin with #, and blank lines. The pair
-# with the empty identifier is the file's own header. Escapes in texts are those of C.
+# with the empty identifier is the file's own header. Escapes in texts are those of C. A pair that is
+# marked fuzzy is left out, as translators' tools do: its text is a guess.
 #
 # Run as a script (cmake -DNUMBER=n -DOUTPUT=file.cpp "-DFILES=a.po;b.po" -P CorvaneCatalogues.cmake)
 # this same file writes the source; its form is platform/locale/Catalogue.h.
@@ -44,6 +45,8 @@ function(corvane_catalogue_rows file out)
 
   set(number 0)
   set(state none)
+  set(next_is_fuzzy FALSE)
+  set(is_fuzzy FALSE)
   set(id "")
   set(translation "")
   set(rows "")
@@ -51,6 +54,9 @@ function(corvane_catalogue_rows file out)
   list(APPEND lines "msgid \"\"") # completes the last pair
   foreach(line IN LISTS lines)
     math(EXPR number "${number} + 1")
+    if(line MATCHES "^#,.*fuzzy")
+      set(next_is_fuzzy TRUE)
+    endif()
     if(line MATCHES "^[ \t]*(#.*)?$")
       continue()
     endif()
@@ -60,9 +66,13 @@ function(corvane_catalogue_rows file out)
         message(FATAL_ERROR "${file}:${number}: msgid \"${id}\" has no msgstr before this line")
       endif()
       if(NOT id STREQUAL "")
-        list(APPEND rows "    {L\"${id}\", ${translation}},")
+        if(NOT is_fuzzy)
+          list(APPEND rows "    {L\"${id}\", ${translation}},")
+        endif()
         list(APPEND ids "${id}")
       endif()
+      set(is_fuzzy ${next_is_fuzzy})
+      set(next_is_fuzzy FALSE)
       set(id "${next}")
       set(state msgid)
       if(NOT id STREQUAL "" AND id IN_LIST ids)

@@ -61,7 +61,7 @@ _corvcim() {
       ;;
     -l | --library | --companion) _corvcim_files "$current" && return ;;
     -n | --namespace) _corvcim_offer "root/cimv2" && return ;;
-    --language) _corvcim_offer "en de" && return ;;
+    --language) _corvcim_offer "de en es fr ja zh_CN" && return ;;
     --from) _corvcim_description && return ;;
     --ignore) _corvcim_offer "CurrentClockSpeed description cpus status" && return ;;
     -ac | -arc) _corvcim_classes && return ;;

@@ -1,11 +1,28 @@
 #include "platform/locale/Catalogue.h"
 
+#include <iterator>
+
 namespace Tarn::Locale {
 namespace {
 
 constexpr std::wstring_view kLastLanguage = L"en";
 
+/// Where the shorter id is not the next best language. Chinese is written in two scripts, and a reader of one is not
+/// served by the other; without a script or region the simplified one is meant.
+struct Parent {
+  std::wstring_view language;
+  std::wstring_view parent;
+};
+constexpr Parent kParents[] = {
+    {L"zh", L"zh_CN"}, {L"zh_CN", L""}, {L"zh_HK", L""}, {L"zh_Hant", L""}, {L"zh_MO", L""}, {L"zh_TW", L""},
+};
+
 std::wstring_view parentOf(std::wstring_view language) {
+  const auto* exception = std::find_if(std::begin(kParents), std::end(kParents),
+                                       [&](const Parent& row) { return row.language == language; });
+  if (exception != std::end(kParents)) {
+    return exception->parent;
+  }
   const std::size_t end = language.rfind(L'_');
   return end == std::wstring_view::npos ? std::wstring_view() : language.substr(0, end);
 }

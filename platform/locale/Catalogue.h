@@ -30,7 +30,8 @@ constexpr bool isSorted(std::span<const Message> messages) {
 /// All catalogues, compiled in from the files in `locale/`.
 std::span<const Catalogue> catalogues();
 
-/// The text in that language or, where it has none, in its parents ("de_AT", "de") and at last in English.
+/// The text in that language or, where it has none, in its parents ("de_AT", "de"; "zh_Hans_SG", "zh_Hans", "zh",
+/// "zh_CN") and at last in English.
 /// An empty text counts as none. The view stays valid as long as the library. Allocates nothing.
 std::optional<std::wstring_view> findMessage(int number, std::wstring_view language, std::wstring_view id);
 

@@ -14,9 +14,13 @@
 
 /// A test with a directory for its log files, and a message to write there.
 class LogDirectory : public testing::Test {
+ public:
+  LogDirectory(const LogDirectory&) = delete;
+  LogDirectory& operator=(const LogDirectory&) = delete;
+  ~LogDirectory() override { std::filesystem::remove_all(directory_); }
+
  protected:
   LogDirectory() { std::filesystem::create_directories(directory_); }
-  ~LogDirectory() override { std::filesystem::remove_all(directory_); }
 
   [[nodiscard]] std::string path(const std::string& name) const { return directory_ + "/" + name; }
 

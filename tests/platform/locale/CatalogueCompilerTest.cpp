@@ -45,4 +45,8 @@ TEST(CatalogueCompiler, LeavesAnEmptyTextToTheNextLanguage) {
   EXPECT_EQ(findMessage(7, L"en", L"EMPTY"), std::nullopt);
 }
 
+TEST(CatalogueCompiler, LeavesOutWhatIsMarkedAsAGuess) {
+  EXPECT_EQ(findMessage(7, L"de", L"Z_LAST"), findMessage(7, L"en", L"Z_LAST"));
+}
+
 }  // namespace

@@ -1,3 +1,4 @@
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <tarn/Common.h>
 #include <tarn/Locale.h>
@@ -8,6 +9,7 @@
 #include <string>
 
 #include "platform/locale/Catalogue.h"
+#include "tests/platform/locale/CatalogueProblems.h"
 #include "tests/platform/locale/PoFile.h"
 
 namespace {
@@ -15,21 +17,18 @@ namespace {
 using Tarn::make_string;
 using Tarn::ResourceString;
 using Tarn::Locale::getResourceLibrary;
+using testing::IsEmpty;
+using testing::IsSupersetOf;
 
-std::map<std::string, std::map<std::string, std::string>> catalogueFiles() {
-  std::map<std::string, std::map<std::string, std::string>> files;
-  for (const auto& entry : std::filesystem::directory_iterator(CORVANE_SOURCE_DIR "/locale")) {
-    files[entry.path().stem()] = readPoFile(entry.path());
-  }
+const std::map<std::string, PoFile>& catalogueFiles() {
+  static const std::map<std::string, PoFile> files = [] {
+    std::map<std::string, PoFile> read;
+    for (const auto& entry : std::filesystem::directory_iterator(CORVANE_SOURCE_DIR "/locale")) {
+      read[entry.path().stem()] = readPoFile(entry.path());
+    }
+    return read;
+  }();
   return files;
-}
-
-std::set<std::string> idsOf(const std::map<std::string, std::string>& texts) {
-  std::set<std::string> ids;
-  for (const auto& [id, text] : texts) {
-    ids.insert(id);
-  }
-  return ids;
 }
 
 const std::set<std::string> kIds = {
@@ -38,38 +37,49 @@ const std::set<std::string> kIds = {
     "MSGID_CPU_PROC_CORE_CAPTION",     "MSGID_CPU_PROC_CORE_DESCRIPTION",     "MSGID_CPU_MEMORY_CAPTION",
     "MSGID_CPU_MEMORY_DESCRIPTION"};
 
-TEST(Catalogues, AreThereInEnglishAndGerman) {
-  const auto files = catalogueFiles();
-  EXPECT_TRUE(files.contains("en"));
-  EXPECT_TRUE(files.contains("de"));
-  EXPECT_EQ(Tarn::Locale::catalogues().size(), files.size());
+TEST(Catalogues, AreThereInTheseLanguages) {
+  std::set<std::string> languages;
+  for (const auto& [language, file] : catalogueFiles()) {
+    languages.insert(language);
+  }
+  EXPECT_THAT(languages, IsSupersetOf({"de", "en", "es", "fr", "ja", "zh_CN"}));
+  EXPECT_EQ(Tarn::Locale::catalogues().size(), languages.size());
 }
 
-TEST(Catalogues, HaveEveryText) {
-  for (const auto& [language, texts] : catalogueFiles()) {
-    EXPECT_EQ(idsOf(texts), kIds) << language;
-    for (const auto& [id, text] : texts) {
-      EXPECT_NE(text, "") << language << ' ' << id;
-    }
+TEST(Catalogues, HaveInEnglishWhatTheLibraryAsksFor) {
+  std::set<std::string> ids;
+  for (const PoEntry& entry : catalogueFiles().at("en").entries) {
+    ids.insert(entry.id);
+  }
+  EXPECT_EQ(ids, kIds);
+}
+
+TEST(Catalogues, AreComplete) {
+  for (const auto& [language, file] : catalogueFiles()) {
+    EXPECT_THAT(problemsOf(file, language, catalogueFiles().at("en")), IsEmpty()) << language;
   }
 }
 
 TEST(Catalogues, AreCompiledInAsTheyAreWritten) {
-  for (const auto& [language, texts] : catalogueFiles()) {
-    for (const auto& [id, text] : texts) {
-      const ResourceString found(getResourceLibrary(2, language), std::wstring(id.begin(), id.end()));
-      EXPECT_EQ(make_string(found.str()), text) << language << ' ' << id;
+  for (const auto& [language, file] : catalogueFiles()) {
+    for (const PoEntry& entry : file.entries) {
+      const ResourceString found(getResourceLibrary(2, language), std::wstring(entry.id.begin(), entry.id.end()));
+      EXPECT_EQ(make_string(found.str()), entry.text) << language << ' ' << entry.id;
     }
   }
 }
 
-TEST(Catalogues, TranslateTheCaptions) {
-  for (const auto& [language, texts] : catalogueFiles()) {
-    if (language == "en") {
-      continue;
-    }
-    for (const auto& [id, text] : texts) {
-      EXPECT_NE(text, catalogueFiles().at("en").at(id)) << language << ' ' << id;
+// A caption may be the same word in two languages, a sentence may not.
+TEST(Catalogues, TranslateTheDescriptions) {
+  std::map<std::string, std::string> english;
+  for (const PoEntry& entry : catalogueFiles().at("en").entries) {
+    english[entry.id] = entry.text;
+  }
+  for (const auto& [language, file] : catalogueFiles()) {
+    for (const PoEntry& entry : file.entries) {
+      if (language != "en" && entry.id.ends_with("_DESCRIPTION")) {
+        EXPECT_NE(entry.text, english[entry.id]) << language << ' ' << entry.id;
+      }
     }
   }
 }

@@ -32,8 +32,18 @@ TEST(ResourceString, FallsBackToTheParentLanguageAndThenToEnglish) {
   EXPECT_EQ(captionIn("de_AT"), L"Prozessor");
   EXPECT_EQ(captionIn("de_Latn_CH_1996"), L"Prozessor");
   EXPECT_EQ(captionIn("en_GB"), L"Processor");
-  EXPECT_EQ(captionIn("fr_CA"), L"Processor");
+  EXPECT_EQ(captionIn("fr_CA"), L"Processeur");
+  EXPECT_EQ(captionIn("pt_BR"), L"Processor");
   EXPECT_EQ(captionIn("den"), L"Processor");
+}
+
+TEST(ResourceString, IsChineseInTheScriptThatIsAskedFor) {
+  for (const char* language : {"zh", "zh_CN", "zh_SG", "zh_Hans", "zh_Hans_CN", "zh_Hans_HK", "zh-hans-tw"}) {
+    EXPECT_EQ(captionIn(language), L"\u5904\u7406\u5668") << language;
+  }
+  for (const char* language : {"zh_TW", "zh_HK", "zh_MO", "zh_Hant", "zh_Hant_TW", "zh_Hant_CN", "zh_TW.Big5"}) {
+    EXPECT_EQ(captionIn(language), L"Processor") << language;
+  }
 }
 
 TEST(ResourceString, IsTheIdWhereNothingIsKnownOfIt) {
