@@ -1,11 +1,9 @@
 #include <CPU.h>
 #include <tarn/Instrumentation.h>
 
-#include <exception>
-#include <iostream>
 #include <utility>
 
-#include "ModelEvents.h"
+#include "ExceptionBarriers.h"
 
 namespace Tarn::CPUProvider {
 
@@ -216,62 +214,61 @@ void append(std::vector<Record>& records, void (*read)(const Instrumentation&, R
   }
 }
 
+/// What a collection returns: success if there was any node to read.
+unsigned short resultOf(bool found) {
+  return found ? 0 : 1;
+}
+
+/// Appends a record of every node that the cursor walks over.
+template <class Record>
+unsigned short appendAll(std::vector<Record>& records, void (*read)(const Instrumentation&, Record&, const char*),
+                         Instrumentation& node, const char* function) {
+  const bool found = static_cast<bool>(node);
+  for (; node; ++node) {
+    append(records, read, node, function);
+  }
+  return resultOf(found);
+}
+
 }  // namespace
 
 unsigned short getProcessorInstances(std::vector<Processor>& processors) {
   modelEvents.entering({{" processors=", &processors}});
-  unsigned short result = 1;
-  try {
+  const unsigned short result = loggingExceptions("Caught Exception", [&, function = __func__] {
     Instrumentation node;
     node.selectNode(NodeProcessor);
     const bool found = static_cast<bool>(node);
     for (; node; ++node) {
       if (isInUse(node.getNodeStatus())) {
-        append(processors, readProcessor, node, __func__);
+        append(processors, readProcessor, node, function);
       } else {
-        modelEvents.message(LevelWarning, "Dummy CPU Instance");
+        modelEvents.message(LevelWarning, "Dummy CPU Instance", __builtin_LINE(), function);
       }
     }
-    result = found ? 0 : 1;
-  } catch (...) {
-    modelEvents.message(LevelError, "Caught Exception");
-  }
+    return resultOf(found);
+  });
   modelEvents.exiting({{" processors=", &processors}});
   return result;
 }
 
 unsigned short getMemoryInstances(std::vector<Memory>& memories) {
   modelEvents.entering({{" memories=", &memories}});
-  unsigned short result = 1;
-  try {
+  const unsigned short result = printingExceptions([&, function = __func__] {
     Instrumentation node;
     node.selectNode(NodeCacheMemory);
-    const bool found = static_cast<bool>(node);
-    for (; node; ++node) {
-      append(memories, readMemory, node, __func__);
-    }
-    result = found ? 0 : 1;
-  } catch (const std::exception& error) {
-    std::cerr << error.what() << std::endl;
-  }
+    return appendAll(memories, readMemory, node, function);
+  });
   modelEvents.exiting({{" memories=", &memories}});
   return result;
 }
 
 unsigned short getProcessorCoreInstances(std::vector<ProcessorCore>& cores) {
   modelEvents.entering({{" procCores=", &cores}});
-  unsigned short result = 1;
-  try {
+  const unsigned short result = loggingExceptions("Caught Exception: ", [&, function = __func__] {
     Instrumentation node;
     node.selectNode(NodeProcessorCore);
-    const bool found = static_cast<bool>(node);
-    for (; node; ++node) {
-      append(cores, readCore, node, __func__);
-    }
-    result = found ? 0 : 1;
-  } catch (...) {
-    modelEvents.message(LevelError, "Caught Exception: ");
-  }
+    return appendAll(cores, readCore, node, function);
+  });
   modelEvents.exiting({{" procCores=", &cores}});
   return result;
 }

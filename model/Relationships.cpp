@@ -2,10 +2,8 @@
 #include <tarn/Instrumentation.h>
 
 #include <algorithm>
-#include <exception>
-#include <iostream>
 
-#include "ModelEvents.h"
+#include "ExceptionBarriers.h"
 
 namespace Tarn::CPUProvider {
 
@@ -115,28 +113,6 @@ unsigned short appendChildrenOf(const std::vector<Processor>& processors,
   return 0;
 }
 
-/// Runs a query whose exceptions go to the log.
-template <class Query>
-unsigned short loggingExceptions(Query query, const char* function = __builtin_FUNCTION()) {
-  try {
-    return query();
-  } catch (...) {
-    modelEvents.message(LevelError, "Caught Exception: ", __builtin_LINE(), function);
-    return 1;
-  }
-}
-
-/// Runs a query whose exceptions go to standard error; what is no std::exception passes on.
-template <class Query>
-unsigned short printingExceptions(Query query) {
-  try {
-    return query();
-  } catch (const std::exception& error) {
-    std::cerr << error.what() << std::endl;
-    return 1;
-  }
-}
-
 }  // namespace
 
 unsigned short getCPUProcessorsFromCPUProcCore(std::string instanceID, std::vector<Processor>& matchedProcessors) {
@@ -164,7 +140,7 @@ unsigned short getCPUProcessorsFromCPUMemory(std::string deviceID, std::vector<P
 unsigned short getCPUMemoriesFromCPUProcessor(std::string deviceID, std::vector<Memory>& matchedMemories) {
   modelEvents.entering({{" matchedMemories=", &matchedMemories}});
   modelEvents.variable("deviceID", deviceID.c_str());
-  const unsigned short result = loggingExceptions([&, function = __func__] {
+  const unsigned short result = loggingExceptions("Caught Exception: ", [&, function = __func__] {
     return appendChildren(deviceID, memoryKind, matchedMemories, 0, "Error while setting filter", function);
   });
   modelEvents.exiting({{" matchedMemories=", &matchedMemories}});
@@ -185,7 +161,7 @@ unsigned short getCPUProcCoresFromCPUProcessor(std::string deviceID, std::vector
 unsigned short getCPUMemoriesFromCPUProcessorCore(std::string instanceID, std::vector<Memory>& matchedMemories) {
   modelEvents.entering({{" matchedMemories=", &matchedMemories}});
   modelEvents.variable("instanceID", instanceID.c_str());
-  const unsigned short result = loggingExceptions([&] {
+  const unsigned short result = loggingExceptions("Caught Exception: ", [&] {
     std::vector<Processor> owners;
     const unsigned short found = getCPUProcessorsFromCPUProcCore(instanceID, owners);
     return found != 0 ? found : appendChildrenOf(owners, getCPUMemoriesFromCPUProcessor, matchedMemories);
@@ -197,7 +173,7 @@ unsigned short getCPUMemoriesFromCPUProcessorCore(std::string instanceID, std::v
 unsigned short getCPUProcessorCoresFromCPUMemory(std::string deviceID, std::vector<ProcessorCore>& matchedProcCores) {
   modelEvents.entering({{" matchedProcCores=", &matchedProcCores}});
   modelEvents.variable("deviceID", deviceID.c_str());
-  const unsigned short result = loggingExceptions([&] {
+  const unsigned short result = loggingExceptions("Caught Exception: ", [&] {
     std::vector<Processor> owners;
     const unsigned short found = getCPUProcessorsFromCPUMemory(deviceID, owners);
     return found != 0 ? found : appendChildrenOf(owners, getCPUProcCoresFromCPUProcessor, matchedProcCores);
