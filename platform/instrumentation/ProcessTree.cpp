@@ -1,5 +1,8 @@
 #include "platform/instrumentation/ProcessTree.h"
 
+#include <cvlog/CVLogger.h>
+
+#include <exception>
 #include <mutex>
 #include <string>
 #include <utility>
@@ -24,12 +27,35 @@ std::string chosenSource() {
   return setting != nullptr ? setting->value : "live";
 }
 
+// Whoever asks for the tree may say no more than that it failed. Every request asks again, so what is
+// known is not said twice.
+void report(const std::string& text) {
+  static std::string reported;
+  if (std::exchange(reported, text) == text) {
+    return;
+  }
+  constexpr int levelError = 6000;
+  constexpr const char* file = "ProcessTree.cpp";
+  const std::string component = "Corvane.Inventory";
+  CVLog::CVLogger::logLevelMessage(__func__, file, __LINE__, component, levelError, nullptr, 0, 0, text);
+  CVLog::CVLogger::traceLevelMessage(__func__, file, __LINE__, component, levelError, nullptr, 0, 0, text);
+}
+
+Tree loadChosen() {
+  try {
+    return loadInventory(chosenSource());
+  } catch (const std::exception& error) {
+    report(error.what());
+    throw;
+  }
+}
+
 }  // namespace
 
 std::shared_ptr<const Tree> processTree() {
   const std::scoped_lock lock(mutex);
   if (!current) {
-    current = std::make_shared<const Tree>(loadInventory(chosenSource()));
+    current = std::make_shared<const Tree>(loadChosen());
   }
   return current;
 }

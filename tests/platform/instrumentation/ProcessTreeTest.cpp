@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 #include <tarn/Instrumentation.h>
 
+#include <algorithm>
 #include <cstdlib>
 #include <latch>
 #include <thread>
@@ -78,6 +79,23 @@ TEST_F(ProcessTree, AFailedLoadIsToldAndTriedAgain) {
   Instrumentation cursor;
   cursor.selectNode(NodeLexicon::NodeProcessor);
   EXPECT_TRUE(cursor);
+}
+
+TEST_F(ProcessTree, AFailedLoadIsLoggedOnce) {
+  const std::string log = scratch_.name() + "/log";
+  ::setenv("CORVANE_LOG", ("error:file:" + log).c_str(), 1);
+  ::setenv("CORVANE_INVENTORY", "json:/nothing/here", 1);
+  for (int attempt = 0; attempt < 3; ++attempt) {
+    EXPECT_THROW(processTree(), InventoryError);
+  }
+  ::setenv("CORVANE_INVENTORY", "nonsense", 1);
+  EXPECT_THROW(processTree(), InventoryError);
+
+  const std::string text = contentsOf(log);
+  EXPECT_EQ(std::ranges::count(text, '\n'), 2) << text;
+  EXPECT_NE(text.find(" error Corvane.Inventory "), std::string::npos) << text;
+  EXPECT_NE(text.find(" can not read the inventory: /nothing/here: no such file or directory; "), std::string::npos)
+      << text;
 }
 
 TEST_F(ProcessTree, IsReplacedAndLoadedAnew) {
