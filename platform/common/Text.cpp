@@ -1,5 +1,6 @@
 #include <tarn/Common.h>
 
+#include <algorithm>
 #include <cstdint>
 #include <type_traits>
 
@@ -45,12 +46,15 @@ std::string stripSpaces(std::string text) {
 }
 
 std::string make_string(const std::wstring& text) {
-  std::string utf8;
-  utf8.reserve(text.size());
-  for (wchar_t unit : text) {
-    const auto code = std::uint32_t{std::make_unsigned_t<wchar_t>(unit)};
+  const auto codeOf = [](wchar_t unit) { return std::uint32_t{std::make_unsigned_t<wchar_t>(unit)}; };
+  // Most texts are ASCII from end to end, or begin so.
+  const auto firstBeyondAscii = std::ranges::find_if(text, [&](wchar_t unit) { return codeOf(unit) >= 0x80; });
+  std::string utf8(static_cast<std::size_t>(firstBeyondAscii - text.begin()), '\0');
+  std::transform(text.begin(), firstBeyondAscii, utf8.begin(), [](wchar_t unit) { return static_cast<char>(unit); });
+  std::for_each(firstBeyondAscii, text.end(), [&](wchar_t unit) {
+    const std::uint32_t code = codeOf(unit);
     appendUtf8(utf8, isCharacter(code) ? code : kReplacementCharacter);
-  }
+  });
   return utf8;
 }
 

@@ -1,6 +1,9 @@
 #include <cvlog/CVLogger.h>
 #include <tarn/Locale.h>
 
+#include <array>
+#include <charconv>
+#include <limits>
 #include <optional>
 #include <string_view>
 
@@ -58,9 +61,13 @@ std::string getLanguageId() {
 
 std::wstring getResourceLibrary(int number, const std::string& languageId) {
   const std::string language = normalizedLanguageId(languageId);
-  std::wstring library = std::to_wstring(number) + kLibrarySeparator;
   const std::string_view wanted = language.empty() ? kDefaultLanguage : language;
-  library.append(wanted.begin(), wanted.end());
+  std::array<char, std::numeric_limits<int>::digits10 + 2> digits{};
+  const auto [end, error] = std::to_chars(digits.data(), digits.data() + digits.size(), number);
+
+  std::wstring library;
+  library.reserve(digits.size() + 1 + wanted.size());
+  library.append(digits.data(), end).append(1, kLibrarySeparator).append(wanted.begin(), wanted.end());
   return library;
 }
 
