@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 #include <malloc.h>
 
+#include <filesystem>
 #include <fstream>
 #include <string>
 
@@ -116,6 +117,28 @@ TEST(Reload, KeepsTheInventoryUntilThen) {
   EXPECT_EQ(library.enumerateInstances("HALDA_CPUProcessor").instances.size(), 2U);
   const Environment other(Library::quietly(Library::fixture("kvm-two-cpus")));
   EXPECT_EQ(library.enumerateInstances("HALDA_CPUProcessor").instances.size(), 2U);
+}
+
+// An agent may bring a version of its own beside the one that is installed.
+TEST(TwoCopies, ShareNothing) {
+  const std::filesystem::path directory = std::filesystem::path(::testing::TempDir()) / "two-copies";
+  std::filesystem::create_directories(directory);
+  const auto load = [&](const char* name) {
+    const std::filesystem::path copy = directory / name;
+    std::filesystem::copy_file(Library::file, copy, std::filesystem::copy_options::overwrite_existing);
+    return dlopen(copy.c_str(), RTLD_NOW | RTLD_GLOBAL);
+  };
+  void* first = load("first.so");
+  void* second = load("second.so");
+  ASSERT_NE(first, nullptr) << dlerror();
+  ASSERT_NE(second, nullptr) << dlerror();
+
+  // A copy that something of the other is bound to would stay.
+  dlclose(first);
+  EXPECT_EQ(dlopen((directory / "first.so").c_str(), RTLD_NOW | RTLD_NOLOAD), nullptr);
+  dlclose(second);
+  EXPECT_EQ(dlopen((directory / "second.so").c_str(), RTLD_NOW | RTLD_NOLOAD), nullptr);
+  std::filesystem::remove_all(directory);
 }
 
 }  // namespace
