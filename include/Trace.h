@@ -181,11 +181,17 @@ class Parameter {
   template <class T>
   Parameter(const char* label, const T* pointer) : label_(label), kind_(Kind::Pointer), pointer_(pointer) {}
 
-  void appendTo(CVLog::CVMessageBuffer& list) const {
+  /// A flag that begins the list is shown as the message buffer shows one; behind another value it goes
+  /// to a plain stream, as a digit.
+  void appendTo(CVLog::CVMessageBuffer& list, bool isFirst) const {
     list << label_;
     switch (kind_) {
       case Kind::Flag:
-        list << flag_;
+        if (isFirst) {
+          list << flag_;
+        } else {
+          list << (flag_ ? "1" : "0");
+        }
         break;
       case Kind::Text:
         list << (text_ != nullptr ? text_ : "");
@@ -274,7 +280,7 @@ class EventLog {
     CVLog::CVMessageBuffer list;
     log(level_, origin, [&] {
       for (const Parameter& parameter : parameters) {
-        parameter.appendTo(list);
+        parameter.appendTo(list, &parameter == parameters.begin());
       }
       const std::string text = CVLog::CVMessageBuffer::str(list);
       return tracepara(origin.function, origin.file, origin.line, text.c_str(), type);
