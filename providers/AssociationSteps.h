@@ -177,10 +177,16 @@ struct Search {
   CMPIStatus* status;
 };
 
+/// The elements at the far end of a request, and the end of the association that they stand at.
+struct FarEnds {
+  Instances elements;
+  bool areFirst = false;
+};
+
 /// Finds the elements at the far end; none for a target class that neither direction leads to. False,
 /// and the direction's own text logged, when the navigation failed.
 inline bool findRelated(const Association& association, const Search& search, const Direction (&directions)[2],
-                        const char* const (&failures)[2], Instances& related, unsigned int line = __builtin_LINE(),
+                        const char* const (&failures)[2], FarEnds& related, unsigned int line = __builtin_LINE(),
                         const char* function = __builtin_FUNCTION()) {
   const std::string_view targetClass = classNameOf(search.target);
   for (std::size_t i = 0; i < std::size(directions); ++i) {
@@ -188,10 +194,11 @@ inline bool findRelated(const Association& association, const Search& search, co
     if (targetClass != direction.targetClass) {
       continue;
     }
-    related.reserve((search.factory->*direction.expected)());
+    related.areFirst = targetClass == association.first.objectClass;
+    related.elements.reserve((search.factory->*direction.expected)());
     if ((search.factory->*direction.navigate)(association.broker, search.target,
                                               stringKey(search.cop, direction.sourceKey), search.properties,
-                                              search.isObjPath, related, search.status) != 0) {
+                                              search.isObjPath, related.elements, search.status) != 0) {
       association.events.message(LevelError, failures[i], line, function);
       return false;
     }
@@ -211,12 +218,24 @@ inline CMPIInstance* newAssociation(const Association& association, const CMPIOb
   return instance;
 }
 
+/// Collects each pair of a walk as an association of its own; one that the broker cannot make is left out.
+inline auto collectPairs(const Association& association, const char** properties, const char** filterKeys,
+                         Instances& instances) {
+  return [&association, properties, filterKeys, &instances](const CMPIObjectPath* path, const CMPIObjectPath* first,
+                                                            const CMPIObjectPath* second) {
+    CMPIInstance* instance = newAssociation(association, path, first, second, properties, filterKeys);
+    if (!isNull(instance)) {
+      instances.push_back(instance);
+    }
+    return true;
+  };
+}
+
 /// How the references of a request are built: on the association's template path, between the object
-/// that the request starts from and elements of the target class. With `filterKeys` the property list
-/// filters them.
+/// that the request starts from and those at the far end. With `filterKeys` the property list filters
+/// them.
 struct ReferenceTemplate {
   const CMPIObjectPath* source;
-  const CMPIObjectPath* target;
   const CMPIObjectPath* path;
   const char** properties = nullptr;
   const char** filterKeys = nullptr;
@@ -224,7 +243,7 @@ struct ReferenceTemplate {
 
 /// One reference; NULL when the broker has none.
 inline CMPIInstance* newReference(const Association& association, const ReferenceTemplate& from,
-                                  const CMPIObjectPath* far) {
+                                  const CMPIObjectPath* far, bool farIsFirst) {
   CMPIInstance* instance = CMNewInstance(association.broker, from.path, nullptr);
   if (isNull(instance)) {
     return nullptr;
@@ -232,7 +251,6 @@ inline CMPIInstance* newReference(const Association& association, const Referenc
   if (from.filterKeys != nullptr) {
     CMSetPropertyFilter(instance, from.properties, from.filterKeys);
   }
-  const bool farIsFirst = std::string_view(classNameOf(from.target)) == association.first.objectClass;
   setEnds(association, instance, farIsFirst ? far : from.source, farIsFirst ? from.source : far);
   return instance;
 }
@@ -240,14 +258,14 @@ inline CMPIInstance* newReference(const Association& association, const Referenc
 /// Hands the reference to each related element to `use`, with the element's path; what could not be
 /// built is left out.
 template <class Use>
-void forEachReference(const Association& association, const ReferenceTemplate& from, Instances& related, Use use) {
-  for (const CMPIInstance* element : counted(related)) {
+void forEachReference(const Association& association, const ReferenceTemplate& from, FarEnds& related, Use use) {
+  for (const CMPIInstance* element : counted(related.elements)) {
     CMPIObjectPath* far = pathOf(element);
     if (isNull(far)) {
       continue;
     }
     stampPath(far, from.source);
-    CMPIInstance* reference = newReference(association, from, far);
+    CMPIInstance* reference = newReference(association, from, far, related.areFirst);
     if (!isNull(reference)) {
       use(reference, far);
     }

@@ -69,7 +69,7 @@ unsigned short CPUAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* cop, 
   const auto link = [&, function = __func__](const CMPIObjectPath* path, const CMPIObjectPath* cache,
                                              const CMPIObjectPath* processor) {
     return appendCacheAssociation(association, factory, path, cache, processor, properties, instances, &status,
-                                  function);
+                                  __builtin_LINE(), function);
   };
   const bool complete =
       forEachPair(association, factory, cop, &status, caches, instanceTexts, processorOf(factory, cop, &status), link);
@@ -140,14 +140,14 @@ CMPIStatus CPUAssociatedCacheMemory_Associators(CMPIAssociationMI* /*mi*/, const
     fail(association, &status, "Object Path is NULL in Associators.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
                    {"***Can't get Processor instances related to Memory.                 Exiting Associators***",
                     "***Can't get Memory instances related to Processor.                 Exiting Associators***"},
                    related)) {
     return status;
   }
-  deliver(result, related);
+  deliver(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -169,14 +169,14 @@ CMPIStatus CPUAssociatedCacheMemory_AssociatorNames(CMPIAssociationMI* /*mi*/, c
     fail(association, &status, "Object Path is NULL in AssociatorNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions,
                    {"***Can't get processor ObjPaths related to Processor.                 Exiting AssociatorNames***",
                     "***Can't get Memory ObjectPaths related to Processor.                 Exiting AssociatorNames***"},
                    related)) {
     return status;
   }
-  deliverStampedPathsOf(result, related, cop);
+  deliverStampedPathsOf(result, related.elements, cop);
   events.providerExit();
   return status;
 }
@@ -199,7 +199,7 @@ CMPIStatus CPUAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, const 
     fail(association, &status, "Object Path is NULL in References.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
                    {"***Can't get Processor instances                 Exiting References***",
                     "***Can't get Memory instances.                 Exiting References***"},
@@ -207,7 +207,7 @@ CMPIStatus CPUAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, const 
     return status;
   }
   forEachReference(
-      association, {cop, target, templatePath, properties, cacheAssociationKeys}, related,
+      association, {cop, templatePath, properties, cacheAssociationKeys}, related,
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
@@ -230,14 +230,14 @@ CMPIStatus CPUAssociatedCacheMemory_ReferenceNames(CMPIAssociationMI* /*mi*/, co
     fail(association, &status, "Object Path is NULL in ReferenceNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions,
                    {"***Can't get Processor ObjPaths.                 Exiting ReferenceNames***",
                     "***Can't get Memory ObjPaths.                 Exiting ReferenceNames***"},
                    related)) {
     return status;
   }
-  forEachReference(association, {cop, target, templatePath, nullptr, cacheAssociationKeys}, related,
+  forEachReference(association, {cop, templatePath, nullptr, cacheAssociationKeys}, related,
                    [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
                      deliverStampedPathOf(result, reference, cop);
                    });

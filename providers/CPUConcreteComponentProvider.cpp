@@ -61,12 +61,9 @@ unsigned short ConcreteComponentCMPIInstances(const CMPIObjectPath* cop, const c
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* processor, const CMPIObjectPath* core) {
-    instances.push_back(newAssociation(association, path, processor, core, properties, filterKeys));
-    return true;
-  };
   const bool complete =
-      forEachPair(association, factory, cop, &status, processors, instanceTexts, coresOf(factory, cop, &status), link);
+      forEachPair(association, factory, cop, &status, processors, instanceTexts, coresOf(factory, cop, &status),
+                  collectPairs(association, properties, filterKeys, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -126,12 +123,12 @@ CMPIStatus CPUConcreteComponent_Associators(CMPIAssociationMI* /*mi*/, const CMP
     events.message(LevelError, "Object Path is NULL in Associations.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions, navigationFailures,
                    related)) {
     return status;
   }
-  deliver(result, related);
+  deliver(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -149,12 +146,12 @@ CMPIStatus CPUConcreteComponent_AssociatorNames(CMPIAssociationMI* /*mi*/, const
     events.message(LevelError, "Object Path is NULL in AssociatorNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
                    related)) {
     return status;
   }
-  deliverPathsOf(result, related);
+  deliverPathsOf(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -173,13 +170,13 @@ CMPIStatus CPUConcreteComponent_References(CMPIAssociationMI* /*mi*/, const CMPI
     events.message(LevelError, "Object Path is NULL in References.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
                    related)) {
     return status;
   }
   forEachReference(
-      association, {cop, target, templatePath}, related,
+      association, {cop, templatePath}, related,
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
@@ -198,12 +195,12 @@ CMPIStatus CPUConcreteComponent_ReferenceNames(CMPIAssociationMI* /*mi*/, const 
     events.message(LevelError, "Object Path is NULL in ReferenceNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
                    related)) {
     return status;
   }
-  forEachReference(association, {cop, target, templatePath}, related,
+  forEachReference(association, {cop, templatePath}, related,
                    [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
                      const CMPIObjectPath* path = pathOf(reference);
                      if (!isNull(path)) {

@@ -61,7 +61,8 @@ unsigned short CPUCoreAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* c
   CPUObjFactory* factory = factoryOfCachesAndCores();
   const auto link = [&, function = __func__](const CMPIObjectPath* path, const CMPIObjectPath* cache,
                                              const CMPIObjectPath* core) {
-    return appendCacheAssociation(association, factory, path, cache, core, properties, instances, &status, function);
+    return appendCacheAssociation(association, factory, path, cache, core, properties, instances, &status,
+                                  __builtin_LINE(), function);
   };
   const bool complete =
       forEachPair(association, factory, cop, &status, cores, instanceTexts, cachesOf(factory, cop, &status), link);
@@ -130,14 +131,14 @@ CMPIStatus CPUCoreAssociatedCacheMemory_Associators(CMPIAssociationMI* /*mi*/, c
     fail(association, &status, "Object Path is NULL in Associators.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
                    {"***Can't get ProcessorCore instances related to Memory.                 Exiting Associators***",
                     "***Can't get Memory instances related to ProcessorCore.                 Exiting Associators***"},
                    related)) {
     return status;
   }
-  deliver(result, related);
+  deliver(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -157,7 +158,7 @@ CMPIStatus CPUCoreAssociatedCacheMemory_AssociatorNames(CMPIAssociationMI* /*mi*
     fail(association, &status, "Object Path is NULL in AssociatorNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(
           association, {factory, cop, target, nullptr, true, &status}, directions,
           {"***Can't get processorcore ObjPaths related to Memory.                 Exiting AssociatorNames***",
@@ -165,7 +166,7 @@ CMPIStatus CPUCoreAssociatedCacheMemory_AssociatorNames(CMPIAssociationMI* /*mi*
           related)) {
     return status;
   }
-  deliverStampedPathsOf(result, related, cop);
+  deliverStampedPathsOf(result, related.elements, cop);
   events.providerExit();
   return status;
 }
@@ -185,17 +186,16 @@ CMPIStatus CPUCoreAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, co
     fail(association, &status, "Object Path is NULL in References.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
                    {"***Can't get ProcessorCore instances                 Exiting References***",
                     "***Can't get Memory instances.                 Exiting References***"},
                    related)) {
     return status;
   }
-  const bool farIsCache = std::string_view(classNameOf(target)) == cpuMemoryClass;
-  forEachReference(association, {cop, target, templatePath, properties, cacheAssociationKeys}, related,
+  forEachReference(association, {cop, templatePath, properties, cacheAssociationKeys}, related,
                    [&, function = __func__](CMPIInstance* reference, const CMPIObjectPath* far) {
-                     setCacheProperties(association, factory, reference, farIsCache ? far : cop, &status,
+                     setCacheProperties(association, factory, reference, related.areFirst ? far : cop, &status,
                                         __builtin_LINE(), function);
                      CMReturnInstance(result, reference);
                    });
@@ -216,14 +216,14 @@ CMPIStatus CPUCoreAssociatedCacheMemory_ReferenceNames(CMPIAssociationMI* /*mi*/
     fail(association, &status, "Object Path is NULL in ReferenceNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions,
                    {"***Can't get ProcessorCore ObjPaths.                 Exiting ReferenceNames***",
                     "***Can't get Memory ObjPaths.                 Exiting ReferenceNames***"},
                    related)) {
     return status;
   }
-  forEachReference(association, {cop, target, templatePath, nullptr, cacheAssociationKeys}, related,
+  forEachReference(association, {cop, templatePath, nullptr, cacheAssociationKeys}, related,
                    [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
                      deliverStampedPathOf(result, reference, cop);
                    });

@@ -48,16 +48,17 @@ auto capabilitiesOf(CPUObjFactory* factory, const CMPIObjectPath* cop, const cha
 
 /// The processor of capabilities, or the capabilities of a processor. False when the navigation failed.
 bool findRelated(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPIObjectPath* target,
-                 const char** properties, Instances& related, CMPIStatus* status) {
+                 const char** properties, FarEnds& related, CMPIStatus* status) {
   const std::string_view targetClass = classNameOf(target);
-  related.reserve(factory->getNumberOfProcInstances());
+  related.areFirst = targetClass == association.first.objectClass;
+  related.elements.reserve(factory->getNumberOfProcInstances());
   if (targetClass == cpuProcessorCapClass) {
-    return factory->getProcessorCapRefByProcHandle(broker, target, stringKey(cop, "DeviceID"), properties, related,
-                                                   status) == 0;
+    return factory->getProcessorCapRefByProcHandle(broker, target, stringKey(cop, "DeviceID"), properties,
+                                                   related.elements, status) == 0;
   }
   if (targetClass == cpuProcessorClass) {
-    return factory->getProcessorRefByProcCapHandle(broker, target, stringKey(cop, "InstanceID"), properties, related,
-                                                   status) == 0;
+    return factory->getProcessorRefByProcCapHandle(broker, target, stringKey(cop, "InstanceID"), properties,
+                                                   related.elements, status) == 0;
   }
   return true;
 }
@@ -69,13 +70,9 @@ unsigned short ElementCapabilitiesCMPIInstances(const CMPIObjectPath* cop, const
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessors();
-  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* processor,
-                        const CMPIObjectPath* capabilities) {
-    instances.push_back(newAssociation(association, path, processor, capabilities, properties, filterKeys));
-    return true;
-  };
   const bool complete = forEachPair(association, factory, cop, &status, processors, instanceTexts,
-                                    capabilitiesOf(factory, cop, properties, &status), link);
+                                    capabilitiesOf(factory, cop, properties, &status),
+                                    collectPairs(association, properties, filterKeys, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -135,11 +132,11 @@ CMPIStatus CPUElementCapabilities_Associators(CMPIAssociationMI* /*mi*/, const C
     events.message(LevelError, "Object Path is NULL in Associations.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(factory, cop, target, properties, related, &status)) {
     return status;
   }
-  deliver(result, related);
+  deliver(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -157,11 +154,11 @@ CMPIStatus CPUElementCapabilities_AssociatorNames(CMPIAssociationMI* /*mi*/, con
     events.message(LevelError, "Object Path is NULL in AssociatorNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(factory, cop, target, nullptr, related, &status)) {
     return status;
   }
-  deliverPathsOf(result, related);
+  deliverPathsOf(result, related.elements);
   events.providerExit();
   return status;
 }
@@ -180,12 +177,12 @@ CMPIStatus CPUElementCapabilities_References(CMPIAssociationMI* /*mi*/, const CM
     events.message(LevelError, "Object Path is NULL in References.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(factory, cop, target, nullptr, related, &status)) {
     return status;
   }
   forEachReference(
-      association, {cop, target, templatePath}, related,
+      association, {cop, templatePath}, related,
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
@@ -204,11 +201,11 @@ CMPIStatus CPUElementCapabilities_ReferenceNames(CMPIAssociationMI* /*mi*/, cons
     events.message(LevelError, "Object Path is NULL in ReferenceNames.");
     return status;
   }
-  Instances related;
+  FarEnds related;
   if (!findRelated(factory, cop, target, nullptr, related, &status)) {
     return status;
   }
-  forEachReference(association, {cop, target, templatePath}, related,
+  forEachReference(association, {cop, templatePath}, related,
                    [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
                      CMPIObjectPath* path = pathOf(reference);
                      if (!isNull(path)) {

@@ -1,3 +1,5 @@
+#include <algorithm>
+
 #include "AssociationSteps.h"
 
 namespace Tarn::CPUProvider {
@@ -45,14 +47,21 @@ CMPIEnumeration* enumerateSystems(const CMPIContext* context, const CMPIObjectPa
   return upCall([&, caller = broker] { return CBEnumInstances(caller, context, systemClass, nullptr, status); });
 }
 
-/// Hands each element of an enumeration to `handle`, until that returns false.
+/// Hands each element of an enumeration to `handle`, until that returns false. An element that the broker
+/// fails to give is left out; a broker that goes on failing would never come to the end, and is not asked on.
 template <class Handle>
 bool forEach(const CMPIEnumeration* enumeration, Handle handle) {
   if (isNull(enumeration)) {
     return true;
   }
+  CMPIStatus last = succeeded();
   while (CMHasNext(enumeration, nullptr) != 0) {
-    const CMPIData element = CMGetNext(enumeration, nullptr);
+    CMPIStatus status = succeeded();
+    const CMPIData element = CMGetNext(enumeration, &status);
+    if (status.rc != CMPI_RC_OK && last.rc != CMPI_RC_OK) {
+      break;
+    }
+    last = status;
     if (!handle(element.value)) {
       return false;
     }
@@ -60,19 +69,17 @@ bool forEach(const CMPIEnumeration* enumeration, Handle handle) {
   return true;
 }
 
-/// The request's result class leaves room for the class that would be returned, or for its parent.
-bool wants(const char* resultClass, std::string_view ownClass, std::string_view parent) {
-  if (resultClass == nullptr || *resultClass == '\0') {
-    return true;
-  }
-  return equalIgnoringCase(resultClass, ownClass) || equalIgnoringCase(resultClass, parent);
-}
-
-bool wantsSystems(const char* resultClass) {
-  return wants(resultClass, computerSystemClass, "CIM_ComputerSystem");
-}
-bool wantsProcessors(const char* resultClass) {
-  return wants(resultClass, cpuProcessorClass, "CIM_Processor");
+/// Whether a request's result class leaves room for elements of the target class: it names that class or
+/// its parent.
+bool leavesRoomFor(std::string_view targetClass, const char* resultClass) {
+  struct Row {
+    std::string_view targetClass;
+    std::string_view parent;
+  };
+  constexpr Row rows[] = {{computerSystemClass, "CIM_ComputerSystem"}, {cpuProcessorClass, "CIM_Processor"}};
+  const Row* row = std::ranges::find(rows, targetClass, &Row::targetClass);
+  return resultClass == nullptr || row == std::end(rows) || equalIgnoringCase(resultClass, row->targetClass) ||
+         equalIgnoringCase(resultClass, row->parent);
 }
 
 /// Traced under the call that yields it, which is what this variable has always been called.
@@ -137,17 +144,13 @@ unsigned short CPUSystemDeviceCMPIInstances(const CMPIObjectPath* cop, const cha
                                             std::vector<CMPIInstance*>& instances) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  const auto link = [&](const CMPIObjectPath* path, const CMPIObjectPath* system, const CMPIObjectPath* processor) {
-    instances.push_back(newAssociation(association, path, system, processor, properties, filterKeys));
-    return true;
-  };
   const bool complete = forEachPair(
       cop, ctx, &status,
       {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
       // The words of another association, as they have always been.
       {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
        "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."},
-      link);
+      collectPairs(association, properties, filterKeys, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -206,7 +209,11 @@ CMPIStatus CPUSystemDevice_Associators(CMPIAssociationMI* /*mi*/, const CMPICont
     return succeeded();
   }
   const std::string_view targetClass = tracedClassOf(target);
-  if (targetClass == computerSystemClass && wantsSystems(resultClass)) {
+  if (!leavesRoomFor(targetClass, resultClass)) {
+    events.providerExit();
+    return succeeded();
+  }
+  if (targetClass == computerSystemClass) {
     const CMPIEnumeration* systems = enumerateSystems(context, target, &status);
     if (!answered(status)) {
       return status;
@@ -217,7 +224,7 @@ CMPIStatus CPUSystemDevice_Associators(CMPIAssociationMI* /*mi*/, const CMPICont
       }
       return true;
     });
-  } else if (targetClass == cpuProcessorClass && wantsProcessors(resultClass)) {
+  } else if (targetClass == cpuProcessorClass) {
     Instances processors;
     processors.reserve(factory->getNumberOfProcInstances());
     if (factory->getAllCPUProcCMPIInstances(broker, target, properties, false, processors, &status) != 0) {
@@ -243,7 +250,11 @@ CMPIStatus CPUSystemDevice_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPI
     return succeeded();
   }
   const std::string_view targetClass = tracedClassOf(target);
-  if (targetClass == computerSystemClass && wantsSystems(resultClass)) {
+  if (!leavesRoomFor(targetClass, resultClass)) {
+    events.providerExit();
+    return succeeded();
+  }
+  if (targetClass == computerSystemClass) {
     const CMPIEnumeration* systems = enumerateSystemNames(context, target, &status);
     if (!answered(status)) {
       return status;
@@ -254,7 +265,7 @@ CMPIStatus CPUSystemDevice_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPI
       }
       return true;
     });
-  } else if (targetClass == cpuProcessorClass && wantsProcessors(resultClass)) {
+  } else if (targetClass == cpuProcessorClass) {
     Paths processors;
     processors.reserve(factory->getNumberOfProcInstances());
     if (factory->getAllCPUProcCMPIObjPaths(broker, target, processors, &status) != 0) {
@@ -269,13 +280,12 @@ CMPIStatus CPUSystemDevice_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPI
 
 namespace {
 
-/// Hands the path at the far end of each of the request's associations to `link`. False, and the
-/// failure logged, when the far ends could not be had.
+/// Hands the path at the far end of each of the request's associations to `link`, and whether it stands at
+/// the association's first end. False, and the failure logged, when the far ends could not be had.
 template <class Link>
-bool forEachFarEnd(const CMPIObjectPath* cop, const CMPIContext* context, const CMPIObjectPath* target,
-                   CMPIStatus* status, const char* noProcessors, Link link,
+bool forEachFarEnd(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPIContext* context,
+                   const CMPIObjectPath* target, CMPIStatus* status, const char* noProcessors, Link link,
                    const char* function = __builtin_FUNCTION()) {
-  CPUObjFactory* factory = factoryOfProcessors();
   const std::string_view targetClass = classNameOf(target);
   if (targetClass == cpuProcessorClass) {
     Paths processors;
@@ -286,7 +296,7 @@ bool forEachFarEnd(const CMPIObjectPath* cop, const CMPIContext* context, const 
     }
     for (CMPIObjectPath* processor : counted(processors)) {
       stampPath(processor, cop);
-      link(processor);
+      link(processor, false);
     }
   } else if (targetClass == computerSystemClass) {
     const CMPIEnumeration* systems = enumerateSystemNames(context, target, status);
@@ -295,7 +305,7 @@ bool forEachFarEnd(const CMPIObjectPath* cop, const CMPIContext* context, const 
     }
     forEach(systems, [&](const CMPIValue& system) {
       if (!isNull(system.ref)) {
-        link(system.ref);
+        link(system.ref, true);
       }
       return true;
     });
@@ -310,20 +320,21 @@ CMPIStatus CPUSystemDevice_References(CMPIAssociationMI* /*mi*/, const CMPIConte
                                       const char** /*properties*/) {
   events.providerEntry();
   CMPIStatus status = succeeded();
+  CPUObjFactory* factory = factoryOfProcessors();
   const CMPIObjectPath* target =
-      factoryOfProcessors()->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
+      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
   const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
   if (isNull(target) || isNull(templatePath)) {
     fail(association, &status, "Object Path is NULL in References.");
     return status;
   }
-  const auto link = [&](const CMPIObjectPath* far) {
-    const CMPIInstance* reference = newReference(association, {cop, target, templatePath}, far);
+  const auto link = [&](const CMPIObjectPath* far, bool farIsFirst) {
+    const CMPIInstance* reference = newReference(association, {cop, templatePath}, far, farIsFirst);
     if (!isNull(reference)) {
       CMReturnInstance(result, reference);
     }
   };
-  if (forEachFarEnd(cop, context, target, &status, "getAllCPUProcCMPIObjPaths Failed", link)) {
+  if (forEachFarEnd(factory, cop, context, target, &status, "getAllCPUProcCMPIObjPaths Failed", link)) {
     events.providerExit();
   }
   return status;
@@ -334,17 +345,18 @@ CMPIStatus CPUSystemDevice_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIC
                                           const char* /*resultClass*/, const char* /*role*/) {
   events.providerEntry();
   CMPIStatus status = succeeded();
+  CPUObjFactory* factory = factoryOfProcessors();
   const CMPIObjectPath* target =
-      factoryOfProcessors()->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
+      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
   const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
   if (isNull(target) || isNull(templatePath)) {
     fail(association, &status, "Object Path is NULL in ReferenceNames.");
     return status;
   }
-  const auto link = [&](const CMPIObjectPath* far) {
-    deliverStampedPathOf(result, newReference(association, {cop, target, templatePath}, far), cop);
+  const auto link = [&](const CMPIObjectPath* far, bool farIsFirst) {
+    deliverStampedPathOf(result, newReference(association, {cop, templatePath}, far, farIsFirst), cop);
   };
-  if (forEachFarEnd(cop, context, target, &status,
+  if (forEachFarEnd(factory, cop, context, target, &status,
                     "***Can't get Processor instances                 Exiting References***", link)) {
     events.providerExit();
   }

@@ -30,11 +30,10 @@ inline bool setCacheProperties(const Association& association, CPUObjFactory* fa
 /// it. False when the cache is unknown.
 inline bool appendCacheAssociation(const Association& association, CPUObjFactory* factory, const CMPIObjectPath* path,
                                    const CMPIObjectPath* cache, const CMPIObjectPath* dependent,
-                                   const char** properties, Instances& instances, CMPIStatus* status,
+                                   const char** properties, Instances& instances, CMPIStatus* status, unsigned int line,
                                    const char* function) {
   CMPIInstance* instance = newAssociation(association, path, cache, dependent, properties, cacheAssociationKeys);
-  if (!isNull(instance) &&
-      !setCacheProperties(association, factory, instance, cache, status, __builtin_LINE(), function)) {
+  if (!isNull(instance) && !setCacheProperties(association, factory, instance, cache, status, line, function)) {
     return false;
   }
   instances.push_back(instance);

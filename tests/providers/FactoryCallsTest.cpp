@@ -194,6 +194,23 @@ TEST_F(NavigationCalls, OfConcreteComponentForInstances) {
   expectCalls(fromProcessor, OperationKind::Associators, fromProcessor.instances);
 }
 
+// The factory is taken once, also where the broker is asked for the other end.
+TEST_F(NavigationCalls, OfSystemDevice) {
+  const Navigation fromSystem = {
+      "HALDA_CPUSystemDevice",
+      Support::systemPath("x"),
+      "HALDA_CPUProcessor",
+      {"getFactoryInstance(1, 0, 0)"},
+      {"getAllCPUProcCMPIInstances(HALDA_CPUProcessor, properties Caption Level, isObjPath 0)"},
+      {"getAllCPUProcCMPIObjPaths(HALDA_CPUProcessor)"}};
+  const Navigation fromProcessor = {
+      "HALDA_CPUSystemDevice", processorPath("x"), "HALDA_ComputerSystem", {"getFactoryInstance(1, 0, 0)"}, {}, {}};
+  for (const OperationKind kind : operations) {
+    expectCalls(fromSystem, kind, kind == OperationKind::Associators ? fromSystem.instances : fromSystem.names);
+    expectCalls(fromProcessor, kind, {});
+  }
+}
+
 // Another processor's target is not this provider's: nothing is looked up.
 TEST_F(NavigationCalls, StopAtATargetOfAnotherClass) {
   script().targetClass = "HALDA_Unrelated";

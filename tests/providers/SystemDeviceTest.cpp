@@ -83,13 +83,13 @@ TEST_F(SystemDevice, ResultClassMayBeTheProcessorsOrItsParentInAnyCase) {
 }
 
 TEST_F(SystemDevice, AnyOtherResultClassFindsNothing) {
-  for (const std::string wanted : {"CIM_Processor", "CIM_System", "CIM_ComputerSystem ", "HALDA_Computer", "X"}) {
+  for (const std::string wanted : {"CIM_Processor", "CIM_System", "CIM_ComputerSystem ", "HALDA_Computer", "X", ""}) {
     for (const OperationKind kind : associators) {
       EXPECT_EQ(ask(kind, processorPath("cpu0"), wanted), withoutDone(answeredNothing())) << wanted;
     }
   }
   for (const std::string wanted :
-       {"CIM_ComputerSystem", "CIM_LogicalDevice", "CIM_Processo", "HALDA_CPUProcessorCore"}) {
+       {"CIM_ComputerSystem", "CIM_LogicalDevice", "CIM_Processo", "HALDA_CPUProcessorCore", ""}) {
     for (const OperationKind kind : associators) {
       EXPECT_EQ(ask(kind, systemPath("sysA"), wanted), withoutDone(answeredNothing())) << wanted;
     }
@@ -283,6 +283,17 @@ TEST_F(SystemDevice, ElementsOfAnEnumerationThatCannotBeReadAreSkipped) {
     }
     broker.failNth("getNext", 1, {.result = result});
     EXPECT_EQ(enumerateInstanceNames(systemDevice).paths.size(), 2U);
+  }
+}
+
+// It may never come to the end of its enumeration.
+TEST_F(SystemDevice, BrokerThatGoesOnFailingIsNotAskedOn) {
+  broker.serveInstances(systemClass, {systemInstance("sysC"), systemInstance("sysB"), systemInstance("sysA")});
+  for (const OperationKind kind : associationOperations) {
+    broker.failNth("getNext", 1, {}, 2);
+    EXPECT_EQ(results(ask(kind, processorPath("cpu0"))), 0U) << Corvcim::operationName(kind);
+    broker.failNth("getNext", 2, {});
+    EXPECT_EQ(results(ask(kind, processorPath("cpu0"))), 2U) << Corvcim::operationName(kind);
   }
 }
 
