@@ -6,11 +6,13 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <csignal>
 #include <filesystem>
 #include <optional>
 #include <stdexcept>
 #include <system_error>
 
+#include "platform/cvlog/HeldBackSignal.h"
 #include "platform/cvlog/HeldFlag.h"
 #include "platform/cvlog/Level.h"
 #include "platform/cvlog/SystemLogSink.h"
@@ -20,8 +22,6 @@ namespace CVLog {
 namespace {
 
 using Tarn::Common::FileDescriptor;
-
-constexpr std::chrono::minutes kRetryAfter(1);
 
 // Non-blocking, or a pipe without a reader would hold the broker.
 constexpr int kAppending = O_WRONLY | O_APPEND | O_CLOEXEC | O_NOCTTY | O_NONBLOCK;
@@ -111,12 +111,16 @@ std::string realPath(const std::string& path) {
 
 }  // namespace
 
-FileSink::FileSink(const std::string& path, Rotation rotation)
-    : path_(std::filesystem::absolute(path).string()), rotation_(rotation), file_(openLog(path)) {}
+FileSink::FileSink(const std::string& path, Rotation rotation, Clock::duration retryAfter)
+    : path_(std::filesystem::absolute(path).string()),
+      rotation_(rotation),
+      retryAfter_(retryAfter),
+      file_(openLog(path)) {}
 
 void FileSink::write(const Message& message) {
   const std::string line = formatLine(message) + '\n';
   followName(line.size());
+  const HeldBackSignal held(SIGXFSZ);
   writeLine(file_.number(), line);
 }
 
@@ -141,7 +145,7 @@ void FileSink::followName(std::size_t lineSize) {
     isStale ? reopen() : rotate(lineSize);
     retryAt_.store(0, std::memory_order_relaxed);
   } catch (const std::exception& error) {
-    retryAt_.store((Clock::now() + kRetryAfter).time_since_epoch().count(), std::memory_order_relaxed);
+    retryAt_.store((Clock::now() + retryAfter_).time_since_epoch().count(), std::memory_order_relaxed);
     if (retryAt == 0) {
       report(error.what());
     }

@@ -22,13 +22,16 @@ namespace CVLog {
 /// tool for log files, the next message goes to a new file of that name. A file that would outgrow the limit of its
 /// rotation makes way for a new one first; a lock on the file sees to it that one of the processes does so. Nobody
 /// waits for that: who finds the lock taken, or cannot rename or open, writes on to the file that is open. The system
-/// log hears once why a file could not be replaced, and the attempt is repeated a minute later at the earliest.
+/// log hears once why a file could not be replaced, and the attempt is repeated `retryAfter` later at the earliest.
 class FileSink final : public Sink {
  public:
+  using Clock = std::chrono::steady_clock;
+
   /// Opens the file, creates it where needed (readable for its owner and group). A relative path counts from the
   /// directory that the process is in now.
   /// Throws std::runtime_error or a child of it, whose text names the file and says why.
-  explicit FileSink(const std::string& path, Rotation rotation = {});
+  explicit FileSink(const std::string& path, Rotation rotation = {},
+                    Clock::duration retryAfter = std::chrono::minutes(1));
 
   void write(const Message& message) override;
 
@@ -40,10 +43,9 @@ class FileSink final : public Sink {
   [[nodiscard]] bool wouldOutgrow(off_t size, std::size_t lineSize) const;
   void report(std::string_view why) const;
 
-  using Clock = std::chrono::steady_clock;
-
   const std::string path_;  // absolute
   const Rotation rotation_;
+  const Clock::duration retryAfter_;
   // Other files take the place of the first one under its number, so that writers need no lock.
   const Tarn::Common::FileDescriptor file_;
   std::atomic_flag isBeingReplaced_;

@@ -2,9 +2,12 @@
 
 #include <fcntl.h>
 #include <gmock/gmock.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <filesystem>
 #include <stdexcept>
 #include <string>
@@ -67,6 +70,25 @@ TEST_F(LogFile, DoesNotWaitForTheReaderOfAPipe) {
 TEST_F(LogFile, GoesOnWhenTheDiskIsFull) {
   FileSink sink("/dev/full", {.size = 1});
   EXPECT_NO_THROW(sink.write(message("a")));
+}
+
+TEST_F(LogFile, DoesNotKillAProcessThatMayNotWriteMore) {
+  const pid_t child = fork();
+  ASSERT_GE(child, 0);
+  if (child == 0) {
+    FileSink sink(path("log"));
+    sink.write(message("a"));
+    const rlimit limit{line("a").size(), line("a").size()};
+    setrlimit(RLIMIT_FSIZE, &limit);
+    sink.write(message("b"));
+    sigset_t pending;
+    sigpending(&pending);
+    _exit(sigismember(&pending, SIGXFSZ));
+  }
+  int status = -1;
+  waitpid(child, &status, 0);
+  EXPECT_EQ(status, 0);
+  EXPECT_EQ(content("log"), line("a"));
 }
 
 TEST_F(LogFile, ThatWasMovedAwayIsMadeAnewWithItsMode) {

@@ -13,6 +13,11 @@
 
 /// A process whose logger nobody has configured yet, and whose configuration file is the test's.
 class LoggerProcess : public testing::Test {
+ public:
+  LoggerProcess(const LoggerProcess&) = delete;
+  LoggerProcess& operator=(const LoggerProcess&) = delete;
+  ~LoggerProcess() override { std::filesystem::remove_all(directory_); }
+
  protected:
   LoggerProcess() {
     std::filesystem::create_directories(directory_);
@@ -20,7 +25,6 @@ class LoggerProcess : public testing::Test {
     unsetenv("CORVANE_TRACE");
     configure("");
   }
-  ~LoggerProcess() override { std::filesystem::remove_all(directory_); }
 
   [[nodiscard]] std::string path(const std::string& name) const { return directory_ + "/" + name; }
 

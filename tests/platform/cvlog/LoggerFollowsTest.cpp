@@ -32,8 +32,7 @@ constexpr const char* kReadAgain = " was read again\n";
 class FollowingLogger : public LoggerProcess {
  protected:
   CVLog::Logger makeLogger(const std::optional<std::string>& logOverride = std::nullopt) {
-    return CVLog::Logger({path("corvane.conf"), Tarn::Common::ConfigurationFile::Absence::kIsFine}, logOverride,
-                         std::nullopt);
+    return {{path("corvane.conf"), Tarn::Common::ConfigurationFile::Absence::kIsFine}, logOverride, std::nullopt};
   }
 
   static CVLog::Message message(int level, std::string_view text) {
@@ -175,15 +174,16 @@ TEST_F(FollowingLogger, LeavesNoFileOpenThatItDoesNotUseAnyMore) {
 }
 
 TEST_F(FollowingLogger, LosesNoMessageOfAThreadThatLogsMeanwhile) {
-  constexpr int kThreads = 3;
-  constexpr int kMessages = 2000;
+  constexpr std::size_t kThreads = 3;
+  constexpr std::size_t kMessages = 2000;
   configure(to("a"));
   CVLog::Logger logger = makeLogger();
-  std::atomic<int> running = kThreads;
+  std::atomic<std::size_t> running = kThreads;
   std::vector<std::thread> threads;
-  for (int number = 0; number < kThreads; ++number) {
+  threads.reserve(kThreads);
+  for (std::size_t number = 0; number < kThreads; ++number) {
     threads.emplace_back([&] {
-      for (int count = 0; count < kMessages; ++count) {
+      for (std::size_t count = 0; count < kMessages; ++count) {
         logger.log(message(6000, "one"));
       }
       --running;

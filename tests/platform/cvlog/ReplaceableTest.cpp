@@ -90,8 +90,10 @@ TEST_F(ReplaceableValue, IsWholeForEveryThreadWhileItIsReplaced) {
   constexpr int kLast = 20'000;
   Replaceable<std::vector<int>> replaceable(std::make_unique<std::vector<int>>(8, 0));
   std::atomic<bool> isBroken = false;
+  constexpr int kUsers = 3;
   std::vector<std::thread> users;
-  for (int number = 0; number < 3; ++number) {
+  users.reserve(kUsers);
+  for (int number = 0; number < kUsers; ++number) {
     users.emplace_back([&] {
       for (int value = 0; value != kLast;) {
         replaceable.with([&](const std::vector<int>& values) {

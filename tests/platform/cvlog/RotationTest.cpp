@@ -6,6 +6,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <filesystem>
 #include <string>
 #include <system_error>
@@ -135,6 +136,21 @@ TEST_F(LogRotation, LosesNothingWhereFilesCannotBeRenamedAndSaysSoOnce) {
   EXPECT_THAT(recordedSystemLog().back().text,
               EndsWith(" log file " + path("log") + " cannot be rotated: " + path("log") + " cannot be renamed to " +
                        path("log.1") + ": Is a directory; messages go to the file that is open, however large"));
+}
+
+TEST_F(LogRotation, IsTriedAgainAfterAWhile) {
+  FileSink atOnce(path("log"), {.size = twoLines(), .keep = 1}, std::chrono::seconds(0));
+  FileSink later(path("later"), {.size = twoLines(), .keep = 1}, std::chrono::hours(1));
+  std::filesystem::create_directory(path("log.1"));
+  std::filesystem::create_directory(path("later.1"));
+  writeAll(atOnce, "abc");
+  writeAll(later, "abc");
+  std::filesystem::remove(path("log.1"));
+  std::filesystem::remove(path("later.1"));
+  writeAll(atOnce, "d");
+  writeAll(later, "d");
+  EXPECT_EQ(content("log"), line("d"));
+  EXPECT_EQ(content("later"), line("a") + line("b") + line("c") + line("d"));
 }
 
 TEST_F(LogRotation, LeavesItsLockBehindNowhere) {

@@ -99,6 +99,7 @@ TEST_F(SharedLogFile, LosesNoLineOfProcessesThatShareWhatWasOpenBeforeTheFork) {
 TEST_F(SharedLogFile, LosesNoLineOfManyThreadsWhileItIsRotated) {
   FileSink sink(path("log"), kSmallFiles);
   std::vector<std::thread> threads;
+  threads.reserve(kWriters);
   for (int writer = 0; writer < kWriters; ++writer) {
     threads.emplace_back([&sink, writer] { writeAll(sink, writer); });
   }
