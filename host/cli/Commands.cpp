@@ -9,6 +9,7 @@
 #include "host/cli/ClassList.h"
 #include "host/cli/CrashReport.h"
 #include "host/cli/DiffCommand.h"
+#include "host/cli/ExplainCommand.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
 #include "host/cli/Operations.h"
@@ -81,6 +82,9 @@ Outcome runCommand(const Options& options, std::size_t width) {
       break;
   }
   const LibraryFiles files = libraryFiles(options);
+  if (options.verb->verb == Verb::Explain) {
+    return explainValues(files, options);
+  }
   if (options.verb->verb == Verb::Overview) {
     Dispatcher dispatcher(files);
     return showOverview(dispatcher, options.nameSpace);

@@ -16,7 +16,7 @@ using Tarn::Inventory::Tree;
 using Tarn::Inventory::Unread;
 
 void checkIgnored(const std::vector<std::string>& ignored) {
-  const std::vector<std::string_view> known = comparedFields();
+  const std::vector<std::string_view> known = fieldNames();
   for (const std::string& name : ignored) {
     if (std::ranges::find(known, name) != known.end()) {
       continue;
@@ -58,22 +58,6 @@ std::string asText(const Difference& difference) {
   return text;
 }
 
-void writeValue(JsonBuilder& json, const std::optional<FieldValue>& value) {
-  if (!value) {
-    json.null();
-  } else if (const auto* const number = std::get_if<unsigned int>(&*value)) {
-    json.number(std::uint64_t{*number});
-  } else if (const auto* const text = std::get_if<std::string>(&*value)) {
-    json.text(*text);
-  } else {
-    json.beginArray();
-    for (const unsigned int element : std::get<std::vector<unsigned int>>(*value)) {
-      json.number(std::uint64_t{element});
-    }
-    json.endArray();
-  }
-}
-
 void writeChange(JsonBuilder& json, const Difference& difference, const NodeChange& change) {
   const auto& node = change.isRemoved() ? difference.before.node(change.before) : difference.after.node(change.after);
   json.beginObject();
@@ -86,26 +70,13 @@ void writeChange(JsonBuilder& json, const Difference& difference, const NodeChan
     json.key(field.name);
     json.beginObject();
     json.key("a");
-    writeValue(json, field.before);
+    writeFieldValue(json, field.before);
     json.key("b");
-    writeValue(json, field.after);
+    writeFieldValue(json, field.after);
     json.endObject();
   }
   json.endObject();
   json.endObject();
-}
-
-void writeUnreadEntries(JsonBuilder& json, std::string_view name, const std::vector<Unread>& entries) {
-  json.key(name);
-  json.beginArray();
-  for (const Unread& entry : entries) {
-    json.beginObject();
-    json.member("file", entry.file);
-    json.member("reason", entry.reason);
-    json.member("remedy", entry.remedy);
-    json.endObject();
-  }
-  json.endArray();
 }
 
 std::string asJson(const Difference& difference) {
@@ -124,8 +95,8 @@ std::string asJson(const Difference& difference) {
     writeChange(json, difference, change);
   }
   json.endArray();
-  writeUnreadEntries(json, "unreadInA", unreadInOne(difference.before, difference.after));
-  writeUnreadEntries(json, "unreadInB", unreadInOne(difference.after, difference.before));
+  writeUnreadMember(json, "unreadInA", unreadInOne(difference.before, difference.after));
+  writeUnreadMember(json, "unreadInB", unreadInOne(difference.after, difference.before));
   json.endObject();
   return json.take();
 }

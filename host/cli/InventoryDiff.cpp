@@ -1,9 +1,6 @@
 #include "host/cli/InventoryDiff.h"
 
 #include <algorithm>
-#include <array>
-
-#include "platform/instrumentation/PropertyTable.h"
 
 namespace Corvcim {
 namespace {
@@ -11,51 +8,9 @@ namespace {
 using Tarn::Inventory::Node;
 using Tarn::Inventory::NodeIndex;
 using Tarn::Inventory::noNode;
-using Tarn::Inventory::PropertyEntry;
-using Tarn::Inventory::PropertyKind;
 using Tarn::Inventory::Tree;
 
 using Field = std::optional<FieldValue>;
-
-Field unlessEmpty(std::string text) {
-  return text.empty() ? std::nullopt : Field(std::move(text));
-}
-
-/// What every node has beside its properties.
-struct NodeField {
-  std::string_view name;
-  Field (*read)(const Tree& tree, const Node& node);
-};
-
-constexpr std::array nodeFields = {
-    NodeField{
-        "type",
-        [](const Tree&, const Node& node) -> Field { return std::string(Tarn::Inventory::nodeTypeName(node.type)); }},
-    NodeField{"parent",
-              [](const Tree& tree, const Node& node) -> Field {
-                return node.parent == noNode ? std::nullopt : Field(std::string(tree.node(node.parent).path()));
-              }},
-    NodeField{"status", [](const Tree&, const Node& node) -> Field { return node.status; }},
-    NodeField{"description", [](const Tree&, const Node& node) { return unlessEmpty(node.description); }},
-    NodeField{"cpus", [](const Tree&, const Node& node) { return unlessEmpty(node.cpus.toList()); }},
-};
-
-template <class Value>
-Field copied(const Value* value) {
-  return value == nullptr ? std::nullopt : Field(*value);
-}
-
-Field readProperty(const Tree& tree, const Node& node, const PropertyEntry& entry) {
-  switch (entry.kind) {
-    case PropertyKind::Number:
-      return copied(tree.number(node, entry.id));
-    case PropertyKind::Text:
-      return copied(tree.text(node, entry.id));
-    case PropertyKind::List:
-      return copied(tree.list(node, entry.id));
-  }
-  return std::nullopt;
-}
 
 class Comparison {
  public:
@@ -79,13 +34,9 @@ class Comparison {
     const Node* const old = before == noNode ? nullptr : &before_.node(before);
     const Node* const now = after == noNode ? nullptr : &after_.node(after);
     NodeChange change{std::string((old != nullptr ? old : now)->path()), before, after, {}};
-    for (const NodeField& field : nodeFields) {
-      note(change, field.name, old == nullptr ? std::nullopt : field.read(before_, *old),
-           now == nullptr ? std::nullopt : field.read(after_, *now));
-    }
-    for (const PropertyEntry& entry : Tarn::Inventory::propertyTable()) {
-      note(change, entry.name, old == nullptr ? std::nullopt : readProperty(before_, *old, entry),
-           now == nullptr ? std::nullopt : readProperty(after_, *now, entry));
+    for (const std::string_view name : names_) {
+      note(change, name, old == nullptr ? std::nullopt : readField(before_, *old, name),
+           now == nullptr ? std::nullopt : readField(after_, *now, name));
     }
     if (!change.fields.empty() || change.isAdded() || change.isRemoved()) {
       changes_.push_back(std::move(change));
@@ -101,6 +52,7 @@ class Comparison {
   const Tree& before_;
   const Tree& after_;
   std::span<const std::string> ignored_;
+  const std::vector<std::string_view> names_ = fieldNames();
   std::vector<NodeChange> changes_;
 };
 
@@ -109,17 +61,6 @@ class Comparison {
 const FieldChange* NodeChange::field(std::string_view name) const {
   const auto found = std::ranges::find(fields, name, &FieldChange::name);
   return found == fields.end() ? nullptr : &*found;
-}
-
-std::vector<std::string_view> comparedFields() {
-  std::vector<std::string_view> names;
-  for (const NodeField& field : nodeFields) {
-    names.push_back(field.name);
-  }
-  for (const PropertyEntry& entry : Tarn::Inventory::propertyTable()) {
-    names.push_back(entry.name);
-  }
-  return names;
 }
 
 std::vector<NodeChange> compareInventories(const Tree& before, const Tree& after,

@@ -5,18 +5,15 @@
 #include <span>
 #include <string>
 #include <string_view>
-#include <variant>
 #include <vector>
 
+#include "host/cli/NodeFields.h"
 #include "platform/instrumentation/Tree.h"
 
 namespace Corvcim {
 
-/// What a field of a node holds. CPUs are a text in the kernel's list form, the parent its path.
-using FieldValue = std::variant<unsigned int, std::string, std::vector<unsigned int>>;
-
-/// A field that differs: "type", "parent", "status", "description", "cpus", or a property's name.
-/// Absent on the side where the node, or its value, is not there.
+/// A field that differs, by its name (NodeFields.h). Absent on the side where the node, or its value, is
+/// not there.
 struct FieldChange {
   std::string_view name;
   std::optional<FieldValue> before;
@@ -34,9 +31,6 @@ struct NodeChange {
   bool isAdded() const { return before == Tarn::Inventory::noNode; }
   const FieldChange* field(std::string_view name) const;
 };
-
-/// The names of all fields that are compared.
-std::vector<std::string_view> comparedFields();
 
 /// What differs between two inventories. Nodes are matched by their paths: first what is in `before`, in
 /// its order, then what only `after` has. The fields that `ignored` names do not count. What a source could

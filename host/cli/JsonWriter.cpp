@@ -13,48 +13,6 @@ namespace {
 
 void writeInstance(JsonBuilder& json, const Instance& instance, const PropertyList& selection);
 
-void writeValue(JsonBuilder& json, const Value& value) {
-  if (value.isNull()) {
-    json.null();
-    return;
-  }
-  if (value.isArray()) {
-    json.beginArray();
-    for (const Value& element : value.elements()) {
-      writeValue(json, element);
-    }
-    json.endArray();
-    return;
-  }
-  switch (value.type()) {
-    case CMPI_boolean:
-      json.boolean(value.asBoolean());
-      return;
-    case CMPI_real32:
-    case CMPI_real64:
-      json.number(value.asReal());
-      return;
-    case CMPI_ref:
-      json.text(withoutHosts(value.asReference()).text());
-      return;
-    case CMPI_instance:
-      writeInstance(json, value.asInstance(), std::nullopt);
-      return;
-    case CMPI_string:
-    case CMPI_dateTime:
-      json.text(value.asString());
-      return;
-    case CMPI_sint8:
-    case CMPI_sint16:
-    case CMPI_sint32:
-    case CMPI_sint64:
-      json.number(value.asSigned());
-      return;
-    default:
-      json.number(value.asUnsigned());
-  }
-}
-
 void writeValues(JsonBuilder& json, const std::vector<NamedValue>& values) {
   for (const NamedValue& each : values) {
     json.key(each.name);
@@ -98,6 +56,48 @@ void writeInstance(JsonBuilder& json, const Instance& instance, const PropertyLi
 }
 
 }  // namespace
+
+void writeValue(JsonBuilder& json, const Value& value) {
+  if (value.isNull()) {
+    json.null();
+    return;
+  }
+  if (value.isArray()) {
+    json.beginArray();
+    for (const Value& element : value.elements()) {
+      writeValue(json, element);
+    }
+    json.endArray();
+    return;
+  }
+  switch (value.type()) {
+    case CMPI_boolean:
+      json.boolean(value.asBoolean());
+      return;
+    case CMPI_real32:
+    case CMPI_real64:
+      json.number(value.asReal());
+      return;
+    case CMPI_ref:
+      json.text(withoutHosts(value.asReference()).text());
+      return;
+    case CMPI_instance:
+      writeInstance(json, value.asInstance(), std::nullopt);
+      return;
+    case CMPI_string:
+    case CMPI_dateTime:
+      json.text(value.asString());
+      return;
+    case CMPI_sint8:
+    case CMPI_sint16:
+    case CMPI_sint32:
+    case CMPI_sint64:
+      json.number(value.asSigned());
+      return;
+    default:
+      json.number(value.asUnsigned());
+  }
+}
 
 std::string instancesAsJson(std::span<const Instance> instances, const PropertyList& selection) {
   JsonBuilder json;

@@ -6,6 +6,7 @@
 
 #include "host/broker/Instance.h"
 #include "host/broker/Operation.h"
+#include "host/cli/JsonBuilder.h"
 
 namespace Corvcim {
 
@@ -17,6 +18,9 @@ std::string instanceAsJson(const Instance& instance, const PropertyList& selecti
 
 /// Each path is an object with "class", "namespace", "path" and "keys".
 std::string pathsAsJson(std::span<const ObjectPath> paths);
+
+/// One value.
+void writeValue(JsonBuilder& json, const Value& value);
 
 }  // namespace Corvcim
 

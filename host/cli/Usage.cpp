@@ -55,7 +55,7 @@ std::string programHelp() {
     if (!verb.operands.empty()) {
       call += ' ' + std::string(verb.operands);
     }
-    text += "  " + padRight(call, 24) + std::string(verb.summary) + '\n';
+    text += "  " + padRight(call, 27) + std::string(verb.summary) + '\n';
   }
   text += optionHelp;
   text += associationHelp;

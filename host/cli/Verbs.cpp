@@ -37,6 +37,14 @@ constexpr std::string_view diffDetails =
     "\n"
     "Exit status: 0 no differences, 1 differences, 2 trouble.\n";
 
+constexpr std::string_view explainDetails =
+    "PART is a path of the inventory (P0, P0.L2.0), an object path as ein prints it,\n"
+    "CLASS.KEY (HALDA_CPUMemory.P0.L2.0) or CLASS. Without it: every processor, short.\n"
+    "PROPERTY is one or more names with commas between them.\n"
+    "Of each property: the raw datum and the file or table it stands in, the\n"
+    "inventory's value and the rule that made it, what the library does with it,\n"
+    "which sources disagreed, and what could not be read and why.\n";
+
 constexpr VerbSyntax overview = {"", Verb::Overview, "", 0, 0, "one screen about the processors", textOnly, false, ""};
 
 constexpr VerbSyntax syntaxes[] = {
@@ -55,6 +63,8 @@ constexpr VerbSyntax syntaxes[] = {
     {"inventory", Verb::Inventory, "", 0, 0,
      "the inventory that the library reads; -o json writes a file for json:FILE", plainFormats, false,
      inventoryDetails},
+    {"explain", Verb::Explain, "[PART [PROPERTY]]", 0, 2, "where values come from", plainFormats, false,
+     explainDetails},
     {"diff", Verb::Diff, "A B", 2, 2, "what differs between two inventories", plainFormats, false, diffDetails},
     {"tree", Verb::Tree, "", 0, 0, "system, processors, cores and caches as a drawing", drawingFormats, false,
      "Caches stand above the cores that share them, as the inventory tells it.\n"},

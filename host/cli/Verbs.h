@@ -19,6 +19,7 @@ enum class Verb {
   ReferenceNames,
   Inventory,
   Diff,
+  Explain,
   Tree
 };
 

@@ -40,7 +40,7 @@ _corvcim_description() {
 
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
-  local verbs="classes ei ein gi ai ain ri rin inventory diff tree"
+  local verbs="classes ei ein gi ai ain ri rin inventory explain diff tree"
   local options="--inventory --output --namespace --library --companion --language --help --version"
 
   for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
@@ -54,7 +54,7 @@ _corvcim() {
     -o | --output)
       case $verb in
         tree) _corvcim_offer "text svg dot" ;;
-        classes | inventory | diff) _corvcim_offer "text json" ;;
+        classes | inventory | explain | diff) _corvcim_offer "text json" ;;
         *) _corvcim_offer "text mof json svg dot" ;;
       esac
       return
@@ -83,7 +83,7 @@ _corvcim() {
     _corvcim_offer "$verbs"
   elif [[ $verb == diff ]]; then
     _corvcim_inventory
-  elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin) ]]; then
+  elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin|explain) ]]; then
     _corvcim_classes
   fi
 }

@@ -19,14 +19,6 @@ namespace {
 constinit std::mutex mutex;
 constinit std::shared_ptr<const Tree> current;
 
-std::string chosenSource() {
-  if (std::optional<std::string> source = Common::environmentOverride("CORVANE_INVENTORY")) {
-    return *std::move(source);
-  }
-  const Common::Setting* setting = Common::configuration().find("inventory");
-  return setting != nullptr ? setting->value : "live";
-}
-
 // Whoever asks for the tree may say no more than that it failed. Every request asks again, so what is
 // known is not said twice.
 void report(const std::string& text) {
@@ -51,6 +43,14 @@ Tree loadChosen() {
 }
 
 }  // namespace
+
+std::string chosenSource() {
+  if (std::optional<std::string> source = Common::environmentOverride("CORVANE_INVENTORY")) {
+    return *std::move(source);
+  }
+  const Common::Setting* setting = Common::configuration().find("inventory");
+  return setting != nullptr ? setting->value : "live";
+}
 
 std::shared_ptr<const Tree> processTree() {
   const std::scoped_lock lock(mutex);

@@ -2,6 +2,7 @@
 #define CORVANE_PLATFORM_INSTRUMENTATION_PROCESSTREE_H
 
 #include <memory>
+#include <string>
 
 #include "platform/instrumentation/Tree.h"
 
@@ -16,6 +17,10 @@ std::shared_ptr<const Tree> processTree();
 /// For the host and for tests: cursors made from now on walk this tree; cursors that are there keep
 /// theirs. nullptr: the next cursor loads the tree anew.
 void setProcessTree(std::shared_ptr<const Tree> tree);
+
+/// The text that names this process's source of the inventory: the override of the environment, else the
+/// configuration's, else "live".
+std::string chosenSource();
 
 }  // namespace Tarn::Inventory
 
