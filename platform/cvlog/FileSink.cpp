@@ -2,7 +2,9 @@
 
 #include <fcntl.h>
 #include <sys/file.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/sysmacros.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -39,6 +41,21 @@ std::optional<struct stat> statusOf(int descriptor) {
 std::optional<struct stat> statusOf(const std::string& path) {
   struct stat status {};
   return stat(path.c_str(), &status) == 0 ? std::optional(status) : std::nullopt;
+}
+
+/// The device, number and size of the file of that name. Who asks for the times of a file, as stat does, makes the next
+/// write to it slower.
+std::optional<struct stat> sizeAndIdentityOf(const std::string& path) {
+  struct statx extended {};
+  // What another machine may have done to a file in the meantime is not worth waiting for.
+  if (statx(AT_FDCWD, path.c_str(), AT_STATX_DONT_SYNC, STATX_INO | STATX_SIZE, &extended) != 0) {
+    return errno == ENOENT ? std::nullopt : statusOf(path);  // some sandboxes refuse statx
+  }
+  struct stat status {};
+  status.st_dev = makedev(extended.stx_dev_major, extended.stx_dev_minor);
+  status.st_ino = extended.stx_ino;
+  status.st_size = static_cast<off_t>(extended.stx_size);
+  return status;
 }
 
 bool isRegular(const std::optional<struct stat>& status) {
@@ -102,6 +119,12 @@ class FileLock {
   bool isHeld_;
 };
 
+/// Whether a write can end the process (see HeldBackSignal).
+bool hasSizeLimit() {
+  rlimit limit{};
+  return getrlimit(RLIMIT_FSIZE, &limit) != 0 || limit.rlim_cur != RLIM_INFINITY;
+}
+
 /// The path without symbolic links: what is rotated is the file, not a link to it.
 std::string realPath(const std::string& path) {
   std::error_code error;
@@ -115,22 +138,30 @@ FileSink::FileSink(const std::string& path, Rotation rotation, Clock::duration r
     : path_(std::filesystem::absolute(path).string()),
       rotation_(rotation),
       retryAfter_(retryAfter),
-      file_(openLog(path)) {}
+      file_(openLog(path)),
+      isFollowed_(isRegular(statusOf(file_.number()))),
+      mayBeTooLarge_(hasSizeLimit()) {
+  if (const std::optional<struct stat> status = statusOf(file_.number())) {
+    identity_.set(*status);
+  }
+}
 
 void FileSink::write(const Message& message) {
   const std::string line = formatLine(message) + '\n';
-  followName(line.size());
-  const HeldBackSignal held(SIGXFSZ);
+  if (isFollowed_) {
+    followName(line.size());
+  }
+  std::optional<HeldBackSignal> held;
+  if (mayBeTooLarge_) {
+    held.emplace(SIGXFSZ);
+  }
   writeLine(file_.number(), line);
 }
 
 void FileSink::followName(std::size_t lineSize) {
-  const std::optional<struct stat> current = statusOf(file_.number());
-  if (!isRegular(current)) {
-    return;
-  }
-  const bool isStale = !isSameFile(current, statusOf(path_));
-  if (!isStale && !wouldOutgrow(current->st_size, lineSize)) {
+  const std::optional<struct stat> named = sizeAndIdentityOf(path_);
+  const bool isStale = !named || !identity_.isThatOf(*named);
+  if (!isStale && !wouldOutgrow(named->st_size, lineSize)) {
     return;
   }
   const Clock::rep retryAt = retryAt_.load(std::memory_order_relaxed);
@@ -141,8 +172,12 @@ void FileSink::followName(std::size_t lineSize) {
   if (!replacing) {
     return;
   }
+  const std::optional<struct stat> current = statusOf(file_.number());
+  if (!current || !identity_.isThatOf(*current)) {
+    return;  // the process has closed the descriptor; its number may be anything now
+  }
   try {
-    isStale ? reopen() : rotate(lineSize);
+    isStale ? adopt(openSuccessor(path_, *current)) : rotate(lineSize);
     retryAt_.store(0, std::memory_order_relaxed);
   } catch (const std::exception& error) {
     retryAt_.store((Clock::now() + retryAfter_).time_since_epoch().count(), std::memory_order_relaxed);
@@ -152,14 +187,18 @@ void FileSink::followName(std::size_t lineSize) {
   }
 }
 
-bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
-  return rotation_.size != 0 && size > 0 && static_cast<std::uint64_t>(size) + lineSize > rotation_.size;
+bool FileSink::Identity::isThatOf(const struct stat& status) const {
+  return device_.load(std::memory_order_relaxed) == status.st_dev &&
+         number_.load(std::memory_order_relaxed) == status.st_ino;
 }
 
-void FileSink::reopen() {
-  if (const std::optional<struct stat> predecessor = statusOf(file_.number())) {
-    adopt(openSuccessor(path_, *predecessor));
-  }
+void FileSink::Identity::set(const struct stat& status) {
+  device_.store(status.st_dev, std::memory_order_relaxed);
+  number_.store(status.st_ino, std::memory_order_relaxed);
+}
+
+bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
+  return rotation_.size != 0 && size > 0 && static_cast<std::uint64_t>(size) + lineSize > rotation_.size;
 }
 
 void FileSink::rotate(std::size_t lineSize) {
@@ -173,8 +212,11 @@ void FileSink::rotate(std::size_t lineSize) {
     return;  // somebody else is at it
   }
   const std::optional<struct stat> current = statusOf(locked.number());
+  if (!current) {
+    fail("cannot be rotated");
+  }
   if (!isSameFile(current, statusOf(path_))) {
-    reopen();  // somebody else was faster
+    adopt(openSuccessor(path_, *current));  // somebody else was faster
   } else if (!wouldOutgrow(current->st_size, lineSize)) {
     adopt(locked);  // somebody else was faster still
   } else {
@@ -185,7 +227,8 @@ void FileSink::rotate(std::size_t lineSize) {
 }
 
 void FileSink::adopt(const FileDescriptor& next) {
-  if (!isRegular(statusOf(next.number()))) {
+  const std::optional<struct stat> status = statusOf(next.number());
+  if (!isRegular(status)) {
     throw std::runtime_error("is not a regular file any more");
   }
   int number = -1;
@@ -195,6 +238,7 @@ void FileSink::adopt(const FileDescriptor& next) {
   if (number < 0) {
     fail("cannot be replaced");
   }
+  identity_.set(*status);
 }
 
 void FileSink::report(std::string_view why) const {

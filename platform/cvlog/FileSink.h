@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_CVLOG_FILESINK_H
 #define CORVANE_PLATFORM_CVLOG_FILESINK_H
 
+#include <sys/stat.h>
 #include <sys/types.h>
 
 #include <atomic>
@@ -36,8 +37,19 @@ class FileSink final : public Sink {
   void write(const Message& message) override;
 
  private:
+  /// Which file is open. A reader that finds half of a new identity takes the file for another one, which the thread
+  /// that replaces files finds out.
+  class Identity {
+   public:
+    [[nodiscard]] bool isThatOf(const struct stat& status) const;
+    void set(const struct stat& status);
+
+   private:
+    std::atomic<dev_t> device_{0};
+    std::atomic<ino_t> number_{0};
+  };
+
   void followName(std::size_t lineSize);
-  void reopen();
   void rotate(std::size_t lineSize);
   void adopt(const Tarn::Common::FileDescriptor& next);
   [[nodiscard]] bool wouldOutgrow(off_t size, std::size_t lineSize) const;
@@ -48,6 +60,9 @@ class FileSink final : public Sink {
   const Clock::duration retryAfter_;
   // Other files take the place of the first one under its number, so that writers need no lock.
   const Tarn::Common::FileDescriptor file_;
+  const bool isFollowed_;     // a regular file
+  const bool mayBeTooLarge_;  // for the limit that was set when it was opened
+  Identity identity_;
   std::atomic_flag isBeingReplaced_;
   std::atomic<Clock::rep> retryAt_{0};  // 0: the last replacement did not fail
 };

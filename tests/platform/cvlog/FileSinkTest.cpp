@@ -76,10 +76,10 @@ TEST_F(LogFile, DoesNotKillAProcessThatMayNotWriteMore) {
   const pid_t child = fork();
   ASSERT_GE(child, 0);
   if (child == 0) {
-    FileSink sink(path("log"));
-    sink.write(message("a"));
     const rlimit limit{line("a").size(), line("a").size()};
     setrlimit(RLIMIT_FSIZE, &limit);
+    FileSink sink(path("log"));
+    sink.write(message("a"));
     sink.write(message("b"));
     sigset_t pending;
     sigpending(&pending);
@@ -133,6 +133,22 @@ TEST_F(LogFile, IsFollowedAlsoWhenTheProcessGoesToAnotherDirectory) {
   std::filesystem::current_path(before);
   EXPECT_EQ(content("log"), line("b"));
   EXPECT_THAT(content("elsewhere/log"), IsEmpty());
+}
+
+TEST_F(LogFile, WhoseDescriptorTheProcessHasClosedLeavesTheNextOneOfThatNumberAlone) {
+  const int number = dup(STDERR_FILENO);
+  close(number);
+  FileSink sink(path("log"));
+  const int other = open(path("other").c_str(), O_RDONLY | O_CREAT | O_CLOEXEC, 0600);
+  ASSERT_EQ(dup2(other, number), number);
+  close(other);
+  std::filesystem::remove(path("log"));
+  sink.write(message("a"));
+  struct stat byNumber {};
+  struct stat byName {};
+  ASSERT_EQ(fstat(number, &byNumber), 0);
+  ASSERT_EQ(stat(path("other").c_str(), &byName), 0);
+  EXPECT_EQ(byNumber.st_ino, byName.st_ino);
 }
 
 TEST_F(LogFile, WhoseNameWasTakenBySomethingElseStaysOpen) {
