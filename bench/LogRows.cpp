@@ -2,8 +2,7 @@
 
 #include <Trace.h>
 
-#include <cstdio>
-
+#include "bench/LogFloors.h"
 #include "bench/Rows.h"
 
 namespace Corvane::Bench {
@@ -15,16 +14,6 @@ constexpr const char* function = "makeCPUProcInstance";
 constexpr unsigned int line = 214;
 
 constexpr Tarn::EventLog events{component, file, Tarn::LevelDetail};
-
-/// An event goes to two sinks and is formatted for each.
-template <class... Arguments>
-void formatTwice(const char* format, Arguments... arguments) {
-  char buffer[512];
-  for (int sink = 0; sink < 2; ++sink) {
-    benchmark::DoNotOptimize(std::snprintf(buffer, sizeof buffer, format, arguments...));
-    benchmark::DoNotOptimize(buffer);
-  }
-}
 
 void addPlainEvents() {
   constexpr double limit = 0.8;
@@ -56,17 +45,7 @@ void addParameterListEvent() {
                          {" rc=", broker}},
                         line, function);
       },
-      [=] {
-        char list[256];
-        char buffer[512];
-        for (int sink = 0; sink < 2; ++sink) {
-          std::snprintf(list, sizeof list, " broker=%p ref=%p proc=%p properties=%d isObjPath=%d rc=%p", broker, broker,
-                        broker, 0, 1, broker);
-          std::snprintf(buffer, sizeof buffer, "ENTERING: %s() in %s [Line: %u],Parameters List: %s", function, file,
-                        line, list);
-          benchmark::DoNotOptimize(buffer);
-        }
-      });
+      [=] { formatEntryTwice(function, file, line, broker); });
 }
 
 }  // namespace
