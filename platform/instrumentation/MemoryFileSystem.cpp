@@ -45,6 +45,10 @@ FileError MemoryFileSystem::read(const char* path, std::string& contents) {
 
 FileError MemoryFileSystem::list(const char* directory, std::vector<std::string>& names) {
   names.clear();
+  if (const auto entry = files_.find(std::string_view(directory)); entry != files_.end() && entry->second.listing) {
+    names = entry->second.listing->names;
+    return entry->second.listing->error;
+  }
   const std::string prefix = std::string(directory) + '/';
   for (auto file = files_.lower_bound(prefix); file != files_.end() && file->first.starts_with(prefix); ++file) {
     const std::string_view rest = std::string_view(file->first).substr(prefix.size());

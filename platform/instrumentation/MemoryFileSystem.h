@@ -4,6 +4,7 @@
 #include <functional>
 #include <map>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -16,9 +17,15 @@ namespace Tarn::Inventory {
 /// Files in memory, for tests and captures.
 class MemoryFileSystem final : public FileSystem {
  public:
+  struct Listing {
+    std::vector<std::string> names = {};
+    FileError error = 0;  ///< what an attempt to list it gives
+    bool operator==(const Listing&) const = default;
+  };
   struct Entry {
-    std::string contents;
-    FileError error = 0;  ///< what an attempt to read it gives
+    std::string contents = {};
+    FileError error = 0;                  ///< what an attempt to read it gives
+    std::optional<Listing> listing = {};  ///< of a directory whose names are known; else those of the files below it
     bool operator==(const Entry&) const = default;
   };
   using Files = std::map<std::string, Entry, std::less<>>;
@@ -26,7 +33,7 @@ class MemoryFileSystem final : public FileSystem {
   MemoryFileSystem() = default;
   explicit MemoryFileSystem(Files files) : files_(std::move(files)) {}
 
-  void add(std::string path, std::string contents) { files_[std::move(path)] = {std::move(contents), 0}; }
+  void add(std::string path, std::string contents) { files_[std::move(path)] = {std::move(contents)}; }
   void fail(std::string path, FileError error) { files_[std::move(path)] = {{}, error}; }
   void remove(std::string_view prefix);  ///< every file whose path begins so
 

@@ -9,13 +9,21 @@ FileError RecordingFileSystem::read(const char* path, std::string& contents) {
   std::string whole = prefix_ + path;
   record_.opened.push_back(whole);
   if (error != ENOENT) {
-    record_.files[std::move(whole)] = {contents, error};
+    MemoryFileSystem::Entry& entry = record_.files[std::move(whole)];
+    entry.contents = contents;
+    entry.error = error;
   }
   return error;
 }
 
 FileError RecordingFileSystem::list(const char* directory, std::vector<std::string>& names) {
-  return target_.list(directory, names);
+  const FileError error = target_.list(directory, names);
+  if (error != ENOENT) {
+    MemoryFileSystem::Entry& entry = record_.files[prefix_ + directory];
+    entry.listing = {error == 0 ? names : std::vector<std::string>(), error};
+    entry.error = error == 0 ? EISDIR : error;
+  }
+  return error;
 }
 
 std::unique_ptr<FileSystem> RecordingFileSystem::below(const char* directory) {

@@ -18,7 +18,7 @@ class RecordingFileSystem final : public FileSystem {
  public:
   struct Record {
     std::vector<std::string> opened;  ///< paths that were read, failed attempts included
-    MemoryFileSystem::Files files;    ///< what was found in them
+    MemoryFileSystem::Files files;    ///< what was found in them, and in the directories that were listed
   };
 
   RecordingFileSystem(FileSystem& target, Record& record) : RecordingFileSystem(target, record, {}) {}

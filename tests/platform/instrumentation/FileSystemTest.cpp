@@ -76,9 +76,43 @@ TEST(FileSystem, Recorded) {
   EXPECT_EQ(files.read("c/denied", contents), EACCES);
 
   EXPECT_EQ(record.opened, (Names{"a/one", "a/nothing", "a/b/two", "a/b/three", "nothing/one", "c/denied"}));
-  ASSERT_EQ(record.files.size(), 4U) << "what is not there is not kept";
+  ASSERT_EQ(record.files.size(), 6U) << "what is not there is not kept";
   EXPECT_EQ(record.files.at("a/b/three").contents, "3\n");
   EXPECT_EQ(record.files.at("c/denied").error, EACCES);
+  EXPECT_EQ(record.files.at("a").listing, (MemoryFileSystem::Listing{{"b", "one"}, 0}));
+  EXPECT_EQ(record.files.at("a/b").listing, (MemoryFileSystem::Listing{{"three", "two"}, 0}));
+}
+
+TEST(FileSystem, RecordedGivesTheSameAnswers) {
+  const ScratchDirectory directory;
+  directory.write("a/read", "1\n");
+  directory.write("a/never/read", "2\n");
+  const std::unique_ptr<FileSystem> target = openDirectory(directory.name());
+  RecordingFileSystem::Record record;
+  RecordingFileSystem recorder(*target, record);
+  struct Answers {
+    FileError read, readDirectory, list, listFile, listNothing;
+    std::string contents;
+    Names names;
+    bool operator==(const Answers&) const = default;
+  };
+  const auto ask = [](FileSystem& files) {
+    Answers answers{};
+    Names none;
+    std::string nothing;
+    answers.listFile = files.list("a/read", none);
+    answers.read = files.read("a/read", answers.contents);
+    answers.readDirectory = files.read("a", nothing);
+    answers.list = files.list("a", answers.names);
+    answers.listNothing = files.list("b", none);
+    return answers;
+  };
+
+  const Answers recorded = ask(recorder);
+  MemoryFileSystem replay(record.files);
+
+  EXPECT_EQ(recorded, (Answers{0, EISDIR, 0, ENOTDIR, ENOENT, "1\n", {"never", "read"}}));
+  EXPECT_EQ(ask(replay), recorded);
 }
 
 TEST(FileSystem, ReadsFilesLongerThanItsBuffer) {
