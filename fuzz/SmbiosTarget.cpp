@@ -29,7 +29,7 @@ void checkField(const Structure& structure, const Field<Value>& field) {
 void checkText(const Structure& structure, const Field<std::string>& field) {
   checkField(structure, field);
   if (field) {
-    const auto text = structure.string(std::to_integer<unsigned int>(field.raw[0]));
+    const auto text = structure.string(std::to_integer<unsigned int>(field.raw.front()));
     require(text && std::ranges::equal(*text, bytesOf(*field)), "a text is the string that its field names");
   }
 }
@@ -47,8 +47,8 @@ void checkRecords(const Tables& tables) {
       checkText(p.structure, *field);
     }
     for (const auto* const field :
-         {&p.family, &p.externalClock, &p.maxSpeed, &p.currentSpeed, &p.caches[0], &p.caches[1], &p.caches[2], &p.cores,
-          &p.coresEnabled, &p.threads, &p.characteristics, &p.threadsEnabled}) {
+         {&p.family, &p.externalClock, &p.maxSpeed, &p.currentSpeed, p.caches.data(), &p.caches[1], &p.caches[2],
+          &p.cores, &p.coresEnabled, &p.threads, &p.characteristics, &p.threadsEnabled}) {
       checkField(p.structure, *field);
     }
     checkField(p.structure, p.id);

@@ -14,6 +14,7 @@
 #include "host/cli/Libraries.h"
 #include "host/cli/Operations.h"
 #include "host/cli/Overview.h"
+#include "host/cli/SnapshotCommand.h"
 #include "host/cli/Topology.h"
 #include "host/cli/TreeDot.h"
 #include "host/cli/TreeSvg.h"
@@ -74,6 +75,8 @@ Outcome runCommand(const Options& options, std::size_t width) {
       return {writeClassList(options.format), {}};
     case Verb::Inventory:
       return {inventoryOutput(options), {}};
+    case Verb::Snapshot:
+      return takeSnapshot(options);
     case Verb::Diff:
       return diffInventories(options);
     case Verb::Tree:

@@ -42,6 +42,9 @@ constexpr Scope onlyInventory = {[](const VerbSyntax& verb) { return verb.verb =
                                  "it belongs to inventory"};
 constexpr Scope onlyDiff = {[](const VerbSyntax& verb) { return verb.verb == Verb::Diff; }, "it belongs to diff"};
 
+constexpr Scope onlySnapshot = {[](const VerbSyntax& verb) { return verb.verb == Verb::Snapshot; },
+                                "it belongs to snapshot"};
+
 /// An option: its spellings, and what it does with its value. An option without a value is given "".
 struct Option {
   std::string_view longName;
@@ -90,6 +93,7 @@ constexpr Option optionTable[] = {
     {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.description = value; }},
     {"--ignore", "", true, onlyDiff,
      [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
+    {"--unmasked", "", false, onlySnapshot, [](Options& o, const std::string&) { o.unmasked = true; }},
     {"--help", "-h", false, everyVerb, [](Options& o, const std::string&) { o.wantsHelp = true; }},
     {"--version", "-V", false, everyVerb, [](Options& o, const std::string&) { o.wantsVersion = true; }},
     {"", "-ac", true, associationVerbs,

@@ -28,12 +28,13 @@ struct Options {
   std::string nameSpace = "root/cimv2";
   Format format = Format::Text;
   const VerbSyntax* verb = &overviewSyntax();
-  std::string target;        ///< the class, the path or the first source; empty for verbs without one
+  std::string target;        ///< the class, the path, the first source or the file to write; may be empty
   std::string secondTarget;  ///< the second source of diff
   bool hasPropertyList = false;
   std::vector<std::string> properties;  ///< an empty list selects the keys alone
   AssociationOptions association;
   std::vector<std::string> ignoredFields;  ///< what diff leaves out
+  bool unmasked = false;                   ///< snapshot keeps serial numbers and the like
   bool wantsHelp = false;
   bool wantsVersion = false;
 };

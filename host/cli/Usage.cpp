@@ -16,7 +16,8 @@ constexpr std::string_view introduction =
 constexpr std::string_view optionHelp =
     "\n"
     "Options:\n"
-    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc) or json:FILE\n"
+    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc), snapshot:FILE\n"
+    "                          or json:FILE\n"
     "  -o, --output FORMAT     text, mof or json; for tree: text, svg or dot\n"
     "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
     "  -l, --library FILE      the provider library\n"
@@ -24,6 +25,7 @@ constexpr std::string_view optionHelp =
     "      --from DESCRIPTION  what inventory converts: hwloc:FILE (XML of lstopo) or\n"
     "                          hwloc-synthetic:\"package:2 core:4 pu:2\"\n"
     "      --ignore FIELD,...  what diff leaves out, such as CurrentClockSpeed\n"
+    "      --unmasked          keeps serial numbers and the like in a snapshot\n"
     "      --language ID       language of captions and descriptions, such as de_AT\n"
     "  -h, --help              this help; after a verb: the help of that verb\n"
     "  -V, --version           the version\n";

@@ -31,9 +31,9 @@ constexpr std::string_view inventoryDetails =
     "  corvcim inventory --from hwloc-synthetic:\"package:2 l3:1 l2:4 core:1 pu:2\"\n";
 
 constexpr std::string_view diffDetails =
-    "A and B are sources as --inventory takes them: live, root:DIR, json:FILE.\n"
-    "Parts are matched by their paths. --ignore CurrentClockSpeed,description leaves\n"
-    "fields out; clocks change by themselves.\n"
+    "A and B are sources as --inventory takes them: live, root:DIR, snapshot:FILE,\n"
+    "json:FILE. Parts are matched by their paths. --ignore CurrentClockSpeed,description\n"
+    "leaves fields out; clocks change by themselves.\n"
     "\n"
     "Exit status: 0 no differences, 1 differences, 2 trouble.\n";
 
@@ -44,6 +44,13 @@ constexpr std::string_view explainDetails =
     "Of each property: the raw datum and the file or table it stands in, the\n"
     "inventory's value and the rule that made it, what the library does with it,\n"
     "which sources disagreed, and what could not be read and why.\n";
+
+constexpr std::string_view snapshotDetails =
+    "Writes every file that the inventory is read from into one, FILE or standard\n"
+    "output, which -i snapshot:FILE reads as the same inventory on any machine: what\n"
+    "to send along with a wrong answer. Serial numbers and other identifiers of this\n"
+    "machine are masked, and the file's first lines say which; --unmasked keeps them.\n"
+    "Run it as root: only root may read the firmware's tables.\n";
 
 constexpr VerbSyntax overview = {"", Verb::Overview, "", 0, 0, "one screen about the processors", textOnly, false, ""};
 
@@ -65,6 +72,8 @@ constexpr VerbSyntax syntaxes[] = {
      inventoryDetails},
     {"explain", Verb::Explain, "[PART [PROPERTY]]", 0, 2, "where values come from", plainFormats, false,
      explainDetails},
+    {"snapshot", Verb::Snapshot, "[FILE]", 0, 1, "the files that the inventory is read from, in one", textOnly, false,
+     snapshotDetails},
     {"diff", Verb::Diff, "A B", 2, 2, "what differs between two inventories", plainFormats, false, diffDetails},
     {"tree", Verb::Tree, "", 0, 0, "system, processors, cores and caches as a drawing", drawingFormats, false,
      "Caches stand above the cores that share them, as the inventory tells it.\n"},

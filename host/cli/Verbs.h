@@ -18,6 +18,7 @@ enum class Verb {
   References,
   ReferenceNames,
   Inventory,
+  Snapshot,
   Diff,
   Explain,
   Tree

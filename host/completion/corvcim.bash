@@ -22,7 +22,7 @@ _corvcim_inventory() {
   elif [[ ${COMP_WORDS[COMP_CWORD - 1]} == : ]]; then
     _corvcim_files "$current"
   else
-    _corvcim_offer "live root: json:"
+    _corvcim_offer "live root: snapshot: json:"
     compopt -o nospace
   fi
 }
@@ -40,7 +40,7 @@ _corvcim_description() {
 
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
-  local verbs="classes ei ein gi ai ain ri rin inventory explain diff tree"
+  local verbs="classes ei ein gi ai ain ri rin inventory explain snapshot diff tree"
   local options="--inventory --output --namespace --library --companion --language --help --version"
 
   for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
@@ -76,6 +76,7 @@ _corvcim() {
       ai | ain) options+=" -ac -arc -ar -arr" ;;
       ri | rin) options+=" -ac -arc -ar" ;;
       diff) options+=" --ignore" ;;
+      snapshot) options+=" --unmasked" ;;
       inventory) options+=" --from" ;;
     esac
     _corvcim_offer "$options"
@@ -83,6 +84,8 @@ _corvcim() {
     _corvcim_offer "$verbs"
   elif [[ $verb == diff ]]; then
     _corvcim_inventory
+  elif [[ $verb == snapshot ]]; then
+    _corvcim_files "$current"
   elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin|explain) ]]; then
     _corvcim_classes
   fi

@@ -14,14 +14,17 @@
 
 namespace Tarn::Inventory {
 
+/// What listing a directory gives.
+struct DirectoryListing {
+  std::vector<std::string> names = {};
+  FileError error = 0;
+  bool operator==(const DirectoryListing&) const = default;
+};
+
 /// Files in memory, for tests and captures.
 class MemoryFileSystem final : public FileSystem {
  public:
-  struct Listing {
-    std::vector<std::string> names = {};
-    FileError error = 0;  ///< what an attempt to list it gives
-    bool operator==(const Listing&) const = default;
-  };
+  using Listing = DirectoryListing;
   struct Entry {
     std::string contents = {};
     FileError error = 0;                  ///< what an attempt to read it gives

@@ -1,8 +1,10 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_SOURCE_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_SOURCE_H
 
+#include <memory>
 #include <string_view>
 
+#include "platform/instrumentation/FileSystem.h"
 #include "platform/instrumentation/Tree.h"
 
 namespace Tarn::Inventory {
@@ -12,11 +14,16 @@ namespace Tarn::Inventory {
 ///     live          this machine
 ///     root:DIR      a captured root directory that holds sys/ and proc/
 ///     root:FILE     the same in one file (Archive.h)
+///     snapshot:FILE what another machine's live source read (Snapshot.h)
 ///     json:FILE     a tree written as JSON (JsonTree.h)
 ///
 /// With Detail::WithOrigins the tree also tells of each value where it comes from.
 /// Throws InventoryError where the text names no source, or its source can not be read.
 Tree loadInventory(std::string_view specification, Detail detail = Detail::Values);
+
+/// The root of the files that this source is read from; nullptr where it is none of files (json:).
+/// Throws InventoryError as above.
+std::unique_ptr<FileSystem> openSource(std::string_view specification);
 
 }  // namespace Tarn::Inventory
 

@@ -152,6 +152,18 @@ TEST(Options, DiffNamesWhatIsMissing) {
   EXPECT_EQ(complaint({"diff", "live"}), "diff: B is missing; usage: corvcim [OPTION...] diff A B");
 }
 
+TEST(Options, SnapshotMayNameAFileAndKeepIdentifiers) {
+  const Options toOutput = parse({"snapshot"});
+  const Options toFile = parse({"snapshot", "--unmasked", "machine.txt"});
+
+  EXPECT_EQ(toOutput.target, "");
+  EXPECT_FALSE(toOutput.unmasked);
+  EXPECT_EQ(toFile.target, "machine.txt");
+  EXPECT_TRUE(toFile.unmasked);
+  EXPECT_EQ(complaint({"snapshot", "a", "b"}),
+            "snapshot: unexpected argument 'b'; usage: corvcim [OPTION...] snapshot [FILE]");
+}
+
 TEST(Options, OptionsOfOneVerbAreRefusedByTheOthers) {
   EXPECT_EQ(complaint({"diff", "live", "live", "--inventory=live"}),
             "diff takes no option '--inventory': A and B say which inventories; see 'corvcim --help'");

@@ -64,10 +64,11 @@ TEST(Source, ACaptureOfTheLiveMachineGivesTheSameTree) {
 }
 
 TEST(Source, RefusesWhatNamesNoSource) {
-  for (const char* text : {"", "foo", "foo:x", "json", "json:", "root", "root:", "live:", "live:x", "Live", " live"}) {
+  for (const char* text : {"", "foo", "foo:x", "json", "json:", "root", "root:", "live:", "live:x", "Live", " live",
+                           "snapshot", "snapshot:"}) {
     EXPECT_EQ(refusalOf(text), "can not read the inventory: \"" + std::string(text) +
                                    "\": it names no source of an inventory; set CORVANE_INVENTORY, or inventory in the "
-                                   "configuration, to live, root:DIRECTORY or json:FILE");
+                                   "configuration, to live, root:DIRECTORY, snapshot:FILE or json:FILE");
   }
 }
 

@@ -1,0 +1,73 @@
+#include <algorithm>
+#include <memory>
+#include <vector>
+
+#include "platform/instrumentation/Archive.h"
+#include "platform/instrumentation/Error.h"
+#include "platform/instrumentation/LiveSource.h"
+#include "platform/instrumentation/Masking.h"
+#include "platform/instrumentation/RecordingFileSystem.h"
+#include "platform/instrumentation/Snapshot.h"
+#include "platform/instrumentation/Source.h"
+
+namespace Tarn::Inventory {
+
+namespace {
+
+void comment(std::string& text, std::string line) {
+  std::ranges::replace(line, '\n', ' ');
+  text += "# " + line + '\n';
+}
+
+std::string headOf(const std::string& program, std::string_view specification) {
+  std::string text(snapshotFirstLine);
+  text += '\n';
+  // Not where a captured root is: that names directories, and people.
+  const std::string_view kind = specification.substr(0, specification.find(':'));
+  comment(text, "The files that " + program + " read for the inventory; source: " + std::string(kind));
+  comment(text, "To read the same inventory anywhere: corvcim --inventory snapshot:FILE");
+  return text;
+}
+
+void describeMasks(std::string& text, const std::vector<std::string>& masks) {
+  if (masks.empty()) {
+    comment(text, "Masked: nothing; no identifier of this machine was read.");
+    return;
+  }
+  comment(text, "Masked, at equal length, is what tells this machine from others of its kind:");
+  for (const std::string& mask : masks) {
+    comment(text, "  " + mask);
+  }
+}
+
+}  // namespace
+
+Snapshot takeSnapshot(std::string_view specification, Identifiers identifiers, const std::string& program) {
+  const std::unique_ptr<FileSystem> files = openSource(specification);
+  if (!files) {
+    throw InventoryError("can not take a snapshot", std::string(specification),
+                         "the source is a tree, and nothing of it is read from a machine's files",
+                         "name live, root:DIRECTORY or snapshot:FILE, or pass on the tree's own file");
+  }
+  Snapshot snapshot;
+  RecordingFileSystem::Record record;
+  try {
+    RecordingFileSystem recorder(*files, record);
+    readLiveInventory(recorder);
+  } catch (const InventoryError& error) {
+    snapshot.error = error.what();
+  }
+  snapshot.text = headOf(program, specification);
+  if (identifiers == Identifiers::Masked) {
+    describeMasks(snapshot.text, maskIdentifiers(record.files));
+  } else {
+    comment(snapshot.text, "Nothing is masked: serial numbers and other identifiers are as they were read.");
+  }
+  if (!snapshot.error.empty()) {
+    comment(snapshot.text, "No inventory came of it: " + snapshot.error);
+  }
+  snapshot.text += writeArchive(record.files);
+  return snapshot;
+}
+
+}  // namespace Tarn::Inventory
