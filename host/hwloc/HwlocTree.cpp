@@ -5,10 +5,13 @@
 
 #include "host/hwloc/HwlocConversion.h"
 #include "host/hwloc/HwlocParts.h"
+#include "platform/instrumentation/CacheNodes.h"
+#include "platform/instrumentation/CoreNodes.h"
 #include "platform/instrumentation/CpuIdentity.h"
 #include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/NodePaths.h"
 #include "platform/instrumentation/PropertyTable.h"
+#include "platform/instrumentation/SystemModel.h"
 #include "platform/instrumentation/TreeBuilder.h"
 
 namespace Corvcim {
@@ -72,49 +75,14 @@ CpuIdentity identify(hwloc_obj_t package) {
   return identity;
 }
 
-std::string_view firstRemark(hwloc_obj_t object, std::initializer_list<const char*> names) {
+/// What the firmware says by one of these names, unless nobody filled it in.
+std::string_view firmwareRemark(hwloc_obj_t object, std::initializer_list<const char*> names) {
   for (const char* name : names) {
-    if (const std::string_view text = infoOf(object, name); !text.empty()) {
+    if (const std::string_view text = infoOf(object, name); !text.empty() && !isPlaceholder(text)) {
       return text;
     }
   }
   return {};
-}
-
-// The kind of part and its number, which its path ends with: "L2 cache 3", "Core at CPU 8".
-std::string described(const std::string& label, std::string_view path) {
-  const std::size_t mark = path.find_last_of("@.CP");
-  return label + (path[mark] == '@' ? " at CPU " : " ") + std::string(path.substr(mark + 1));
-}
-
-std::string partOf(const char* group, std::optional<unsigned int> number) {
-  return number.value_or(0) == 0 ? std::string() : std::string(" of ") + group + ' ' + std::to_string(*number);
-}
-
-std::string describeCache(const Cache& cache, const std::string& path) {
-  const std::string_view contents = cache.contents == CacheContents::Data           ? " data"
-                                    : cache.contents == CacheContents::Instructions ? " instruction"
-                                                                                    : "";
-  return described("L" + std::to_string(cache.level) + std::string(contents) + " cache", path);
-}
-
-unsigned int levelCode(unsigned int level) {
-  return level >= 1 && level <= 3 ? level + 2 : 1;
-}
-
-struct WaysCode {
-  unsigned int ways;
-  unsigned int code;
-};
-constexpr std::array waysCodes = {WaysCode{1, 1}, WaysCode{2, 3}, WaysCode{4, 4}, WaysCode{8, 5}, WaysCode{16, 6}};
-
-std::optional<unsigned int> associativityCode(const Cache& cache) {
-  constexpr unsigned int fully = 2;
-  if (cache.sets == 1U) {
-    return fully;
-  }
-  const auto* const row = std::ranges::find(waysCodes, cache.ways.value_or(0), &WaysCode::ways);
-  return row == waysCodes.end() ? std::nullopt : std::optional(row->code);
 }
 
 class Writer {
@@ -139,16 +107,19 @@ class Writer {
 
  private:
   void addSystem() {
-    const std::string_view model = firstRemark(machine_, {"DMIProductName", "PlatformModel"});
+    const std::string_view model = firmwareRemark(machine_, {"DMIProductName", "PlatformModel"});
     tree_.system().description(model.empty() ? "Computer system" : model);
     addText(PropSystemModel, model);
-    addText(PropSystemManufacturer, infoOf(machine_, "DMISysVendor"));
+    addText(PropSystemManufacturer, firmwareRemark(machine_, {"DMISysVendor"}));
   }
 
   void addProcessor(const HwlocPackage& entry, const std::string& path) {
     const Package& package = entry.package;
     const CpuIdentity identity = identify(entry.object);
-    tree_.processor(path).status(statusOf(package.cpus)).description(described("Processor", path)).cpus(package.cpus);
+    tree_.processor(path)
+        .status(statusOf(package.cpus))
+        .description(describeByPath("Processor", path))
+        .cpus(package.cpus);
     tree_.number(PropFamily, identity.family);
     tree_.number(PropHardwareThreads, package.cpus.count());
     tree_.list(PropRequestedStatesSupported, {1});
@@ -180,20 +151,19 @@ class Writer {
     const std::vector<std::string> paths = corePaths(processor, package.cores);
     for (std::size_t i = 0; i < paths.size(); ++i) {
       const Core& core = package.cores[i];
-      tree_.core(paths[i]).status(statusOf(core.cpus)).description(describeCore(core, paths[i])).cpus(core.cpus);
+      tree_.core(paths[i])
+          .status(statusOf(core.cpus))
+          .description(describeCore(kindOf(core), core.place, paths[i]))
+          .cpus(core.cpus);
     }
   }
 
-  std::string describeCore(const Core& core, const std::string& path) const {
+  std::string kindOf(const Core& core) const {
     const auto kind = std::ranges::find_if(parts_.kinds, [&](const HwlocCoreKind& candidate) {
       return !candidate.name.empty() && candidate.cpus.intersects(core.cpus);
     });
     const bool hasKinds = parts_.kinds.size() > 1 && kind != parts_.kinds.end();
-    std::string text = described(std::string(hasKinds ? kind->name : "Core"), path);
-    if (path.find('@') == std::string::npos) {
-      text += partOf("cluster", core.place.cluster) + partOf("die", core.place.die);
-    }
-    return text;
+    return std::string(hasKinds ? kind->name : "Core");
   }
 
   void addCaches(const HwlocPackage& package, const std::string& processor) {

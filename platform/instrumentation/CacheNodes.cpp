@@ -21,23 +21,8 @@ struct WaysCode {
 constexpr std::array waysCodes = {WaysCode{1, 1}, WaysCode{2, 3}, WaysCode{4, 4}, WaysCode{8, 5}, WaysCode{16, 6}};
 constexpr unsigned int fullyAssociative = 2;
 
-std::string describeCache(const Cache& cache, const std::string& path) {
-  const std::string_view contents = cache.contents == CacheContents::Data           ? " data"
-                                    : cache.contents == CacheContents::Instructions ? " instruction"
-                                                                                    : "";
-  return describeByPath("L" + std::to_string(cache.level) + std::string(contents) + " cache", path);
-}
-
 bool hasOneSet(const Cache& cache) {
   return cache.sets == 1U && cache.ways != 1U;
-}
-
-std::optional<unsigned int> associativityCode(const Cache& cache) {
-  if (hasOneSet(cache)) {
-    return fullyAssociative;
-  }
-  const auto* const row = std::ranges::find(waysCodes, cache.ways.value_or(0), &WaysCode::ways);
-  return row == waysCodes.end() ? std::nullopt : std::optional(row->code);
 }
 
 std::optional<unsigned int> blocksOf(const Cache& cache) {
@@ -97,6 +82,21 @@ class CacheNode {
 };
 
 }  // namespace
+
+std::string describeCache(const Cache& cache, const std::string& path) {
+  const std::string_view contents = cache.contents == CacheContents::Data           ? " data"
+                                    : cache.contents == CacheContents::Instructions ? " instruction"
+                                                                                    : "";
+  return describeByPath("L" + std::to_string(cache.level) + std::string(contents) + " cache", path);
+}
+
+std::optional<unsigned int> associativityCode(const Cache& cache) {
+  if (hasOneSet(cache)) {
+    return fullyAssociative;
+  }
+  const auto* const row = std::ranges::find(waysCodes, cache.ways.value_or(0), &WaysCode::ways);
+  return row == waysCodes.end() ? std::nullopt : std::optional(row->code);
+}
 
 unsigned int levelCode(unsigned int level) {
   return level >= 1 && level <= 3 ? level + 2 : 1;

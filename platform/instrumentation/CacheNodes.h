@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_CACHENODES_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_CACHENODES_H
 
+#include <optional>
 #include <string>
 
 #include "platform/instrumentation/KernelView.h"
@@ -10,6 +11,13 @@ namespace Tarn::Inventory {
 
 /// The inventory's code for a cache level that the kernel or the firmware counts from 1.
 unsigned int levelCode(unsigned int level);
+
+/// The inventory's code for the cache's ways, or for its only set; nothing for a number of ways without a
+/// code.
+std::optional<unsigned int> associativityCode(const Cache& cache);
+
+/// "L1 data cache 3": what the cache at this path is called.
+std::string describeCache(const Cache& cache, const std::string& path);
 
 /// Puts the package's caches below the processor that was added last, whose path is given.
 void addCaches(TreeBuilder& tree, const KernelView& kernel, const Package& package, const std::string& processor);

@@ -20,15 +20,6 @@ std::string partOf(const char* group, std::optional<unsigned int> number) {
   return number.value_or(0) == 0 ? std::string() : std::string(" of ") + group + ' ' + std::to_string(*number);
 }
 
-std::string describeCore(const KernelView& kernel, const Core& core, const std::string& path) {
-  const CoreKind* kind = kindOf(kernel, core);
-  std::string text = describeByPath(kind == nullptr ? "Core" : kind->name, path);
-  if (path.find('@') == std::string::npos) {
-    text += partOf("cluster", core.place.cluster) + partOf("die", core.place.die);
-  }
-  return text;
-}
-
 Origin descriptionOrigin(const KernelView& kernel, const Core& core, const std::string& path) {
   static constexpr std::array<std::string_view, 1> byNumber = {"topology/core_id"};
   static constexpr std::array<std::string_view, 3> byList = {"topology/thread_siblings_list", "topology/core_cpus_list",
@@ -43,13 +34,22 @@ Origin descriptionOrigin(const KernelView& kernel, const Core& core, const std::
 
 }  // namespace
 
+std::string describeCore(const std::string& kind, const CorePlace& place, const std::string& path) {
+  std::string text = describeByPath(kind, path);
+  if (path.find('@') == std::string::npos) {
+    text += partOf("cluster", place.cluster) + partOf("die", place.die);
+  }
+  return text;
+}
+
 void addCores(TreeBuilder& tree, const KernelView& kernel, const Package& package, const std::string& processor) {
   const std::vector<std::string> paths = corePaths(processor, package.cores);
   for (std::size_t i = 0; i < paths.size(); ++i) {
     const Core& core = package.cores[i];
+    const CoreKind* kind = kindOf(kernel, core);
     tree.core(paths[i]).cpus(core.cpus);
     tree.status(kernel.statusOf(core.cpus)).from([&] { return kernel.statusOrigin(core.cpus); });
-    tree.description(describeCore(kernel, core, paths[i])).from([&] {
+    tree.description(describeCore(kind == nullptr ? "Core" : kind->name, core.place, paths[i])).from([&] {
       return descriptionOrigin(kernel, core, paths[i]);
     });
   }

@@ -125,6 +125,15 @@ TEST(HwlocXml, TheMachineIsNamedByItsFirmware) {
   EXPECT_EQ(nodeAt(tree, "system").description, "PowerBox 300");
 }
 
+TEST(HwlocXml, WhatFirmwareVendorsLeaveInTheirFieldsIsNoName) {
+  const Tree tree =
+      treeOf(oneCore({{"DMIProductName", "To Be Filled By O.E.M."}, {"DMISysVendor", "Default string"}}, {}));
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "(none)");
+  EXPECT_EQ(textAt(tree, "system", Tarn::Inventory::PropSystemManufacturer), "(none)");
+  EXPECT_EQ(nodeAt(tree, "system").description, "Computer system");
+}
+
 TEST(HwlocXml, CachesHaveSizeLineAndWays) {
   HwlocXml xml("0x3");
   xml.begin("Package", "1", "0x3")
