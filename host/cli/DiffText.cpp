@@ -1,10 +1,8 @@
 #include "host/cli/DiffText.h"
 
-#include <algorithm>
-#include <map>
-#include <set>
 #include <utility>
 
+#include "host/cli/DiffCauses.h"
 #include "host/cli/FieldWordings.h"
 #include "host/cli/Quantities.h"
 #include "host/cli/Sentences.h"
@@ -16,22 +14,17 @@ namespace {
 
 using Tarn::Inventory::Node;
 using Tarn::Inventory::NodeIndex;
-using Tarn::Inventory::noNode;
 using Tarn::Inventory::Tree;
 using namespace Tarn::NodeLexicon;
-namespace Status = Tarn::Inventory::Status;
 
 class Teller {
  public:
   Teller(const Tree& before, const Tree& after, std::span<const NodeChange> changes)
-      : before_(before), after_(after), changes_(changes) {}
+      : before_(before), after_(after), changes_(changes), causes_(before, after, changes) {}
 
   std::string tell() {
     for (const NodeChange& change : changes_) {
-      countBelow(change);
-    }
-    for (const NodeChange& change : changes_) {
-      if (!isToldAbove(change)) {
+      if (!causes_.isExplained(change)) {
         tellOf(change);
       }
     }
@@ -39,87 +32,41 @@ class Teller {
   }
 
  private:
-  struct Parts {
-    std::size_t cores = 0;
-    std::size_t caches = 0;
-  };
-
   const Node& nodeOf(const NodeChange& change) const {
     return change.isAdded() ? after_.node(change.after) : before_.node(change.before);
   }
 
-  static bool hasStatus(const std::optional<FieldValue>& value, unsigned int status) {
-    return value && *value == FieldValue(status);
-  }
-  static bool wasEmptied(const NodeChange& change) {
-    const FieldChange* status = change.field("status");
-    return !change.isRemoved() && !change.isAdded() && status != nullptr &&
-           hasStatus(status->after, Status::emptySocket);
-  }
-  static bool wasFilled(const NodeChange& change) {
-    const FieldChange* status = change.field("status");
-    return !change.isRemoved() && !change.isAdded() && status != nullptr &&
-           hasStatus(status->before, Status::emptySocket) && hasStatus(status->after, Status::inUse);
-  }
-
-  /// The processor whose coming or going explains that of the part; nullptr where there is none.
-  const NodeChange* causeOf(const NodeChange& change) const {
-    const Node& node = nodeOf(change);
-    if (node.type != NodeProcessorCore && node.type != NodeCacheMemory) {
-      return nullptr;
-    }
-    const Tree& tree = change.isAdded() ? after_ : before_;
-    const std::string_view path = tree.node(node.parent).path();
-    const auto above = std::ranges::find(changes_, path, [](const NodeChange& c) { return std::string_view(c.path); });
-    if (above == changes_.end()) {
-      return nullptr;
-    }
-    const bool came = change.isAdded() && (above->isAdded() || wasFilled(*above));
-    const bool went = change.isRemoved() && (above->isRemoved() || wasEmptied(*above));
-    return came || went ? &*above : nullptr;
-  }
-
-  void countBelow(const NodeChange& change) {
-    if (!change.isAdded() && !change.isRemoved()) {
-      return;
-    }
-    if (const NodeChange* cause = causeOf(change)) {
-      toldAbove_.insert(&change);
-      Parts& parts = below_[cause];
-      ++(nodeOf(change).type == NodeProcessorCore ? parts.cores : parts.caches);
-    }
-  }
-
-  bool isToldAbove(const NodeChange& change) const { return toldAbove_.contains(&change); }
-
-  /// "2 cores and 7 caches"; empty for nothing.
-  std::string partsOf(const NodeChange& change) const {
-    const auto found = below_.find(&change);
-    if (found == below_.end()) {
-      return "";
-    }
-    const auto [cores, caches] = found->second;
-    return (cores == 0 ? "" : counted(cores, "core")) + (cores != 0 && caches != 0 ? " and " : "") +
-           (caches == 0 ? "" : counted(caches, "cache"));
-  }
-
   void tellOf(const NodeChange& change) {
-    const std::string parts = partsOf(change);
-    if (change.isRemoved()) {
-      say(change, {Verbal::Is, "gone" + (parts.empty() ? "" : ", and " + parts + " with it")});
-    } else if (change.isAdded()) {
-      say(change, {Verbal::Is, "new" + nameOf(after_, change.after) + (parts.empty() ? "" : ", with " + parts)});
-    } else if (wasEmptied(change)) {
-      say(change, {Verbal::None,
-                   ": the socket is empty now" + (parts.empty() ? "" : "; " + parts + " went with the processor")});
-      // That the processor's properties went with it says no more.
-      tellFields(change, [](const FieldChange& field) { return field.name != "status" && field.after; });
-    } else if (wasFilled(change)) {
-      say(change, {Verbal::None, ": the socket has a processor now" + nameOf(after_, change.after) +
-                                     (parts.empty() ? "" : ", with " + parts)});
-      tellFields(change, [](const FieldChange& field) { return field.name != "status" && field.before; });
-    } else {
-      tellFields(change, [](const FieldChange&) { return true; });
+    const std::string parts = causes_.partsOf(change);
+    const std::string withParts = parts.empty() ? "" : ", with " + parts;
+    const std::string each = parts.empty() ? "" : " each";
+    switch (causes_.eventOf(change)) {
+      case Event::Changed:
+        tellFields(change, [](const FieldChange&) { return true; });
+        return;
+      case Event::Removed:
+        say(change, {Verbal::Is, "gone" + withParts, each});
+        return;
+      case Event::Added:
+        say(change, {Verbal::Is, "new" + nameOf(after_, change.after) + withParts, each});
+        return;
+      case Event::WentOffline:
+        say(change, {Verbal::None, " went offline" + withParts, each});
+        return;
+      case Event::CameOnline:
+        say(change, {Verbal::None, " came online" + withParts, each});
+        return;
+      case Event::SocketEmptied:
+        say(change, {Verbal::None,
+                     ": the socket is empty now" + (parts.empty() ? "" : "; " + parts + " went with the processor")});
+        // That the processor's properties went with it says no more.
+        tellFields(change, [](const FieldChange& field) { return field.name != "status" && field.after; });
+        return;
+      case Event::SocketFilled:
+        say(change,
+            {Verbal::None, ": the socket has a processor now" + nameOf(after_, change.after) + withParts, each});
+        tellFields(change, [](const FieldChange& field) { return field.name != "status" && field.before; });
+        return;
     }
   }
 
@@ -172,8 +119,7 @@ class Teller {
   const Tree& before_;
   const Tree& after_;
   std::span<const NodeChange> changes_;
-  std::map<const NodeChange*, Parts> below_;
-  std::set<const NodeChange*> toldAbove_;
+  const DiffCauses causes_;
   Sentences sentences_;
 };
 

@@ -77,8 +77,9 @@ std::string Sentences::text() const {
   std::string text;
   for (const Sentence& sentence : sentences_) {
     text += listPaths(sentence.paths);
-    text += verbOf(sentence.predicate.verbal, sentence.paths.size() > 1);
-    text += sentence.predicate.rest + '\n';
+    const bool isPlural = sentence.paths.size() > 1;
+    text += verbOf(sentence.predicate.verbal, isPlural);
+    text += sentence.predicate.rest + (isPlural ? sentence.predicate.ifSeveral : "") + '\n';
   }
   return text;
 }

@@ -18,6 +18,7 @@ enum class Verbal { None, Is, Has };
 struct Predicate {
   Verbal verbal = Verbal::None;
   std::string rest;
+  std::string ifSeveral = {};  ///< the end of a sentence about several paths
   bool operator==(const Predicate&) const = default;
 };
 

@@ -12,6 +12,7 @@
 namespace Corvcim::Testing {
 namespace {
 
+using Tarn::Inventory::CpuSet;
 using Tarn::Inventory::Tree;
 using Tarn::Inventory::TreeBuilder;
 using namespace Tarn::NodeLexicon;
@@ -109,7 +110,7 @@ TEST(Diff, AProcessorIsGoneOrNew) {
                        .cache("P1.L1i.0")
                        .build();
 
-  EXPECT_EQ(told(two, one), "P1 is gone, and 1 core and 2 caches with it\n");
+  EXPECT_EQ(told(two, one), "P1 is gone, with 1 core and 2 caches\n");
   EXPECT_EQ(told(one, two), "P1 is new: Some CPU, with 1 core and 2 caches\n");
 }
 
@@ -130,6 +131,63 @@ Tree cacheOf(unsigned int blocks, unsigned int blockSize, unsigned int usable) {
       .number(PropCacheNumberOfBlocks, blocks)
       .number(PropCacheConsumableBlocks, usable)
       .build();
+}
+
+/// Four CPUs in one processor; the kernel shows those cores, with their caches, that have one online.
+Tree machineShowing(const std::vector<unsigned int>& cores, const CpuSet& cpus) {
+  TreeBuilder tree;
+  tree.processor("P0").cpus(cpus);
+  for (const unsigned int core : cores) {
+    tree.core("P0.C" + std::to_string(core)).cpus({2 * core, 2 * core + 1});
+  }
+  for (const unsigned int core : cores) {
+    tree.cache("P0.L1d." + std::to_string(core)).cpus({2 * core, 2 * core + 1});
+    tree.cache("P0.L2." + std::to_string(core)).cpus({2 * core, 2 * core + 1});
+  }
+  return tree.build();
+}
+
+TEST(Diff, ACoreThatTheKernelHidesWentOffline) {
+  const Tree all = machineShowing({0, 1, 2}, {0, 1, 2, 3, 4, 5});
+  const Tree one = machineShowing({0}, {0, 1, 2, 3, 4, 5});
+
+  EXPECT_EQ(told(all, one), "P0.C1 and P0.C2 went offline, with 2 caches each\n");
+  EXPECT_EQ(told(one, all), "P0.C1 and P0.C2 came online, with 2 caches each\n");
+}
+
+TEST(Diff, ACoreWhoseCpusAreGoneDidNotGoOffline) {
+  EXPECT_EQ(told(machineShowing({0, 1}, {0, 1, 2, 3}), machineShowing({0}, {0, 1})),
+            "P0: the CPU list is \"0-1\" now, was \"0-3\"\n"
+            "P0.C1 is gone\n"
+            "P0.L1d.1 and P0.L2.1 are gone\n");
+}
+
+TEST(Diff, CoresOfAMachineThatShowsNoneDidNotGoOffline) {
+  EXPECT_EQ(told(machineShowing({0, 1}, {0, 1, 2, 3}), machineShowing({}, {0, 1, 2, 3})),
+            "P0.C0 and P0.C1 are gone\n"
+            "P0.L1d.0, P0.L2.0, P0.L1d.1 and P0.L2.1 are gone\n");
+}
+
+TEST(Diff, ACoreUnderAnotherNumberDidNotGoOffline) {
+  const Tree before =
+      TreeBuilder().processor("P0").cpus({0, 1}).core("P0.C0").cpus({0}).core("P0.C1").cpus({1}).build();
+  const Tree after =
+      TreeBuilder().processor("P0").cpus({0, 1}).core("P0.C0").cpus({0}).core("P0.C@1").cpus({1}).build();
+
+  EXPECT_EQ(told(before, after), "P0.C1 is gone\nP0.C@1 is new\n");
+}
+
+TEST(Diff, ACacheThatOtherCoresHaveTooIsTold) {
+  const auto machine = [](bool isWhole) {
+    TreeBuilder tree;
+    tree.processor("P0").cpus({0, 1}).core("P0.C0").cpus({0});
+    if (isWhole) {
+      tree.core("P0.C1").cpus({1}).cache("P0.L2.0").cpus({0, 1});
+    }
+    return tree.build();
+  };
+
+  EXPECT_EQ(told(machine(true), machine(false)), "P0.C1 went offline\nP0.L2.0 is gone\n");
 }
 
 TEST(Diff, ACacheIsSmallerOrLarger) {

@@ -33,12 +33,15 @@ TEST(Sentences, PathsOfWhichTheSameIsSaidShareOne) {
   sentences.add("cache", "P0.L3.0", {Verbal::Is, "smaller"});
   sentences.add("core", "P0.C5", {Verbal::None, " went offline"});
   sentences.add("cache", "P1.L3.1", {Verbal::Is, "smaller"});
-  sentences.add("processor", "P1", {Verbal::Has, "3 cores now"});
+  sentences.add("processor", "P1", {Verbal::Has, "3 cores now", " each"});
+  sentences.add("processor", "P2", {Verbal::Is, "new, with 2 cores", " each"});
+  sentences.add("processor", "P3", {Verbal::Is, "new, with 2 cores", " each"});
 
   EXPECT_EQ(sentences.text(),
             "P0.C0 and P0.C5 went offline\n"
             "P0.L3.0 and P1.L3.1 are smaller\n"
-            "P1 has 3 cores now\n");
+            "P1 has 3 cores now\n"
+            "P2 and P3 are new, with 2 cores each\n");
 }
 
 TEST(Sentences, KindsAreKeptApart) {
