@@ -119,6 +119,12 @@ class FileLock {
   bool isHeld_;
 };
 
+/// Whether the path stands for something that is open or has a name elsewhere, such as /dev/stderr: what it leads to is
+/// not the logger's to rename.
+bool isAnotherName(std::string_view path) {
+  return path.starts_with("/dev/") || path.starts_with("/proc/");
+}
+
 /// Whether a write can end the process (see HeldBackSignal).
 bool hasSizeLimit() {
   rlimit limit{};
@@ -139,7 +145,7 @@ FileSink::FileSink(const std::string& path, Rotation rotation, Clock::duration r
       rotation_(rotation),
       retryAfter_(retryAfter),
       file_(openLog(path)),
-      isFollowed_(isRegular(statusOf(file_.number()))),
+      isFollowed_(isRegular(statusOf(file_.number())) && !isAnotherName(path_)),
       mayBeTooLarge_(hasSizeLimit()) {
   if (const std::optional<struct stat> status = statusOf(file_.number())) {
     identity_.set(*status);

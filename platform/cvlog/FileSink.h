@@ -60,7 +60,7 @@ class FileSink final : public Sink {
   const Clock::duration retryAfter_;
   // Other files take the place of the first one under its number, so that writers need no lock.
   const Tarn::Common::FileDescriptor file_;
-  const bool isFollowed_;     // a regular file
+  const bool isFollowed_;     // a regular file under a name of its own
   const bool mayBeTooLarge_;  // for the limit that was set when it was opened
   Identity identity_;
   std::atomic_flag isBeingReplaced_;

@@ -104,6 +104,14 @@ TEST_F(LogRotation, RotatesTheFileThatALinkLeadsTo) {
   EXPECT_EQ(content("disk/real"), line("c"));
 }
 
+TEST_F(LogRotation, LeavesAFileAloneThatIsOnlyKnownAsADescriptor) {
+  const Tarn::Common::FileDescriptor output(open(path("output").c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
+  FileSink sink("/dev/fd/" + std::to_string(output.number()), {.size = twoLines(), .keep = 1});
+  writeAll(sink, "abc");
+  EXPECT_THAT(names(), ElementsAre("output"));
+  EXPECT_EQ(content("output"), line("a") + line("b") + line("c"));
+}
+
 TEST_F(LogRotation, IsNoticedByWhoSharesTheFile) {
   FileSink rotating(path("log"), {.size = twoLines(), .keep = 1});
   FileSink other(path("log"), {.size = 0, .keep = 1});
