@@ -14,11 +14,11 @@ inline constexpr const char* className = "HALDA_ComputerSystem";
 CMPIObjectPath* makePath(const CMPIBroker* broker, const CMPIObjectPath* request, const ComputerSystem& system,
                          CMPIStatus* status);
 
-/// The instance of the system with its keys and the properties that the NULL-terminated list names,
-/// without regard to case; NULL as the list selects all. What is not known stays unset, so that the
+/// The instance of the system with its keys and the properties that the NULL-terminated selection names,
+/// without regard to case; NULL selects all. What is not known stays unset, so that the
 /// client sees null. NULL when the broker refuses; `status` then says why.
 CMPIInstance* makeInstance(const CMPIBroker* broker, const CMPIObjectPath* request, const ComputerSystem& system,
-                           const char** properties, CMPIStatus* status);
+                           const char** selection, CMPIStatus* status);
 
 }  // namespace Tarn::ComputerSystemProvider
 
