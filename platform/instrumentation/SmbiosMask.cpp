@@ -120,8 +120,10 @@ class Masker {
     }
     bool any = false;
     for (std::size_t i = end + Structure::headerLength; i < table_.size(); ++i) {
-      any = any || table_[i] != '\0';
-      table_[i] = table_[i] == '\0' ? '\0' : masked;
+      if (table_[i] != '\0' && table_[i] != masked) {
+        table_[i] = masked;
+        any = true;
+      }
     }
     if (any) {
       notes_.emplace_back("what follows the last SMBIOS structure");
