@@ -6,6 +6,7 @@
 #include <optional>
 #include <string_view>
 
+#include "platform/instrumentation/FirmwareTables.h"
 #include "platform/instrumentation/NodePaths.h"
 
 namespace Tarn::Inventory {
@@ -19,7 +20,6 @@ struct WaysCode {
   unsigned int code;
 };
 constexpr std::array waysCodes = {WaysCode{1, 1}, WaysCode{2, 3}, WaysCode{4, 4}, WaysCode{8, 5}, WaysCode{16, 6}};
-constexpr unsigned int fullyAssociative = 2;
 
 bool hasOneSet(const Cache& cache) {
   return cache.sets == 1U && cache.ways != 1U;
@@ -35,8 +35,8 @@ std::optional<unsigned int> blocksOf(const Cache& cache) {
 /// One cache's node, each value with the attribute that it comes from.
 class CacheNode {
  public:
-  CacheNode(TreeBuilder& tree, const KernelView& kernel, const Cache& cache)
-      : tree_(tree), kernel_(kernel), cache_(cache) {}
+  CacheNode(TreeBuilder& tree, const KernelView& kernel, const Cache& cache, const FirmwareCache* twin)
+      : tree_(tree), kernel_(kernel), cache_(cache), twin_(twin) {}
 
   void add(const std::string& path) {
     tree_.cache(path).cpus(cache_.cpus);
@@ -62,9 +62,32 @@ class CacheNode {
     const char* blocksRule = "the size by coherency_line_size";
     number(PropCacheNumberOfBlocks, blocksOf(cache_), "size", blocksRule);
     number(PropCacheConsumableBlocks, blocksOf(cache_), "size", blocksRule);
+    addFromTwin();
   }
 
  private:
+  // What only the firmware tells.
+  void addFromTwin() {
+    if (twin_ == nullptr) {
+      return;
+    }
+    const Smbios::Cache& structure = *twin_->structure;
+    if (!cache_.writePolicy) {
+      twinNumber(PropCacheWritePolicy, writePolicyCode(structure), structure.mode, writePolicyRule);
+    }
+    if (!cache_.ways && !cache_.sets) {
+      twinNumber(PropCacheAssociativity, associativityCode(structure), structure.associativity, associativityRule);
+    }
+  }
+
+  template <class Value>
+  void twinNumber(Properties id, std::optional<unsigned int> value, const Smbios::Field<Value>& field,
+                  const char* rule) {
+    if (value) {
+      tree_.number(id, *value).from([&] { return originInTables(twin_->structure->structure, field, rule); });
+    }
+  }
+
   void number(Properties id, std::optional<unsigned int> value, std::string_view file, const char* rule) {
     if (value) {
       tree_.number(id, *value).from([&] { return attribute(file, rule); });
@@ -79,6 +102,7 @@ class CacheNode {
   TreeBuilder& tree_;
   const KernelView& kernel_;
   const Cache& cache_;
+  const FirmwareCache* twin_;
 };
 
 }  // namespace
@@ -91,22 +115,24 @@ std::string describeCache(const Cache& cache, const std::string& path) {
 }
 
 std::optional<unsigned int> associativityCode(const Cache& cache) {
-  if (hasOneSet(cache)) {
-    return fullyAssociative;
-  }
-  const auto* const row = std::ranges::find(waysCodes, cache.ways.value_or(0), &WaysCode::ways);
-  return row == waysCodes.end() ? std::nullopt : std::optional(row->code);
+  return hasOneSet(cache) ? std::optional(fullyAssociative) : associativityCode(cache.ways.value_or(0));
 }
 
 unsigned int levelCode(unsigned int level) {
   return level >= 1 && level <= 3 ? level + 2 : 1;
 }
 
-void addCaches(TreeBuilder& tree, const KernelView& kernel, const Package& package, const std::string& processor) {
+std::optional<unsigned int> associativityCode(unsigned int ways) {
+  const auto* const row = std::ranges::find(waysCodes, ways, &WaysCode::ways);
+  return row == waysCodes.end() ? std::nullopt : std::optional(row->code);
+}
+
+void addCaches(TreeBuilder& tree, const KernelView& kernel, const Package& package, const std::string& processor,
+               const std::vector<FirmwareCache>& firmware) {
   const std::vector<const Cache*> own = kernel.cachesOf(package);
   const std::vector<std::string> paths = cachePaths(processor, own);
   for (std::size_t i = 0; i < own.size(); ++i) {
-    CacheNode(tree, kernel, *own[i]).add(paths[i]);
+    CacheNode(tree, kernel, *own[i], findTwin(firmware, *own[i])).add(paths[i]);
   }
 }
 

@@ -25,9 +25,7 @@ class Reader {
     readIdentity();
     addIdentity();
     addCounts();
-    result_.facts.list(PropRequestedStatesSupported, {1}, [] {
-      return Origin{"(fixed)", "", "every processor can be enabled"};
-    });
+    addRequestedStates(result_.facts);
     return std::move(result_);
   }
 
@@ -182,6 +180,12 @@ class Reader {
 
 KernelProcessor readKernelProcessor(const KernelView& kernel, const Package& package) {
   return Reader(kernel, package).read();
+}
+
+void addRequestedStates(Facts& facts) {
+  facts.list(PropRequestedStatesSupported, {1}, [] {
+    return Origin{"(fixed)", "", "every processor that works can be enabled"};
+  });
 }
 
 Origin originOfPackage(const KernelView& kernel, const Package& package, std::string rule) {

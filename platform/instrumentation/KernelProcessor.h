@@ -18,6 +18,9 @@ struct KernelProcessor {
 
 KernelProcessor readKernelProcessor(const KernelView& kernel, const Package& package);
 
+/// The states that can be requested of a processor that works.
+void addRequestedStates(Facts& facts);
+
 /// What tells that these CPUs are one processor.
 Origin originOfPackage(const KernelView& kernel, const Package& package, std::string rule);
 

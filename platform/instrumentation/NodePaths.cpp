@@ -71,14 +71,18 @@ std::vector<std::string> cachePaths(const std::string& processor, const std::vec
   return choose(std::move(choices));
 }
 
-std::string cacheName(const Cache& cache) {
-  std::string name = "L" + std::to_string(cache.level);
-  if (!cache.contents) {
+std::string cacheName(unsigned int level, std::optional<CacheContents> contents) {
+  std::string name = "L" + std::to_string(level);
+  if (!contents) {
     name += 'x';
-  } else if (cache.contents != CacheContents::Unified) {
-    name += cache.contents == CacheContents::Data ? 'd' : 'i';
+  } else if (contents != CacheContents::Unified) {
+    name += contents == CacheContents::Data ? 'd' : 'i';
   }
   return name;
+}
+
+std::string cacheName(const Cache& cache) {
+  return cacheName(cache.level, cache.contents);
 }
 
 }  // namespace Tarn::Inventory

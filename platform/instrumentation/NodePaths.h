@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_NODEPATHS_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_NODEPATHS_H
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -28,6 +29,7 @@ std::vector<std::string> corePaths(const std::string& processor, const std::vect
 std::vector<std::string> cachePaths(const std::string& processor, const std::vector<const Cache*>& caches);
 
 /// "L1d", "L1i", "L2", ...; "L2x" where the kernel does not tell what the cache holds.
+std::string cacheName(unsigned int level, std::optional<CacheContents> contents);
 std::string cacheName(const Cache& cache);
 
 }  // namespace Tarn::Inventory

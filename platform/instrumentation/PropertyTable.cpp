@@ -35,6 +35,10 @@ constexpr std::array properties = {
     PropertyEntry{PropUpgradeMethod, NodeProcessor, Number, "UpgradeMethod"},
     PropertyEntry{PropProcessorName, NodeProcessor, Text, "ProcessorName"},
     PropertyEntry{PropSystemManufacturer, NodeSystem, Text, "SystemManufacturer"},
+    PropertyEntry{PropSocket, NodeProcessor, Text, "Socket"},
+    PropertyEntry{PropSerialNumber, NodeProcessor, Text, "SerialNumber"},
+    PropertyEntry{PropAssetTag, NodeProcessor, Text, "AssetTag"},
+    PropertyEntry{PropPartNumber, NodeProcessor, Text, "PartNumber"},
 };
 static_assert(std::ranges::is_sorted(properties, {}, &PropertyEntry::id));
 

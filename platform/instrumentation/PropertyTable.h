@@ -14,6 +14,13 @@ enum class PropertyKind { Number, Text, List };
 /// inventory shares with them does not list it; the provider of the computer system does.
 inline constexpr auto PropSystemManufacturer = static_cast<NodeLexicon::Properties>(400);
 
+/// What only the firmware knows of a processor's socket and of what is in it, texts. The processor classes
+/// have no use for them either.
+inline constexpr auto PropSocket = static_cast<NodeLexicon::Properties>(401);  ///< the label on the board
+inline constexpr auto PropSerialNumber = static_cast<NodeLexicon::Properties>(402);
+inline constexpr auto PropAssetTag = static_cast<NodeLexicon::Properties>(403);
+inline constexpr auto PropPartNumber = static_cast<NodeLexicon::Properties>(404);
+
 /// What is known about a property: its name in JSON, its kind, and the one type of node that has it.
 struct PropertyEntry {
   NodeLexicon::Properties id;

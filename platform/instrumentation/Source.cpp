@@ -3,13 +3,17 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <memory>
+#include <optional>
 #include <string>
 
 #include "platform/instrumentation/Archive.h"
+#include "platform/instrumentation/DumpFile.h"
 #include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/FileSystem.h"
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/LiveSource.h"
+#include "platform/instrumentation/OverlayFileSystem.h"
 #include "platform/instrumentation/Snapshot.h"
 
 namespace Tarn::Inventory {
@@ -20,6 +24,15 @@ std::string readWhole(const std::string& file, FileError& error) {
   std::string contents;
   // A path from the configuration may be relative to the working directory, or absolute.
   error = openDirectory(".")->read(file.c_str(), contents);
+  return contents;
+}
+
+std::string readWhole(const std::string& file, const char* remedy) {
+  FileError error = 0;
+  std::string contents = readWhole(file, error);
+  if (error != 0) {
+    throw InventoryError("can not read the inventory", file, describeError(error), remedy);
+  }
   return contents;
 }
 
@@ -41,26 +54,18 @@ std::unique_ptr<FileSystem> openRoot(const std::string& location) {
 }
 
 std::unique_ptr<FileSystem> openSnapshot(const std::string& location) {
-  FileError error = 0;
-  const std::string text = readWhole(location, error);
-  if (error != 0) {
-    throw InventoryError("can not read the inventory", location, describeError(error),
-                         "name a file that corvcim snapshot wrote");
-  }
-  return std::make_unique<MemoryFileSystem>(readSnapshot(text, location));
+  return std::make_unique<MemoryFileSystem>(
+      readSnapshot(readWhole(location, "name a file that corvcim snapshot wrote"), location));
 }
+
+std::unique_ptr<FileSystem> openSmbios(const std::string& location);
+Tree loadSmbios(const std::string& location, Detail detail);
 
 Tree loadJson(const std::string& location, Detail detail) {
-  FileError error = 0;
-  const std::string text = readWhole(location, error);
-  if (error != 0) {
-    throw InventoryError("can not read the inventory", location, describeError(error),
-                         "name a file that holds an inventory as JSON");
-  }
-  return readJson(text, location, detail);
+  return readJson(readWhole(location, "name a file that holds an inventory as JSON"), location, detail);
 }
 
-/// A kind of source: either files that the live source's readers read, or a tree as it is.
+/// A kind of source: files, and how the tree comes of them, if it is not by the live source's readers.
 struct Scheme {
   std::string_view name;
   bool hasLocation;
@@ -68,9 +73,8 @@ struct Scheme {
   Tree (*load)(const std::string& location, Detail detail);
 };
 constexpr std::array schemes = {
-    Scheme{"json", true, nullptr, loadJson},
-    Scheme{"live", false, openLive, nullptr},
-    Scheme{"root", true, openRoot, nullptr},
+    Scheme{"json", true, nullptr, loadJson},         Scheme{"live", false, openLive, nullptr},
+    Scheme{"root", true, openRoot, nullptr},         Scheme{"smbios", true, openSmbios, loadSmbios},
     Scheme{"snapshot", true, openSnapshot, nullptr},
 };
 
@@ -79,26 +83,68 @@ struct Choice {
   std::string location;
 };
 
-Choice choose(std::string_view specification) {
+std::optional<Choice> find(std::string_view specification) {
   const std::size_t colon = specification.find(':');
   const std::string_view name = specification.substr(0, colon);
   const std::string location(colon == std::string_view::npos ? std::string_view() : specification.substr(colon + 1));
   const auto* const scheme = std::ranges::find(schemes, name, &Scheme::name);
   if (scheme == schemes.end() || scheme->hasLocation != (colon != std::string_view::npos) ||
       (scheme->hasLocation && location.empty())) {
+    return std::nullopt;
+  }
+  return Choice{*scheme, location};
+}
+
+Choice choose(std::string_view specification) {
+  const std::optional<Choice> choice = find(specification);
+  if (!choice) {
     throw InventoryError("can not read the inventory", '"' + std::string(specification) + '"',
                          "it names no source of an inventory",
                          "set CORVANE_INVENTORY, or inventory in the configuration, to live, root:DIRECTORY, "
-                         "snapshot:FILE or json:FILE");
+                         "snapshot:FILE, json:FILE or smbios:FILE");
   }
-  return {*scheme, location};
+  return *choice;
+}
+
+/// A dump of the firmware's tables, and the source that it stands in front of.
+struct Dump {
+  std::string file;
+  std::optional<Choice> behind;
+};
+
+// FILE+SOURCE. The file's name may have a plus sign as well, so only one with a source of files behind it
+// counts.
+Dump splitDump(const std::string& location) {
+  for (std::size_t plus = location.find('+'); plus != std::string::npos; plus = location.find('+', plus + 1)) {
+    const std::optional<Choice> behind = find(std::string_view(location).substr(plus + 1));
+    if (behind && behind->scheme.load == nullptr) {
+      return {location.substr(0, plus), behind};
+    }
+  }
+  return {location, std::nullopt};
+}
+
+std::unique_ptr<FileSystem> openDump(const Dump& dump) {
+  const std::string contents = readWhole(dump.file, "name a file that dmidecode --dump-bin wrote");
+  return std::make_unique<OverlayFileSystem>(filesOfDump(contents, dump.file), dump.file,
+                                             dump.behind ? dump.behind->scheme.open(dump.behind->location) : nullptr);
+}
+
+std::unique_ptr<FileSystem> openSmbios(const std::string& location) {
+  return openDump(splitDump(location));
+}
+
+Tree loadSmbios(const std::string& location, Detail detail) {
+  const Dump dump = splitDump(location);
+  const std::unique_ptr<FileSystem> root = openDump(dump);
+  return dump.behind ? readLiveInventory(*root, detail) : readFirmwareInventory(*root, detail);
 }
 
 }  // namespace
 
 Tree loadInventory(std::string_view specification, Detail detail) {
   const auto [scheme, location] = choose(specification);
-  return scheme.open == nullptr ? scheme.load(location, detail) : readLiveInventory(*scheme.open(location), detail);
+  return scheme.load != nullptr ? scheme.load(location, detail) : readLiveInventory(*scheme.open(location), detail);
 }
 
 std::unique_ptr<FileSystem> openSource(std::string_view specification) {

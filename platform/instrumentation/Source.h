@@ -16,6 +16,9 @@ namespace Tarn::Inventory {
 ///     root:FILE     the same in one file (Archive.h)
 ///     snapshot:FILE what another machine's live source read (Snapshot.h)
 ///     json:FILE     a tree written as JSON (JsonTree.h)
+///     smbios:FILE   the firmware's tables alone, as `dmidecode --dump-bin` writes them to a file
+///     smbios:FILE+live, smbios:FILE+root:DIR, smbios:FILE+root:FILE
+///                   the same in the place of those tables that the machine shows
 ///
 /// With Detail::WithOrigins the tree also tells of each value where it comes from.
 /// Throws InventoryError where the text names no source, or its source can not be read.

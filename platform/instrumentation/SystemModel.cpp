@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <string_view>
 #include <utility>
 
@@ -19,15 +20,21 @@ constexpr std::string_view virtualMachine = "Virtual Machine";
 // What firmware vendors leave in a field that they did not fill in. Sorted.
 constexpr std::array placeholders = {
     std::string_view("Default string"),
+    std::string_view("Fill By OEM"),
+    std::string_view("N/A"),
+    std::string_view("NONE"),
     std::string_view("None"),
     std::string_view("Not Applicable"),
+    std::string_view("Not Provided"),
     std::string_view("Not Specified"),
     std::string_view("O.E.M."),
     std::string_view("System Product Name"),
     std::string_view("System manufacturer"),
     std::string_view("To Be Filled By O.E.M."),
     std::string_view("To be filled by O.E.M."),
+    std::string_view("UNKNOWN"),
     std::string_view("Undefined"),
+    std::string_view("Unknown"),
 };
 static_assert(std::ranges::is_sorted(placeholders));
 
@@ -76,7 +83,7 @@ Found hypervisorModel(Machine& machine) {
           }};
 }
 
-Found systemModel(Machine& machine) {
+Found systemModel(Machine& machine, const Facts* firmware) {
   Found product = firmwareText(machine, "sys/class/dmi/id/product_name");
   if (!product.text.empty()) {
     return product;
@@ -84,10 +91,11 @@ Found systemModel(Machine& machine) {
   const std::string file = machine.root().fileName();
   const FileError error = machine.root().error();
   Found model = deviceTreeModel(machine);
-  if (!model.text.empty()) {
+  if (!model.text.empty() || (firmware != nullptr && firmware->find(PropSystemModel) != nullptr)) {
     return model;
   }
-  if (error != 0) {
+  // Beside tables that are there, the kernel's file is not missed.
+  if (error != 0 && !(error == ENOENT && firmware != nullptr)) {
     machine.noteUnread(file, error, "it is there on machines whose firmware has DMI tables");
   }
   return hypervisorModel(machine);
@@ -99,9 +107,9 @@ bool isPlaceholder(std::string_view text) {
   return std::ranges::binary_search(placeholders, text);
 }
 
-Facts readSystemFacts(Machine& machine) {
+Facts readSystemFacts(Machine& machine, const Facts* firmware) {
   Facts facts;
-  Found model = systemModel(machine);
+  Found model = systemModel(machine, firmware);
   facts.text(PropSystemModel, std::move(model.text), std::move(model.explain));
   Found maker = firmwareText(machine, "sys/class/dmi/id/sys_vendor");
   facts.text(PropSystemManufacturer, std::move(maker.text), std::move(maker.explain));

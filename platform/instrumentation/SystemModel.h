@@ -9,9 +9,10 @@
 namespace Tarn::Inventory {
 
 /// What the kernel says of the computer: its model (the firmware's product name, else the device tree's
-/// model, else "Virtual Machine" where the kernel says that it runs under a hypervisor) and its maker. The
-/// origins look into the machine, which must outlive them.
-Facts readSystemFacts(Machine& machine);
+/// model) and its maker. Where there is no model, and `firmware`, which the tables told, has none either:
+/// "Virtual Machine", if the kernel says that it runs under a hypervisor. `firmware` is nullptr where
+/// there are no tables. The origins look into the machine, which must outlive them.
+Facts readSystemFacts(Machine& machine, const Facts* firmware);
 
 /// Whether a text is what firmware vendors leave in a field that they did not fill in.
 bool isPlaceholder(std::string_view text);

@@ -77,7 +77,7 @@ enum class Detail { Values, WithOrigins };
 struct Origin {
   std::string source;  ///< file and place in it: "/proc/cpuinfo, processor 0",
                        ///< "SMBIOS type 4, handle 0x0043, offset 0x12"
-  std::string raw;     ///< the datum as it stands there: "model name: Some CPU", "0x64 0x00"; empty where
+  std::string raw;     ///< the datum as it stands there: "model name: Some CPU", "64 00"; empty where
                        ///< the value says that something is not there
   std::string rule;    ///< how the datum became the value: the table row or the computation
   bool operator==(const Origin&) const = default;

@@ -2,6 +2,7 @@
 
 #include <stdexcept>
 
+#include "platform/instrumentation/FirmwareTables.h"
 #include "platform/instrumentation/LiveSource.h"
 #include "platform/instrumentation/Paths.h"
 
@@ -20,6 +21,12 @@ std::string textOf(std::optional<int> number) {
 }
 
 }  // namespace
+
+KernelFiles::KernelFiles() {
+  Support::SmbiosEncoder nothing;
+  nothing.end();
+  firmware(nothing);
+}
 
 KernelFiles& KernelFiles::cpus(const std::string& list) {
   return file(cpuDirectory + "present", list + '\n').online(list);
@@ -63,6 +70,10 @@ KernelFiles& KernelFiles::x86Block(unsigned int cpu, const std::string& name) {
               "\nvendor_id\t: GenuineIntel\ncpu family\t: 6\nmodel\t\t: 85\nmodel name\t: " + name +
               "\nstepping\t: 7\ncpu MHz\t\t: 2100.000\nflags\t\t: fpu sse2 lm\n\n";
   return file("proc/cpuinfo", cpuInfo_);
+}
+
+KernelFiles& KernelFiles::firmware(const Support::SmbiosEncoder& tables) {
+  return file(entryPointFile, tables.entryPoint()).file(tableFile, tables.table());
 }
 
 KernelFiles& KernelFiles::file(const std::string& path, const std::string& contents) {

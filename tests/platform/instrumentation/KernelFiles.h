@@ -7,13 +7,16 @@
 
 #include "platform/instrumentation/MemoryFileSystem.h"
 #include "platform/instrumentation/Tree.h"
+#include "tests/support/SmbiosEncoder.h"
 
 namespace Tarn::Inventory {
 
 /// The files with which a kernel describes a machine, made up call by call. What a call does not name is
-/// not there.
+/// not there, but for SMBIOS tables in which nothing stands, so that nothing is said of them.
 class KernelFiles {
  public:
+  KernelFiles();
+
   struct Cpu {
     std::optional<int> package = 0;
     std::optional<int> core = {};
@@ -44,6 +47,9 @@ class KernelFiles {
 
   /// A block of /proc/cpuinfo as x86 writes it.
   KernelFiles& x86Block(unsigned int cpu, const std::string& name = "Intel(R) Xeon(R) CPU");
+
+  /// The firmware's tables.
+  KernelFiles& firmware(const Support::SmbiosEncoder& tables);
 
   /// Any file: "sys/devices/system/cpu/online".
   KernelFiles& file(const std::string& path, const std::string& contents);

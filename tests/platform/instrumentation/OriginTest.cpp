@@ -46,7 +46,7 @@ P0 Family: /proc/cpuinfo, processor 0: vendor_id: GenuineIntel; model name: Inte
 P0 ProcessorId: /proc/cpuinfo, processor 0: cpu family: 6; model: 85; stepping: 7: the CPUID signature that they make up, its bytes from the lowest on
 P0 Stepping: /proc/cpuinfo, processor 0: stepping: 7: as it stands
 P0 ProcessorName: /proc/cpuinfo, processor 0: model name: Intel(R) Xeon(R) CPU: as it stands
-P0 RequestedStatesSupported: (fixed): : every processor can be enabled
+P0 RequestedStatesSupported: (fixed): : every processor that works can be enabled
 P0.C4 status: /sys/devices/system/cpu/online: 0-1: CPUs 0-1 make up the part: one at least is online, so it is in use
 P0.C4 description: /sys/devices/system/cpu/cpu0/topology/core_id: 4: the kernel's number of the core
 P0.L2.9 status: /sys/devices/system/cpu/online: 0-1: CPUs 0-1 make up the part: one at least is online, so it is in use

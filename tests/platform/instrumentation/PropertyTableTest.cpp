@@ -8,7 +8,7 @@ namespace {
 using namespace NodeLexicon;
 using enum PropertyKind;
 
-TEST(PropertyTable, HoldsEveryPropertyOfTheLexiconAndTheSystemsMaker) {
+TEST(PropertyTable, HoldsEveryPropertyOfTheLexiconAndWhatOnlyTheInventoryKnows) {
   struct Row {
     unsigned int id;
     NodeType type;
@@ -40,6 +40,10 @@ TEST(PropertyTable, HoldsEveryPropertyOfTheLexiconAndTheSystemsMaker) {
       {304, NodeProcessor, Number, "UpgradeMethod"},
       {307, NodeProcessor, Text, "ProcessorName"},
       {400, NodeSystem, Text, "SystemManufacturer"},
+      {401, NodeProcessor, Text, "Socket"},
+      {402, NodeProcessor, Text, "SerialNumber"},
+      {403, NodeProcessor, Text, "AssetTag"},
+      {404, NodeProcessor, Text, "PartNumber"},
   };
 
   ASSERT_EQ(propertyTable().size(), std::size(expected));

@@ -1,8 +1,14 @@
 #include "platform/instrumentation/Source.h"
 
+#include <gmock/gmock.h>
+#include <grp.h>
 #include <gtest/gtest.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <algorithm>
+#include <filesystem>
+#include <fstream>
 
 #include "platform/instrumentation/Archive.h"
 #include "platform/instrumentation/Error.h"
@@ -10,10 +16,12 @@
 #include "platform/instrumentation/LiveSource.h"
 #include "platform/instrumentation/RecordingFileSystem.h"
 #include "tests/platform/instrumentation/Scratch.h"
+#include "tests/support/SmbiosEncoder.h"
 
 namespace Tarn::Inventory {
 namespace {
 
+const std::string dump = CORVANE_SOURCE_DIR "/tests/fixtures/smbios/socket-per-virtual-cpu/dump.bin";
 const std::string fixture = CORVANE_SOURCE_DIR "/tests/fixtures/virtual-machine/";
 
 std::string refusalOf(const std::string& specification) {
@@ -36,15 +44,18 @@ TEST(Source, ReadsACapturedRootInOneFile) {
 TEST(Source, ReadsACapturedRootDirectory) {
   const ScratchDirectory directory;
   for (const auto& [path, entry] : readArchive(contentsOf(fixture + "root.txt"), "root.txt")) {
-    directory.write(path, entry.contents);
+    if (entry.error == 0) {
+      directory.write(path, entry.contents);
+    }
   }
 
   const Tree tree = loadInventory("root:" + directory.name());
 
   const Tree expected = loadInventory("json:" + fixture + "tree.json");
   EXPECT_TRUE(std::ranges::equal(tree.nodes(), expected.nodes()));
-  ASSERT_EQ(tree.unread().size(), 1U);
-  EXPECT_EQ(tree.unread()[0].file, directory.name() + "/sys/devices/system/cpu/cpu{0,2}/cpufreq/cpuinfo_max_freq");
+  ASSERT_EQ(tree.unread().size(), 2U);
+  EXPECT_EQ(tree.unread()[0].file, directory.name() + "/sys/firmware/dmi/tables/smbios_entry_point");
+  EXPECT_EQ(tree.unread()[1].file, directory.name() + "/sys/devices/system/cpu/cpu{0,2}/cpufreq/cpuinfo_max_freq");
 }
 
 TEST(Source, ReadsTheLiveMachine) {
@@ -65,11 +76,87 @@ TEST(Source, ACaptureOfTheLiveMachineGivesTheSameTree) {
 
 TEST(Source, RefusesWhatNamesNoSource) {
   for (const char* text : {"", "foo", "foo:x", "json", "json:", "root", "root:", "live:", "live:x", "Live", " live",
-                           "snapshot", "snapshot:"}) {
+                           "snapshot", "snapshot:", "smbios", "smbios:"}) {
     EXPECT_EQ(refusalOf(text), "can not read the inventory: \"" + std::string(text) +
                                    "\": it names no source of an inventory; set CORVANE_INVENTORY, or inventory in the "
-                                   "configuration, to live, root:DIRECTORY, snapshot:FILE or json:FILE");
+                                   "configuration, to live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE");
   }
+}
+
+TEST(Source, ADumpsNameMayHoldAPlusSign) {
+  const ScratchDirectory directory;
+  const std::string file = directory.write("a+live+b.bin", contentsOf(dump));
+  const std::string base = "+root:" + fixture + "root.txt";
+
+  EXPECT_EQ(loadInventory("smbios:" + file), loadInventory("smbios:" + dump));
+  EXPECT_EQ(loadInventory("smbios:" + file + base), loadInventory("smbios:" + dump + base));
+}
+
+TEST(Source, ADumpCanStandOverTheLiveMachine) {
+  const Tree tree = loadInventory("smbios:" + dump + "+live");
+
+  EXPECT_EQ(tree.ofType(NodeLexicon::NodeProcessorCore).size(),
+            loadInventory("live").ofType(NodeLexicon::NodeProcessorCore).size());
+  EXPECT_FALSE(tree.disagreements().empty()) << "four sockets, with signatures of another machine";
+}
+
+TEST(Source, OrdinaryUsersSeeTheLiveMachineAtTheSamePaths) {
+  if (::getuid() != 0) {
+    GTEST_SKIP() << "only root can become another user";
+  }
+  constexpr uid_t nobody = 65534;
+  const ScratchDirectory directory;
+  const std::string file = directory.write("tree.json", "");
+  ASSERT_EQ(::chown(file.c_str(), nobody, nobody), 0);
+  std::filesystem::permissions(directory.name(), std::filesystem::perms::all);
+
+  const pid_t child = ::fork();
+  if (child == 0) {
+    const bool changed = ::setgroups(0, nullptr) == 0 && ::setgid(nobody) == 0 && ::setuid(nobody) == 0;
+    if (changed) {
+      std::ofstream(file) << writeJson(loadInventory("live"));
+    }
+    ::_exit(changed ? 0 : 1);
+  }
+  int status = -1;
+  ASSERT_EQ(::waitpid(child, &status, 0), child);
+  ASSERT_EQ(status, 0);
+
+  const Tree forOthers = loadInventory("json:" + file);
+  const Tree forRoot = loadInventory("live");
+  ASSERT_FALSE(forOthers.nodes().empty());
+  for (const Node& node : forOthers.nodes()) {
+    const NodeIndex index = forRoot.find(node.internalPath);
+    ASSERT_NE(index, noNode) << node.path();
+    EXPECT_EQ(forRoot.node(index).cpus, node.cpus) << node.path();
+  }
+}
+
+TEST(Source, RefusesWhatIsNoDump) {
+  const std::string fixtureFile = fixture + "root.txt";
+  EXPECT_THAT(
+      refusalOf("smbios:" + fixtureFile),
+      testing::AllOf(testing::StartsWith("can not read the SMBIOS dump: " + fixtureFile + ": SMBIOS entry point"),
+                     testing::EndsWith("; name a file that dmidecode --dump-bin wrote")));
+  EXPECT_EQ(refusalOf("smbios:/nothing"),
+            "can not read the inventory: /nothing: no such file or directory; name a file that dmidecode --dump-bin "
+            "wrote");
+  EXPECT_EQ(refusalOf("smbios:" + dump + "+root:/nothing"),
+            "can not read the inventory: /nothing: no such file or directory; name a captured root directory, or a "
+            "file of captured files");
+}
+
+TEST(Source, RefusesADumpWithoutSockets) {
+  Support::SmbiosEncoder tables;
+  tables.add(Support::SmbiosSystem{});
+  tables.end();
+  const ScratchDirectory directory;
+  const std::string file = directory.write("dump.bin", tables.dump());
+
+  EXPECT_EQ(refusalOf("smbios:" + file),
+            "can not read the inventory: " + file +
+                ": its tables tell of no processor socket; name a dump of a machine's SMBIOS tables, or join it with "
+                "another source: smbios:FILE+live");
 }
 
 TEST(Source, RefusesFilesThatCanNotBeRead) {

@@ -77,10 +77,10 @@ TEST(SystemModel, OfAPlaceholderUnderAHypervisorIsVirtual) {
 }
 
 TEST(SystemModel, IsAbsentWhereNothingTellsIt) {
-  const Tree tree = machine().tree();
+  const Tree tree = machine().remove("sys/firmware").tree();
 
   EXPECT_EQ(textAt(tree, "system", PropSystemModel), std::nullopt);
-  ASSERT_EQ(tree.unread().size(), 1U);
+  ASSERT_EQ(tree.unread().size(), 2U);
   EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/class/dmi/id/product_name", "no such file or directory",
                                              "it is there on machines whose firmware has DMI tables"}));
 }
@@ -91,6 +91,31 @@ TEST(SystemModel, ThatMayNotBeReadIsTold) {
   ASSERT_EQ(tree.unread().size(), 1U);
   EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/class/dmi/id/product_name", "permission denied",
                                              "run as root, or let this process read it"}));
+}
+
+TEST(SystemModel, ComesFromTheTablesWhereTheKernelTellsNone) {
+  Support::SmbiosEncoder tables;
+  tables.add(Support::SmbiosSystem{.manufacturer = " Boxes Inc. ", .product = "Box 3 "});
+  tables.end();
+
+  const Tree tree = underHypervisor().firmware(tables).tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Box 3");
+  EXPECT_EQ(textAt(tree, "system", PropSystemManufacturer), "Boxes Inc.");
+  EXPECT_TRUE(tree.unread().empty());
+}
+
+TEST(SystemModel, OfTheKernelCountsAndTheTablesMayDisagree) {
+  Support::SmbiosEncoder tables;
+  tables.add(Support::SmbiosSystem{.manufacturer = "", .product = "Box 3"});
+  tables.end();
+
+  const Tree tree = machine().file(productName, "Box 4\n").firmware(tables).tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Box 4");
+  ASSERT_EQ(tree.disagreements().size(), 1U);
+  EXPECT_EQ(tree.disagreements()[0], (Disagreement{"system", "SystemModel", "Box 4", "/sys/class/dmi/id/product_name",
+                                                   "Box 3", "SMBIOS type 1, handle 0x0010, offset 0x05"}));
 }
 
 TEST(SystemModel, WithStrangeBytesIsValidUtf8) {

@@ -1,0 +1,151 @@
+#include "platform/instrumentation/SocketAssignment.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "platform/instrumentation/NodePaths.h"
+#include "platform/instrumentation/PropertyTable.h"
+#include "platform/instrumentation/SocketMatching.h"
+
+namespace Tarn::Inventory {
+
+namespace {
+
+using namespace NodeLexicon;
+
+std::optional<unsigned int> valueOf(const unsigned int* number) {
+  return number == nullptr ? std::nullopt : std::optional(*number);
+}
+
+ProcessorMark markOf(const KernelProcessor& processor) {
+  return {.signature = processor.identity.processorId,
+          .name = comparableName(processor.identity.name),
+          .cores = valueOf(processor.facts.number(PropProcessorCores)),
+          .threads = valueOf(processor.facts.number(PropHardwareThreads))};
+}
+
+class Assigner {
+ public:
+  Assigner(const std::vector<Socket>& sockets, const KernelView& kernel, const std::vector<KernelProcessor>& processors)
+      : sockets_(sockets), kernel_(kernel), processors_(processors) {
+    result_.packages.resize(processors.size());
+  }
+
+  SocketAssignment assign() {
+    if (processors_.empty()) {
+      for (const Socket& socket : sockets_) {
+        result_.alone.push_back(&socket);
+      }
+    } else if (!sockets_.empty()) {
+      chooseCandidates();
+      match();
+      addAlone();
+    }
+    return std::move(result_);
+  }
+
+ private:
+  // Those whose processor can be at work. Where the kernel has as many packages as there are processors at
+  // all, it works with those that the firmware calls disabled as well.
+  void chooseCandidates() {
+    std::vector<const Socket*> populated;
+    for (const Socket& socket : sockets_) {
+      if (socket.isPopulated()) {
+        populated.push_back(&socket);
+      }
+      if (socket.isEnabled()) {
+        candidates_.push_back(&socket);
+      }
+    }
+    enabled_ = candidates_.size();
+    if (enabled_ != processors_.size() && populated.size() == processors_.size()) {
+      candidates_ = std::move(populated);
+    }
+  }
+
+  void match() {
+    std::vector<ProcessorMark> sockets;
+    for (const Socket* socket : candidates_) {
+      sockets.push_back(socket->mark);
+    }
+    std::vector<ProcessorMark> packages;
+    for (const KernelProcessor& processor : processors_) {
+      packages.push_back(markOf(processor));
+    }
+    const SocketMatching matching = matchSockets(sockets, packages);
+    for (std::size_t i = 0; i < packages.size(); ++i) {
+      const SocketMatching::Match& match = matching.packages[i];
+      if (match.socket != SocketMatching::none) {
+        result_.packages[i] = {candidates_[match.socket], match.rule};
+      }
+    }
+    for (const std::size_t socket : matching.unseen) {
+      unseen_.push_back(candidates_[socket]);
+    }
+    for (const SocketMatching::Contradiction& contradiction : matching.contradictions) {
+      addContradiction(contradiction, sockets, packages);
+    }
+  }
+
+  void addContradiction(const SocketMatching::Contradiction& contradiction, const std::vector<ProcessorMark>& sockets,
+                        const std::vector<ProcessorMark>& packages) {
+    if (contradiction.sockets.size() == 1 && contradiction.packages.size() == 1) {
+      const std::size_t package = contradiction.packages.front();
+      const Socket& socket = *candidates_[contradiction.sockets.front()];
+      const Facts::Fact* told = processors_[package].facts.find(PropProcessorId);
+      result_.disagreements.push_back(
+          {processorPath(kernel_.topology.packages[package]), "ProcessorId", packages[package].signature,
+           told == nullptr ? kernelSource() : told->explain().source, sockets[contradiction.sockets.front()].signature,
+           Smbios::placeOf(socket.structure->structure, socket.structure->id)});
+      return;
+    }
+    std::string paths;
+    for (const std::size_t package : contradiction.packages) {
+      paths += (paths.empty() ? ": " : ", ") + processorPath(kernel_.topology.packages[package]);
+    }
+    std::string labels;
+    std::string places;
+    for (const std::size_t socket : contradiction.sockets) {
+      labels += (labels.empty() ? ": " : ", ") + candidates_[socket]->label;
+      places += (places.empty() ? "" : "; ") + Smbios::placeOf(candidates_[socket]->structure->structure);
+    }
+    result_.disagreements.push_back({"system", "processors", std::to_string(contradiction.packages.size()) + paths,
+                                     kernelSource(), std::to_string(contradiction.sockets.size()) + labels,
+                                     places.empty() ? "SMBIOS" : places});
+  }
+
+  void addAlone() {
+    for (const Socket& socket : sockets_) {
+      const bool isCandidate = std::ranges::find(candidates_, &socket) != candidates_.end();
+      const bool isUnseen = std::ranges::find(unseen_, &socket) != unseen_.end();
+      // Where the kernel has more packages than there are enabled sockets, it may well see a disabled one.
+      const bool isDisabled = socket.isPopulated() && !isCandidate && processors_.size() <= enabled_;
+      if (!socket.isPopulated() || isUnseen || isDisabled) {
+        result_.alone.push_back(&socket);
+      }
+      if (isUnseen && socket.isEnabled()) {
+        result_.disagreements.push_back({socket.path, "status", std::to_string(socket.status),
+                                         socket.statusOrigin().source, "(no such processor)", kernelSource()});
+      }
+    }
+  }
+
+  std::string kernelSource() const { return kernel_.machine.root().files().nameOf("sys/devices/system/cpu"); }
+
+  const std::vector<Socket>& sockets_;
+  const KernelView& kernel_;
+  const std::vector<KernelProcessor>& processors_;
+  std::vector<const Socket*> candidates_;
+  std::size_t enabled_ = 0;
+  std::vector<const Socket*> unseen_;
+  SocketAssignment result_;
+};
+
+}  // namespace
+
+SocketAssignment assignSockets(const std::vector<Socket>& sockets, const KernelView& kernel,
+                               const std::vector<KernelProcessor>& processors) {
+  return Assigner(sockets, kernel, processors).assign();
+}
+
+}  // namespace Tarn::Inventory

@@ -1,0 +1,127 @@
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <fstream>
+
+#include "platform/instrumentation/Archive.h"
+#include "platform/instrumentation/FirmwareTables.h"
+#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/LiveSource.h"
+#include "platform/instrumentation/Source.h"
+#include "tests/platform/instrumentation/FirmwareMachines.h"
+#include "tests/platform/instrumentation/Origins.h"
+#include "tests/platform/instrumentation/Scratch.h"
+
+namespace Tarn::Inventory {
+namespace {
+
+const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
+
+bool isUpdate() {
+  return std::getenv("CORVANE_UPDATE_FIXTURES") != nullptr;
+}
+
+void expectFile(const std::string& file, const std::string& contents) {
+  if (isUpdate()) {
+    std::ofstream(file, std::ios::binary) << contents;
+  }
+  EXPECT_EQ(contents, contentsOf(file)) << file;
+}
+
+class FirmwareFixture : public testing::TestWithParam<FirmwareMachine> {
+ protected:
+  static std::string file(const char* name) { return fixtures + "smbios/" + std::string(GetParam().name) + '/' + name; }
+  static std::string kernel() { return "root:" + fixtures + std::string(GetParam().kernel) + "/root.txt"; }
+  static bool hasKernel() { return !GetParam().kernel.empty(); }
+  static std::string alone() { return "smbios:" + file("dump.bin"); }
+  static std::string joined() { return alone() + '+' + kernel(); }
+
+  /// The fixture's files with the tables among them, as root sees them.
+  static MemoryFileSystem::Files filesForRoot() {
+    const std::string archive = fixtures + std::string(GetParam().kernel) + "/root.txt";
+    MemoryFileSystem::Files files = readArchive(contentsOf(archive), archive);
+    const Support::SmbiosEncoder tables = GetParam().tables();
+    files[entryPointFile] = {tables.entryPoint(), 0};
+    files[tableFile] = {tables.table(), 0};
+    return files;
+  }
+};
+
+TEST_P(FirmwareFixture, IsTheDumpThatTheMachineWouldWrite) {
+  expectFile(file("dump.bin"), GetParam().tables().dump());
+}
+
+TEST_P(FirmwareFixture, TablesAloneGiveTheirWholeTree) {
+  expectFile(file("alone.json"), writeJson(loadInventory(alone())));
+}
+
+TEST_P(FirmwareFixture, TablesAndKernelGiveTheirWholeTree) {
+  if (hasKernel()) {
+    expectFile(file("joined.json"), writeJson(loadInventory(joined())));
+  }
+}
+
+TEST_P(FirmwareFixture, TreesReadBackAsTheSame) {
+  EXPECT_EQ(loadInventory("json:" + file("alone.json")), loadInventory(alone()));
+  if (hasKernel()) {
+    EXPECT_EQ(loadInventory("json:" + file("joined.json")), loadInventory(joined()));
+  }
+}
+
+TEST_P(FirmwareFixture, RootSeesTheSameInTheFilesOfTheKernel) {
+  if (!hasKernel()) {
+    return;
+  }
+  MemoryFileSystem files(filesForRoot());
+  const ScratchDirectory directory;
+  for (const auto& [path, entry] : files.files()) {
+    if (entry.error == 0) {
+      directory.write(path, entry.contents);
+    }
+  }
+
+  EXPECT_EQ(readLiveInventory(files), loadInventory(joined()));
+  const Tree captured = loadInventory("root:" + directory.name());
+  EXPECT_TRUE(std::ranges::equal(captured.nodes(), loadInventory(joined()).nodes()));
+}
+
+TEST_P(FirmwareFixture, OrdinaryUsersSeeTheSameProcessorsCoresAndCachesAtTheSamePaths) {
+  if (!hasKernel()) {
+    return;
+  }
+  const Tree forRoot = loadInventory(joined());
+  const Tree forOthers = loadInventory(kernel());
+
+  for (const Node& node : forOthers.nodes()) {
+    const NodeIndex index = forRoot.find(node.internalPath);
+    ASSERT_NE(index, noNode) << node.path();
+    const Node& same = forRoot.node(index);
+    EXPECT_EQ(same.type, node.type) << node.path();
+    EXPECT_EQ(same.status, node.status) << node.path();
+    EXPECT_EQ(same.cpus, node.cpus) << node.path();
+    for (const NumberProperty& property : forOthers.numbers(node)) {
+      EXPECT_EQ(*forRoot.number(same, property.id), property.value) << node.path();
+    }
+  }
+}
+
+TEST_P(FirmwareFixture, TellsOfEveryValueWhereItComesFrom) {
+  for (const std::string& source : {alone(), joined()}) {
+    if (source == alone() || hasKernel()) {
+      const Tree tree = loadInventory(source, Detail::WithOrigins);
+      EXPECT_EQ(unexplainedValues(tree), std::vector<std::string>()) << source;
+      EXPECT_EQ(tree, loadInventory(source)) << source;
+    }
+  }
+}
+
+INSTANTIATE_TEST_SUITE_P(All, FirmwareFixture, testing::ValuesIn(firmwareMachines().begin(), firmwareMachines().end()),
+                         [](const auto& machine) {
+                           std::string name(machine.param.name);
+                           std::erase(name, '-');
+                           return name;
+                         });
+
+}  // namespace
+}  // namespace Tarn::Inventory
