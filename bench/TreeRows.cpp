@@ -1,4 +1,5 @@
-// Reading this machine's inventory, against opening, reading and closing the files that it comes from.
+// Reading this machine's inventory, with and without the firmware's tables, against opening, reading and
+// closing the files that it comes from.
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -8,13 +9,18 @@
 
 #include "bench/Rows.h"
 #include "platform/instrumentation/FileSystem.h"
+#include "platform/instrumentation/FirmwareTables.h"
 #include "platform/instrumentation/LiveSource.h"
+#include "platform/instrumentation/OverlayFileSystem.h"
+#include "platform/instrumentation/PropertyTable.h"
 #include "platform/instrumentation/RecordingFileSystem.h"
+#include "tests/support/SmbiosEncoder.h"
 
 namespace Corvane::Bench {
 namespace {
 
 using namespace Tarn::Inventory;
+using namespace Tarn::NodeLexicon;
 
 /// The files that building the tree reads, those that are not there included.
 std::vector<std::string> filesOfLiveTree() {
@@ -39,6 +45,43 @@ void readToTheEnd(const char* path) {
   close(file);
 }
 
+/// The identification register whose first bytes this text shows, lowest first.
+std::uint64_t registerOf(const std::string& text) {
+  std::uint64_t value = 0;
+  for (std::size_t byte = 0; 3 * byte < text.size(); ++byte) {
+    value |= std::stoull(text.substr(3 * byte, 2), nullptr, 16) << (8 * byte);
+  }
+  return value;
+}
+
+/// Tables as the firmware of this machine would have them: a socket with three caches for each processor,
+/// and one that is empty. Many machines to measure on are virtual and have none, or hide them.
+MemoryFileSystem::Files tablesOf(const Tree& tree) {
+  Support::SmbiosEncoder tables;
+  tables.add(Support::SmbiosSystem{});
+  for (const NodeIndex index : tree.ofType(NodeProcessor)) {
+    const Node& node = tree.node(index);
+    const std::string* id = tree.text(node, PropProcessorId);
+    const std::string* name = tree.text(node, PropProcessorName);
+    Support::SmbiosProcessor processor;
+    processor.socket = "CPU" + std::to_string(index);
+    processor.id = id == nullptr ? 0 : registerOf(*id);
+    processor.version = name == nullptr ? "" : *name;
+    for (std::uint16_t level = 1; level <= 3; ++level) {
+      processor.caches[level - 1U] = tables.add(Support::SmbiosCache{.level = level});
+    }
+    tables.add(processor);
+  }
+  tables.add(Support::emptySocket("Spare"));
+  tables.end();
+  return {{entryPointFile, {tables.entryPoint(), 0}}, {tableFile, {tables.table(), 0}}};
+}
+
+Tree readWith(const MemoryFileSystem::Files& tables) {
+  OverlayFileSystem root(tables, "tables", openDirectory("/"));
+  return readLiveInventory(root);
+}
+
 }  // namespace
 
 void addTreeRows() {
@@ -48,6 +91,22 @@ void addTreeRows() {
         const std::unique_ptr<FileSystem> root = openDirectory("/");
         benchmark::DoNotOptimize(readLiveInventory(*root));
       },
+      [files = filesOfLiveTree()] {
+        for (const std::string& file : files) {
+          readToTheEnd(file.c_str());
+        }
+      });
+  if (!selected("building the reconciled tree")) {
+    return;
+  }
+  // The tables come from memory, so that the floor has no part in them: all that they cost counts.
+  const MemoryFileSystem::Files tables = tablesOf(readLiveInventory(*openDirectory("/")));
+  const Tree reconciled = readWith(tables);
+  require(reconciled.find("/S:Spare") != noNode, "the reconciled tree", "has the empty socket");
+  require(reconciled.text(reconciled.node(reconciled.ofType(NodeProcessor).front()), PropSocket) != nullptr,
+          "the reconciled tree", "has the sockets of its processors");
+  addRow(
+      {"building the reconciled tree", 2.0}, [tables] { benchmark::DoNotOptimize(readWith(tables)); },
       [files = filesOfLiveTree()] {
         for (const std::string& file : files) {
           readToTheEnd(file.c_str());

@@ -16,8 +16,9 @@ constexpr std::string_view introduction =
 constexpr std::string_view optionHelp =
     "\n"
     "Options:\n"
-    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc), snapshot:FILE\n"
-    "                          or json:FILE\n"
+    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc), snapshot:FILE,\n"
+    "                          json:FILE, or smbios:FILE (a dump of the firmware's tables),\n"
+    "                          alone or over another: smbios:FILE+live\n"
     "  -o, --output FORMAT     text, mof or json; for tree: text, svg or dot\n"
     "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
     "  -l, --library FILE      the provider library\n"

@@ -32,8 +32,9 @@ constexpr std::string_view inventoryDetails =
 
 constexpr std::string_view diffDetails =
     "A and B are sources as --inventory takes them: live, root:DIR, snapshot:FILE,\n"
-    "json:FILE. Parts are matched by their paths. --ignore CurrentClockSpeed,description\n"
-    "leaves fields out; clocks change by themselves.\n"
+    "json:FILE, smbios:FILE. Parts are matched by their paths.\n"
+    "--ignore CurrentClockSpeed,description leaves fields out; clocks change by\n"
+    "themselves.\n"
     "\n"
     "Exit status: 0 no differences, 1 differences, 2 trouble.\n";
 

@@ -22,7 +22,7 @@ _corvcim_inventory() {
   elif [[ ${COMP_WORDS[COMP_CWORD - 1]} == : ]]; then
     _corvcim_files "$current"
   else
-    _corvcim_offer "live root: snapshot: json:"
+    _corvcim_offer "live root: snapshot: json: smbios:"
     compopt -o nospace
   fi
 }

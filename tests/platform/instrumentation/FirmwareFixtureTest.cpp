@@ -3,8 +3,10 @@
 #include <algorithm>
 #include <cstdlib>
 #include <fstream>
+#include <random>
 
 #include "platform/instrumentation/Archive.h"
+#include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/FirmwareTables.h"
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/LiveSource.h"
@@ -112,6 +114,35 @@ TEST_P(FirmwareFixture, TellsOfEveryValueWhereItComesFrom) {
       const Tree tree = loadInventory(source, Detail::WithOrigins);
       EXPECT_EQ(unexplainedValues(tree), std::vector<std::string>()) << source;
       EXPECT_EQ(tree, loadInventory(source)) << source;
+    }
+  }
+}
+
+TEST_P(FirmwareFixture, BrokenTablesHurtNobody) {
+  const Support::SmbiosEncoder tables = GetParam().tables();
+  const Tree kernelAlone = hasKernel() ? loadInventory(kernel()) : Tree();
+  MemoryFileSystem files(hasKernel() ? filesForRoot() : MemoryFileSystem::Files());
+  std::minstd_rand random(1);  // the same bytes in every run
+  constexpr int attempts = 60;
+  for (int attempt = 0; attempt < attempts; ++attempt) {
+    std::string table = tables.table();
+    for (int change = 0; change <= attempt % 8; ++change) {
+      table[random() % table.size()] = static_cast<char>(random() % 256);
+    }
+    table.resize(attempt % 5 == 0 ? random() % table.size() : table.size());
+    files.add(entryPointFile, tables.entryPoint());
+    files.add(tableFile, table);
+
+    if (!hasKernel()) {
+      try {
+        readFirmwareInventory(files);
+      } catch (const InventoryError&) {  // no socket is left in it
+      }
+      continue;
+    }
+    const Tree tree = readLiveInventory(files);
+    for (const Node& node : kernelAlone.nodes()) {
+      ASSERT_NE(tree.find(node.internalPath), noNode) << node.path();
     }
   }
 }
