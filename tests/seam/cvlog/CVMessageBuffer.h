@@ -24,6 +24,7 @@ class CVMessageBuffer {
     return *this;
   }
   std::ostream& operator<<(bool value) { return stream_ << (value ? '1' : '0'); }
+  // NOLINTNEXTLINE(google-explicit-constructor): the buffer is used where a stream is expected.
   operator std::ostream&() { return stream_; }
 
   static std::string str(std::ostream& stream) {
