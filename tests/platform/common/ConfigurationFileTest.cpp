@@ -18,13 +18,16 @@ using testing::IsEmpty;
 using testing::SizeIs;
 
 class ReadAgain : public testing::Test {
- protected:
+ public:
   ReadAgain() {
     std::filesystem::create_directories(directory_);
     write("language = de\n");
   }
+  ReadAgain(const ReadAgain&) = delete;
+  ReadAgain& operator=(const ReadAgain&) = delete;
   ~ReadAgain() override { std::filesystem::remove_all(directory_); }
 
+ protected:
   void write(const std::string& text) const { std::ofstream(path_) << text; }
   // Longer than a tick of any file system's clock.
   static void letTheClockTick() { std::this_thread::sleep_for(std::chrono::milliseconds(50)); }

@@ -57,7 +57,7 @@ TEST(LogSettings, LimitTheSystemLogUnlessTheyAreToldNotTo) {
 }
 
 TEST(LogSettings, LimitFilesUnlessTheyAreToldNotTo) {
-  EXPECT_EQ(fromFile("").trace.rotation, (Rotation{.size = 16 * 1024 * 1024, .keep = 4}));
+  EXPECT_EQ(fromFile("").trace.rotation, (Rotation{.size = std::uint64_t{16} << 20U, .keep = 4}));
   const Settings settings = fromFile("log.size = 0\nlog.keep = 999\ntrace.size = 2G\ntrace.keep = 1\n");
   EXPECT_EQ(settings.log.rotation, (Rotation{.size = 0, .keep = 999}));
   EXPECT_EQ(settings.trace.rotation, (Rotation{.size = std::uint64_t{2} << 30U, .keep = 1}));

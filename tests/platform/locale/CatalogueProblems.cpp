@@ -56,7 +56,7 @@ std::vector<std::string> problemsOfHeader(const PoFile& catalogue, const std::st
   for (const auto& [field, value] : wanted) {
     const auto found = catalogue.header.find(field);
     if (found == catalogue.header.end() || found->second != value) {
-      problems.push_back("the header has no \"" + field + ": " + value + '"');
+      problems.emplace_back("the header has no \"").append(field).append(": ").append(value).append("\"");
     }
   }
   return problems;
