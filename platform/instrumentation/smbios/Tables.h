@@ -17,6 +17,19 @@ namespace Tarn::Smbios {
 
 /// What the firmware's tables tell of a machine. Structures and raw bytes look into the bytes that were decoded,
 /// which must outlive this; texts and numbers are its own.
+///
+///     const Decoded decoded = decode(bytesOf(entryPointFile), bytesOf(tableFile));
+///     if (const auto* tables = std::get_if<Tables>(&decoded)) {
+///       for (const Processor& processor : tables->processors) {
+///         if (processor.externalClock) {
+///           use(*processor.externalClock,                                 // 100
+///               placeOf(processor.structure, processor.externalClock),    // SMBIOS type 4, handle 0x0043, offset 0x12
+///               hexOf(processor.externalClock.raw));                      // 6400
+///         }
+///       }
+///     } else {
+///       tell(describe(std::get<Problem>(decoded)));
+///     }
 struct Tables {
   EntryPoint entryPoint;
   std::vector<Structure> structures;  ///< all of them, in the table's order
