@@ -46,8 +46,8 @@ Snapshot takeSnapshot(std::string_view specification, Identifiers identifiers, c
   const std::unique_ptr<FileSystem> files = openSource(specification);
   if (!files) {
     throw InventoryError("can not take a snapshot", std::string(specification),
-                         "the source is a tree, and nothing of it is read from a machine's files",
-                         "name live, root:DIRECTORY or snapshot:FILE, or pass on the tree's own file");
+                         "the source is one file already, and none of a machine's files is read for it",
+                         "pass on that file, or name live, root:DIRECTORY or snapshot:FILE");
   }
   Snapshot snapshot;
   RecordingFileSystem::Record record;

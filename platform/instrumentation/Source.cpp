@@ -131,7 +131,8 @@ std::unique_ptr<FileSystem> openDump(const Dump& dump) {
 }
 
 std::unique_ptr<FileSystem> openSmbios(const std::string& location) {
-  return openDump(splitDump(location));
+  const Dump dump = splitDump(location);
+  return dump.behind ? openDump(dump) : nullptr;
 }
 
 Tree loadSmbios(const std::string& location, Detail detail) {

@@ -24,8 +24,8 @@ namespace Tarn::Inventory {
 /// Throws InventoryError where the text names no source, or its source can not be read.
 Tree loadInventory(std::string_view specification, Detail detail = Detail::Values);
 
-/// The root of the files that this source is read from; nullptr where it is none of files (json:).
-/// Throws InventoryError as above.
+/// The root of the files that the live source's readers read for this source; nullptr where they read none (json:,
+/// and a dump of the firmware's tables alone). Throws InventoryError as above.
 std::unique_ptr<FileSystem> openSource(std::string_view specification);
 
 }  // namespace Tarn::Inventory

@@ -4,12 +4,14 @@
 #include <cstdlib>
 #include <fstream>
 #include <random>
+#include <regex>
 
 #include "platform/instrumentation/Archive.h"
 #include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/FirmwareTables.h"
 #include "platform/instrumentation/JsonTree.h"
 #include "platform/instrumentation/LiveSource.h"
+#include "platform/instrumentation/Snapshot.h"
 #include "platform/instrumentation/Source.h"
 #include "tests/platform/instrumentation/FirmwareMachines.h"
 #include "tests/platform/instrumentation/Origins.h"
@@ -86,6 +88,41 @@ TEST_P(FirmwareFixture, RootSeesTheSameInTheFilesOfTheKernel) {
   EXPECT_EQ(readLiveInventory(files), loadInventory(joined()));
   const Tree captured = loadInventory("root:" + directory.name());
   EXPECT_TRUE(std::ranges::equal(captured.nodes(), loadInventory(joined()).nodes()));
+}
+
+/// What of a tree in JSON identifies a processor: serial numbers, asset tags and part numbers.
+std::vector<std::string> identifiersIn(const std::string& json) {
+  const std::regex identifier("\"(AssetTag|PartNumber|SerialNumber)\": \"([^\"]*)\"");
+  std::vector<std::string> found;
+  for (std::sregex_iterator match(json.begin(), json.end(), identifier), end; match != end; ++match) {
+    found.push_back((*match)[2]);
+  }
+  return found;
+}
+
+std::string withMasks(std::string json) {
+  for (const std::string& identifier : identifiersIn(json)) {
+    const std::string mask(identifier.size(), 'X');
+    json.replace(json.find(": \"" + identifier + '"') + 3, identifier.size(), mask);
+  }
+  return json;
+}
+
+TEST_P(FirmwareFixture, SnapshotIsReplayedAsTheSameTreeButForWhatIsMasked) {
+  if (!hasKernel()) {
+    return;
+  }
+  const ScratchDirectory directory;
+  const std::string kept = directory.write("kept", takeSnapshot(joined(), Identifiers::Kept, "test").text);
+  const std::string masked = directory.write("masked", takeSnapshot(joined(), Identifiers::Masked, "test").text);
+  const std::string json = writeJson(loadInventory(joined()));
+
+  EXPECT_EQ(loadInventory("snapshot:" + kept), loadInventory(joined()));
+  EXPECT_EQ(writeJson(loadInventory("snapshot:" + masked)), withMasks(json));
+  const std::string table = readSnapshot(contentsOf(masked), masked).at(tableFile).contents;
+  for (const std::string& identifier : identifiersIn(json)) {
+    EXPECT_EQ(table.find(identifier), std::string::npos) << identifier;
+  }
 }
 
 TEST_P(FirmwareFixture, OrdinaryUsersSeeTheSameProcessorsCoresAndCachesAtTheSamePaths) {

@@ -131,10 +131,20 @@ TEST(Snapshot, OfWhatGivesNoInventoryIsTakenAllTheSame) {
   EXPECT_EQ(refusalOf([&] { loadInventory("snapshot:" + file); }), snapshot.error);
 }
 
-TEST(Snapshot, OfATreeIsRefused) {
-  EXPECT_EQ(refusalOf([] { takeSnapshot("json:x.json", Identifiers::Masked, "test"); }),
-            "can not take a snapshot: json:x.json: the source is a tree, and nothing of it is read from a machine's "
-            "files; name live, root:DIRECTORY or snapshot:FILE, or pass on the tree's own file");
+TEST(Snapshot, OfWhatIsOneFileAlreadyIsRefused) {
+  EXPECT_EQ(
+      refusalOf([] { takeSnapshot("json:x.json", Identifiers::Masked, "test"); }),
+      "can not take a snapshot: json:x.json: the source is one file already, and none of a machine's files is read "
+      "for it; pass on that file, or name live, root:DIRECTORY or snapshot:FILE");
+}
+
+TEST(Snapshot, OfADumpAloneIsRefused) {
+  const std::string dump = "smbios:" + fixtures + "smbios/many-cores/dump.bin";
+
+  EXPECT_EQ(refusalOf([&] { takeSnapshot(dump, Identifiers::Masked, "test"); }),
+            "can not take a snapshot: " + dump +
+                ": the source is one file already, and none of a machine's files is read for it; pass on that file, or "
+                "name live, root:DIRECTORY or snapshot:FILE");
 }
 
 TEST(Snapshot, IsKnownByItsFirstLine) {
