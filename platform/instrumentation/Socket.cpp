@@ -185,7 +185,7 @@ class Collector {
   template <class Value>
   Facts::Explain told(const Field<Value>& field, const char* rule) const {
     return [&structure = processor_.structure, &field, rule, matched = matched_] {
-      return originInTables(structure, field, rule + (matched.empty() ? "" : "; the socket was found by " + matched));
+      return originInTables(structure, field, rule + (matched.empty() ? "" : "; socket found by: " + matched));
     };
   }
 

@@ -137,8 +137,8 @@ class Matcher {
     if (group.sockets.size() == 1) {
       return same.empty() ? "the only one that is left on both sides" : same;
     }
-    return (same.empty() ? "nothing tells" : same + ", which tells") + " it not from " +
-           std::to_string(group.sockets.size() - 1) + " more: by order, ascending handle to ascending package number";
+    return (same.empty() ? "" : same + "; ") + std::to_string(group.sockets.size()) +
+           " are alike, so by order: ascending handle to ascending package number";
   }
 
   std::span<const ProcessorMark> sockets_;

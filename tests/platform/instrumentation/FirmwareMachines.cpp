@@ -37,6 +37,25 @@ SmbiosEncoder oldAndShort() {
   return ended(std::move(tables));
 }
 
+// Structures with fields of a version that is yet to come.
+SmbiosEncoder newAndLong() {
+  SmbiosEncoder tables(3, 9);
+  tables.add(SmbiosSystem{.frame = {.length = 0x30}, .manufacturer = "New Boxes", .product = "PowerBox 30"});
+  const std::uint16_t l2 =
+      tables.add(SmbiosCache{.frame = {.length = 0x40}, .socket = "L2", .level = 2, .installedKiB = 3145728});
+  tables.add(SmbiosProcessor{.frame = {.length = 0x60},
+                             .socket = "CPU0",
+                             .family = 512,
+                             .manufacturer = "Example",
+                             .version = "Example 30",
+                             .caches = {notProvided, l2, notProvided},
+                             .cores = 300,
+                             .coresEnabled = 299,
+                             .threads = 600,
+                             .threadsEnabled = 598});
+  return ended(std::move(tables));
+}
+
 SmbiosCache cacheOf(std::uint16_t level, std::uint64_t kibibytes, std::uint8_t associativity = 7) {
   return {.socket = "L" + std::to_string(level) + " Cache",
           .level = level,
@@ -233,6 +252,7 @@ SmbiosEncoder belowAContainer() {
 
 constexpr std::array machines = {
     FirmwareMachine{"old-and-short", "", oldAndShort},
+    FirmwareMachine{"new-and-long", "", newAndLong},
     FirmwareMachine{"one-of-two-sockets", "hybrid-laptop", oneOfTwoSockets},
     FirmwareMachine{"server-with-a-failed-processor", "dual-socket-server", serverWithAFailedProcessor},
     FirmwareMachine{"many-cores", "", manyCores},

@@ -70,11 +70,10 @@ TEST(Firmware, TheOrderIsSaidInTheOrigin) {
 
   const Tree tree = readLiveInventory(root, Detail::WithOrigins);
 
-  EXPECT_EQ(
-      *tree.origin(tree.find("/P1"), PropSocket),
-      (Origin{"SMBIOS type 4, handle 0x0011, offset 0x04", "B",
-              "as it stands; the socket was found by the same signature, name, number of cores, number of "
-              "threads, which tells it not from 1 more: by order, ascending handle to ascending package number"}));
+  EXPECT_EQ(*tree.origin(tree.find("/P1"), PropSocket),
+            (Origin{"SMBIOS type 4, handle 0x0011, offset 0x04", "B",
+                    "as it stands; socket found by: the same signature, name, number of cores, "
+                    "number of threads; 2 are alike, so by order: ascending handle to ascending package number"}));
   EXPECT_EQ(tree.origin(tree.find("/P1"), PropExternalClockSpeed)->raw, "64 00");
 }
 

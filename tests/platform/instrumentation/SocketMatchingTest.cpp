@@ -77,10 +77,9 @@ TEST(SocketMatching, WhatIdentityDoesNotTellApartGoesByOrder) {
 
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 1, 2}));
   EXPECT_EQ(matching.packages[1].rule,
-            "the same signature, name, which tells it not from 2 more: by order, ascending handle to ascending "
-            "package number");
+            "the same signature, name; 3 are alike, so by order: ascending handle to ascending package number");
   EXPECT_EQ(matchSockets(Marks{{}, {}}, Marks{{}, {}}).packages[0].rule,
-            "nothing tells it not from 1 more: by order, ascending handle to ascending package number");
+            "2 are alike, so by order: ascending handle to ascending package number");
 }
 
 TEST(SocketMatching, MoreSocketsThanPackagesAreAContradiction) {
