@@ -30,7 +30,9 @@ void checkSelection(const std::vector<std::string>& selection, const std::vector
       known.append(known.empty() ? "" : ", ").append(source.property);
     }
     if (!isKnown) {
-      throw std::runtime_error("explain: no property '" + name + "'; there are " + known);
+      std::string text = "explain: no property '";
+      text.append(name).append("'; there are ").append(known);
+      throw std::runtime_error(text);
     }
   }
 }

@@ -236,7 +236,7 @@ std::optional<std::string> expectedValue(const PropertySource& source, const Dat
   if (const auto* const number = std::get_if<unsigned int>(&*datum.value)) {
     return std::to_string(asPassedOn(source, *number));
   }
-  const std::string& text = std::get<std::string>(*datum.value);
+  const auto& text = std::get<std::string>(*datum.value);
   return source.field == "description" || source.field == "path" ? withoutBlanks(text) : text;
 }
 

@@ -60,6 +60,7 @@ Field readProperty(const Tree& tree, const Node& node, const PropertyEntry& entr
 
 std::vector<std::string_view> fieldNames() {
   std::vector<std::string_view> names;
+  names.reserve(nodeFields.size() + Tarn::Inventory::propertyTable().size());
   for (const NodeField& field : nodeFields) {
     names.push_back(field.name);
   }

@@ -188,7 +188,7 @@ class Collection {
     if (HwlocPackage* package = packageOf(cpus.first())) {
       // On x86 a core's number is unique in its die.
       const bool isX86 = !infoOf(package->object, "CPUFamilyNumber").empty();
-      const hwloc_obj_t cluster = isX86 ? nullptr : above(object, isCluster);
+      hwloc_obj_t cluster = isX86 ? nullptr : above(object, isCluster);
       package->package.cores.push_back(
           {{numberOf(above(object, HWLOC_OBJ_DIE)), numberOf(cluster), numberOf(object)}, std::move(cpus)});
     }

@@ -23,7 +23,7 @@ HwlocXml& HwlocXml::begin(std::string_view type, std::string_view number, std::s
                            attribute("complete_cpuset", completeCpus.empty() ? cpus : completeCpus) +
                            attribute("nodeset", "0x1") + attribute("complete_nodeset", "0x1");
   if (type == "Machine") {
-    memory_ = "<object type=\"NUMANode\" os_index=\"0\" local_memory=\"1024\"" + sets + "/>\n";
+    memory_ = R"(<object type="NUMANode" os_index="0" local_memory="1024")" + sets + "/>\n";
   } else {
     // Behind the machine's remarks, before its other parts.
     body_ += std::exchange(memory_, "");

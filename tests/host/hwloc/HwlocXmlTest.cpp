@@ -138,13 +138,13 @@ TEST(HwlocXml, CachesHaveSizeLineAndWays) {
   HwlocXml xml("0x3");
   xml.begin("Package", "1", "0x3")
       .cache("L3Cache", "4", "0x3",
-             "cache_size=\"18874368\" depth=\"3\" cache_linesize=\"64\" cache_associativity=\"12\" cache_type=\"0\"")
+             R"(cache_size="18874368" depth="3" cache_linesize="64" cache_associativity="12" cache_type="0")")
       .cache("L2Cache", "2", "0x3",
-             "cache_size=\"1310720\" depth=\"2\" cache_linesize=\"128\" cache_associativity=\"-1\" cache_type=\"0\"")
+             R"(cache_size="1310720" depth="2" cache_linesize="128" cache_associativity="-1" cache_type="0")")
       .cache("L1Cache", "8", "0x3",
-             "cache_size=\"49152\" depth=\"1\" cache_linesize=\"64\" cache_associativity=\"8\" cache_type=\"1\"")
+             R"(cache_size="49152" depth="1" cache_linesize="64" cache_associativity="8" cache_type="1")")
       .cache("L1iCache", "8", "0x3",
-             "cache_size=\"0\" depth=\"1\" cache_linesize=\"0\" cache_associativity=\"0\" cache_type=\"2\"");
+             R"(cache_size="0" depth="1" cache_linesize="0" cache_associativity="0" cache_type="2")");
   xml.plainCore(0).plainCore(1).end().end().end().end().end();
 
   const Tree tree = treeOf(xml);
@@ -182,9 +182,9 @@ TEST(HwlocXml, CoresAreNumberedByDie) {
 HwlocXml twoClusters(const char* family) {
   HwlocXml xml("0x3");
   xml.begin("Package", "0", "0x3").info("CPUFamilyNumber", family);
-  xml.begin("Group", "0", "0x1", {}, " kind=\"1001\" subkind=\"0\" subtype=\"Cluster\" dont_merge=\"1\"");
+  xml.begin("Group", "0", "0x1", {}, R"( kind="1001" subkind="0" subtype="Cluster" dont_merge="1")");
   xml.begin("Core", "0", "0x1").thread(0).end().end();
-  xml.begin("Group", "1", "0x2", {}, " kind=\"1001\" subkind=\"0\" subtype=\"Cluster\" dont_merge=\"1\"");
+  xml.begin("Group", "1", "0x2", {}, R"( kind="1001" subkind="0" subtype="Cluster" dont_merge="1")");
   xml.begin("Core", *family == '\0' ? "0" : "1", "0x2").thread(1).end().end().end();
   return xml;
 }
