@@ -46,6 +46,7 @@ class ObjectKeys {
       count_ = 1;
     }
   }
+  ~ObjectKeys() = default;
   ObjectKeys(const ObjectKeys&) = delete;
   ObjectKeys& operator=(const ObjectKeys&) = delete;
 
