@@ -71,7 +71,11 @@ class Teller {
   }
 
   static std::string nameOf(const Tree& tree, NodeIndex index) {
-    const std::string* name = tree.text(tree.node(index), PropProcessorName);
+    const Node& node = tree.node(index);
+    if (node.status == Tarn::Inventory::Status::emptySocket) {
+      return ": an empty socket";
+    }
+    const std::string* name = tree.text(node, PropProcessorName);
     return name == nullptr ? "" : ": " + toPrintable(*name);
   }
 

@@ -19,21 +19,29 @@ using Tarn::Inventory::Tree;
 /// Every name must be that of a property, or of the inventory's field that it comes from, in one of the
 /// classes that are explained.
 void checkSelection(const std::vector<std::string>& selection, const std::vector<ExplanationTarget>& targets) {
+  std::vector<const PropertySource*> sources;
+  for (const PropertySource& source : propertySources()) {
+    if (std::ranges::find(targets, source.className, &ExplanationTarget::className) != targets.end()) {
+      sources.push_back(&source);
+    }
+  }
   for (const std::string& name : selection) {
-    std::string known;
-    bool isKnown = false;
-    for (const PropertySource& source : propertySources()) {
-      if (std::ranges::find(targets, source.className, &ExplanationTarget::className) == targets.end()) {
-        continue;
+    const bool isKnown = std::ranges::any_of(sources, [&](const PropertySource* source) {
+      return sameName(source->property, name) || sameName(source->field, name);
+    });
+    if (isKnown) {
+      continue;
+    }
+    std::vector<std::string_view> known;
+    std::string text = "explain: no property '";
+    text.append(name).append("'; there are");
+    for (const PropertySource* source : sources) {
+      if (std::ranges::find(known, source->property) == known.end()) {
+        text.append(known.empty() ? " " : ", ").append(source->property);
+        known.push_back(source->property);
       }
-      isKnown = isKnown || sameName(source.property, name) || sameName(source.field, name);
-      known.append(known.empty() ? "" : ", ").append(source.property);
     }
-    if (!isKnown) {
-      std::string text = "explain: no property '";
-      text.append(name).append("'; there are ").append(known);
-      throw std::runtime_error(text);
-    }
+    throw std::runtime_error(text);
   }
 }
 

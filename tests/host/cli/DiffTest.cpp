@@ -114,6 +114,13 @@ TEST(Diff, AProcessorIsGoneOrNew) {
   EXPECT_EQ(told(one, two), "P1 is new: Some CPU, with 1 core and 2 caches\n");
 }
 
+TEST(Diff, AnEmptySocketIsNoProcessor) {
+  const Tree one = TreeBuilder().processor("P0").build();
+  const Tree two = TreeBuilder().processor("P0").processor("S:CPU2").status(Status::emptySocket).build();
+
+  EXPECT_EQ(told(one, two), "S:CPU2 is new: an empty socket\n");
+}
+
 TEST(Diff, CoresAndCachesAreGoneOrNewThemselves) {
   const Tree few = TreeBuilder().processor("P0").core("P0.C0").build();
   const Tree many =

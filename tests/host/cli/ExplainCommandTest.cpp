@@ -274,6 +274,21 @@ TEST(ExplainCommand, AnUnknownPropertyIsNamed) {
                            "OperationalStatus\n"}));
 }
 
+TEST(ExplainCommand, KernelAndFirmwareAreToldApart) {
+  const std::string tables = "SMBIOS type 4, handle 0x0014, offset ";
+  const std::string kernel = "root:" + fixture + "dual-socket-server/root.txt";
+  const std::string source = "smbios:" + fixture + "smbios/server-with-a-failed-processor/dump.bin+" + kernel;
+  const json document = json::parse(
+      corvcim({"-i", source, "-o", "json", "explain", "HALDA_CPUProcessor.P0", "MaxClockSpeed,UpgradeMethod"}).output);
+
+  const json& clock = document["instances"][0]["properties"][0];
+  EXPECT_EQ(clock["origin"]["source"], "/sys/devices/system/cpu/cpu0/cpufreq/cpuinfo_max_freq");
+  EXPECT_EQ(clock["disagreements"][0]["chosen"], "3700");
+  EXPECT_EQ(clock["disagreements"][0]["other"], "4000");
+  EXPECT_EQ(clock["disagreements"][0]["otherSource"], tables + "0x14");
+  EXPECT_EQ(document["instances"][0]["properties"][1]["origin"]["source"], tables + "0x19");
+}
+
 TEST(ExplainCommand, AClassThatCanNotBeAskedIsAFailure) {
   const Finished run =
       corvcimOn(smallBoard(), {"--library", "/nowhere/provider.so", "explain", "P0.C0", "HealthState"});
