@@ -2,7 +2,6 @@
 
 #include <memory>
 #include <string>
-#include <utility>
 #include <vector>
 
 #include "platform/instrumentation/CacheNodes.h"
@@ -67,9 +66,9 @@ class LiveReader {
 
  private:
   void addSystem() {
-    Facts told = firmware_ ? systemFacts(firmware_->tables) : Facts();
-    Facts kernel = readSystemFacts(machine_, firmware_ ? &told : nullptr);
-    const Facts facts = reconcile(std::move(kernel), std::move(told), "system", disagreements_);
+    const Facts told = firmware_ ? systemFacts(firmware_->tables) : Facts();
+    const Facts kernel = readSystemFacts(machine_, firmware_ ? &told : nullptr);
+    const Facts facts = reconcile(kernel, told, "system", disagreements_);
     tree_.system().status(Status::inUse).from([] {
       return Origin{"(fixed)", "", "the computer that tells this is in use"};
     });

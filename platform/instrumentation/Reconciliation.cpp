@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <string_view>
-#include <utility>
 
 #include "platform/instrumentation/CimFamily.h"
 #include "platform/instrumentation/PropertyTable.h"
@@ -64,7 +63,8 @@ bool isUnknown(const Facts::Fact& fact) {
 
 }  // namespace
 
-Facts reconcile(Facts kernel, Facts firmware, const std::string& path, std::vector<Disagreement>& disagreements) {
+Facts reconcile(const Facts& kernel, const Facts& firmware, const std::string& path,
+                std::vector<Disagreement>& disagreements) {
   Facts all;
   for (const Facts::Fact& fact : kernel.all()) {
     const Facts::Fact* other = firmware.find(fact.id);

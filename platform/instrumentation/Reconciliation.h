@@ -13,7 +13,8 @@ namespace Tarn::Inventory {
 /// those who may not read the firmware's tables, and of the firmware's what the kernel does not know.
 /// Where both say something and mean different things, a disagreement is added. Values that change by
 /// nature are not compared.
-Facts reconcile(Facts kernel, Facts firmware, const std::string& path, std::vector<Disagreement>& disagreements);
+Facts reconcile(const Facts& kernel, const Facts& firmware, const std::string& path,
+                std::vector<Disagreement>& disagreements);
 
 }  // namespace Tarn::Inventory
 

@@ -122,6 +122,7 @@ std::map<std::string, unsigned int> counted(const std::vector<std::string>& text
 // Broken firmware gives a handle twice. The place in the table tells the two apart.
 void separateEqualHandles(std::vector<Socket>& sockets) {
   std::vector<std::string> paths;
+  paths.reserve(sockets.size());
   for (const Socket& socket : sockets) {
     paths.push_back(socket.path);
   }

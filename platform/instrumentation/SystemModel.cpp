@@ -4,7 +4,6 @@
 #include <array>
 #include <cerrno>
 #include <string_view>
-#include <utility>
 
 #include "platform/instrumentation/CpuIdentity.h"
 #include "platform/instrumentation/PropertyTable.h"
@@ -41,57 +40,60 @@ static_assert(std::ranges::is_sorted(placeholders));
 // The model that emulators give their device tree.
 constexpr std::string_view emulatedBoard = "linux,dummy-virt";
 
-/// A text and the account of where it comes from.
+/// A text and where it comes from: a file, or where none is named, the flags of a CPU.
 struct Found {
   std::string text;
-  Facts::Explain explain;
+  const char* file;
+  const char* rule;
 };
 
-Facts::Explain inFile(const Machine& machine, const char* path, const char* rule) {
-  return [&machine, path, rule] { return machine.originIn(path, rule); };
+Found inFile(Machine& machine, const char* file) {
+  return {std::string(machine.root().text(file).value_or(std::string_view())), file, "as it stands"};
 }
 
 /// A text that the firmware gives; empty where nobody filled it in.
-Found firmwareText(Machine& machine, const char* path) {
-  const std::string text(machine.root().text(path).value_or(std::string_view()));
-  return {isPlaceholder(text) ? std::string() : text, inFile(machine, path, "as it stands")};
+Found givenByFirmware(Machine& machine, const char* file) {
+  Found found = inFile(machine, file);
+  if (isPlaceholder(found.text)) {
+    found.text.clear();
+  }
+  return found;
 }
 
 Found deviceTreeModel(Machine& machine) {
-  constexpr const char* path = "proc/device-tree/model";
-  const std::string model(machine.root().text(path).value_or(std::string_view()));
-  if (model == emulatedBoard) {
-    return {model + " (" + std::string(virtualMachine) + ')',
-            inFile(machine, path, "the board that emulators provide: marked as a virtual machine")};
+  Found model = inFile(machine, "proc/device-tree/model");
+  if (model.text == emulatedBoard) {
+    model.text += " (" + std::string(virtualMachine) + ')';
+    model.rule = "the board that emulators provide: marked as a virtual machine";
   }
-  return {model, inFile(machine, path, "as it stands")};
+  return model;
 }
 
 // Without firmware that names a model the hypervisor is all that is known of the machine.
 Found hypervisorModel(Machine& machine) {
-  constexpr const char* path = "sys/hypervisor/type";
-  const std::string type(machine.root().text(path).value_or(std::string_view()));
-  if (!type.empty()) {
-    return {std::string(virtualMachine) + " (" + type + ')', inFile(machine, path, "the hypervisor's name")};
+  Found type = inFile(machine, "sys/hypervisor/type");
+  if (!type.text.empty()) {
+    return {std::string(virtualMachine) + " (" + type.text + ')', type.file, "the hypervisor's name"};
   }
   const CpuInfo& info = machine.cpuInfo();
   const bool isVirtual = !info.cpus().empty() && identifyCpu(info, info.cpus().first()).hypervisor;
-  return {std::string(isVirtual ? virtualMachine : std::string_view()), [&machine] {
-            constexpr std::array<std::string_view, 1> fields = {"flags/hypervisor"};
-            return machine.originInCpuInfo(machine.cpuInfo().cpus().first(), fields,
-                                           "with the flag hypervisor it is a virtual machine");
-          }};
+  return {std::string(isVirtual ? virtualMachine : std::string_view()), nullptr,
+          "with the flag hypervisor it is a virtual machine"};
+}
+
+bool tellsModel(const Facts* firmware) {
+  return firmware != nullptr && firmware->find(PropSystemModel) != nullptr;
 }
 
 Found systemModel(Machine& machine, const Facts* firmware) {
-  Found product = firmwareText(machine, "sys/class/dmi/id/product_name");
+  Found product = givenByFirmware(machine, "sys/class/dmi/id/product_name");
   if (!product.text.empty()) {
     return product;
   }
   const std::string file = machine.root().fileName();
   const FileError error = machine.root().error();
   Found model = deviceTreeModel(machine);
-  if (!model.text.empty() || (firmware != nullptr && firmware->find(PropSystemModel) != nullptr)) {
+  if (!model.text.empty() || tellsModel(firmware)) {
     return model;
   }
   // Beside tables that are there, the kernel's file is not missed.
@@ -99,6 +101,17 @@ Found systemModel(Machine& machine, const Facts* firmware) {
     machine.noteUnread(file, error, "it is there on machines whose firmware has DMI tables");
   }
   return hypervisorModel(machine);
+}
+
+Origin originOf(const Machine& machine, const char* file, const char* rule) {
+  constexpr std::array<std::string_view, 1> fields = {"flags/hypervisor"};
+  return file != nullptr ? machine.originIn(file, rule)
+                         : machine.originInCpuInfo(machine.cpuInfo().cpus().first(), fields, rule);
+}
+
+void add(Facts& facts, Properties id, const Machine& machine, const Found& found) {
+  facts.text(id, found.text,
+             [&machine, file = found.file, rule = found.rule] { return originOf(machine, file, rule); });
 }
 
 }  // namespace
@@ -109,10 +122,8 @@ bool isPlaceholder(std::string_view text) {
 
 Facts readSystemFacts(Machine& machine, const Facts* firmware) {
   Facts facts;
-  Found model = systemModel(machine, firmware);
-  facts.text(PropSystemModel, std::move(model.text), std::move(model.explain));
-  Found maker = firmwareText(machine, "sys/class/dmi/id/sys_vendor");
-  facts.text(PropSystemManufacturer, std::move(maker.text), std::move(maker.explain));
+  add(facts, PropSystemModel, machine, systemModel(machine, firmware));
+  add(facts, PropSystemManufacturer, machine, givenByFirmware(machine, "sys/class/dmi/id/sys_vendor"));
   return facts;
 }
 

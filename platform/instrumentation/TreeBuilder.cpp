@@ -160,7 +160,7 @@ TreeBuilder& TreeBuilder::disagreement(const Disagreement& entry) {
   return *this;
 }
 
-void TreeBuilder::addOrigin(Origin origin) {
+void TreeBuilder::addOrigin(const Origin& origin) {
   const Node& node = last();
   if (!lastValue_) {
     refuse(node.type, node.path(), "an origin follows the value that it explains");

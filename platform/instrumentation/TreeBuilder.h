@@ -71,7 +71,7 @@ class TreeBuilder {
 
  private:
   Node& last();
-  void addOrigin(Origin origin);
+  void addOrigin(const Origin& origin);
 
   Detail detail_;
   std::optional<NodeLexicon::Properties> lastValue_;  // what the next origin is about
