@@ -3,6 +3,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 
 #include "platform/instrumentation/Facts.h"
 #include "platform/instrumentation/Machine.h"

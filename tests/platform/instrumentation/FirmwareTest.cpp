@@ -15,7 +15,6 @@ using Support::emptySocket;
 using Support::SmbiosCache;
 using Support::SmbiosEncoder;
 using Support::SmbiosProcessor;
-using testing::Contains;
 using testing::ElementsAre;
 
 const std::string cpuDirectory = "/sys/devices/system/cpu";
