@@ -2,7 +2,10 @@
 
 #include <sys/stat.h>
 
+#include <cerrno>
+#include <filesystem>
 #include <string_view>
+#include <system_error>
 #include <utility>
 
 #include "platform/common/Environment.h"
@@ -18,7 +21,10 @@ ConfigurationFile::ConfigurationFile(std::string path, Absence absence) : path_(
 
 ConfigurationFile ConfigurationFile::ofThisProcess() {
   if (std::optional<std::string> path = environmentOverride("CORVANE_CONFIG")) {
-    return {std::move(*path), Absence::kIsAProblem};
+    // The process may change its directory, and the file is looked after for as long as it runs.
+    std::error_code error;
+    const std::filesystem::path absolute = std::filesystem::absolute(*path, error);
+    return {error ? std::move(*path) : absolute.string(), Absence::kIsAProblem};
   }
   return {std::string(kDefaultFile), Absence::kIsFine};
 }
@@ -26,7 +32,7 @@ ConfigurationFile ConfigurationFile::ofThisProcess() {
 Configuration ConfigurationFile::read() {
   // Before reading: what changes in between is then seen as a change.
   lastRead_ = state();
-  if (!lastRead_ && absence_ == Absence::kIsFine) {
+  if (!lastRead_ && absence_ == Absence::kIsFine && (errno == ENOENT || errno == ENOTDIR)) {
     return {};
   }
   return Configuration::read(path_);

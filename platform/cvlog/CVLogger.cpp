@@ -1,4 +1,5 @@
 #include <cvlog/CVLogger.h>
+#include <pthread.h>
 
 #include <atomic>
 #include <cerrno>
@@ -11,16 +12,21 @@
 namespace CVLog {
 namespace {
 
-/// The logged code may look at errno after it has logged.
-class KeptErrno {
+/// What the logger does is nothing to the thread that logs: it may look at errno after it has logged, and where it is
+/// cancelled it ends before or after, not in a destructor that closes a file.
+class Undisturbed {
  public:
-  KeptErrno() = default;
-  KeptErrno(const KeptErrno&) = delete;
-  KeptErrno& operator=(const KeptErrno&) = delete;
-  ~KeptErrno() { errno = value_; }
+  Undisturbed() { pthread_setcancelstate(PTHREAD_CANCEL_DISABLE, &cancelState_); }
+  Undisturbed(const Undisturbed&) = delete;
+  Undisturbed& operator=(const Undisturbed&) = delete;
+  ~Undisturbed() {
+    pthread_setcancelstate(cancelState_, nullptr);
+    errno = errno_;
+  }
 
  private:
-  int value_ = errno;
+  int errno_ = errno;
+  int cancelState_ = PTHREAD_CANCEL_ENABLE;
 };
 
 std::string_view textOrNothing(const char* text) {
@@ -40,7 +46,7 @@ using Deliver = void (Logger::*)(const Message&);
 
 void deliver(Deliver operation, const char* function, const char* file, int line, const std::string& component,
              int level, const std::string& text) {
-  const KeptErrno kept;
+  const Undisturbed undisturbed;
   try {
     (Logger::instance().*operation)({.time = std::chrono::system_clock::now(),
                                      .level = level,
@@ -50,8 +56,7 @@ void deliver(Deliver operation, const char* function, const char* file, int line
                                      .line = line,
                                      .text = text});
   } catch (const std::exception&) {
-    // Out of memory: the message is lost, its caller goes on. (Not every exception, or a cancelled
-    // thread could not end here.)
+    // Out of memory: the message is lost, its caller goes on.
   }
 }
 
@@ -63,10 +68,10 @@ void CVLogger::followConfiguration() {
   if (lastLook.load(std::memory_order_relaxed) == now) [[likely]] {
     return;
   }
-  if (lastLook.exchange(now, std::memory_order_relaxed) == now) {
+  if (isClosed_.load(std::memory_order_relaxed) || lastLook.exchange(now, std::memory_order_relaxed) == now) {
     return;
   }
-  const KeptErrno kept;
+  const Undisturbed undisturbed;
   try {
     Logger::instance().followConfiguration();
   } catch (const std::exception&) {

@@ -84,6 +84,9 @@ FileDescriptor openSuccessor(const std::string& path, const struct stat& predece
   FileDescriptor next(open(path.c_str(), kAppending | O_CREAT | O_EXCL, kMode));
   if (!next) {
     next = FileDescriptor(open(path.c_str(), kAppending));
+    if (!next && errno == ENOENT) {  // a symbolic link that leads nowhere: O_EXCL follows none
+      next = FileDescriptor(open(path.c_str(), kAppending | O_CREAT, kMode));
+    }
     if (!next) {
       fail("cannot be opened again");
     }
@@ -183,7 +186,11 @@ void FileSink::followName(std::size_t lineSize) {
     return;  // the process has closed the descriptor; its number may be anything now
   }
   try {
-    isStale ? adopt(openSuccessor(path_, *current)) : rotate(lineSize);
+    if (isStale) {
+      adopt(openSuccessor(path_, *current));
+    } else if (!rotate(lineSize)) {
+      return;
+    }
     retryAt_.store(0, std::memory_order_relaxed);
   } catch (const std::exception& error) {
     retryAt_.store((Clock::now() + retryAfter_).time_since_epoch().count(), std::memory_order_relaxed);
@@ -207,7 +214,7 @@ bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
   return rotation_.size != 0 && size > 0 && static_cast<std::uint64_t>(size) + lineSize > rotation_.size;
 }
 
-void FileSink::rotate(std::size_t lineSize) {
+bool FileSink::rotate(std::size_t lineSize) {
   // Opened anew: a lock belongs to what open(2) made, and that of file_ may be shared with a forked process.
   const FileDescriptor locked(open(path_.c_str(), kAppending));
   if (!locked) {
@@ -215,7 +222,7 @@ void FileSink::rotate(std::size_t lineSize) {
   }
   const FileLock lock(locked.number());
   if (!lock) {
-    return;  // somebody else is at it
+    return false;  // somebody else is at it
   }
   const std::optional<struct stat> current = statusOf(locked.number());
   if (!current) {
@@ -230,6 +237,7 @@ void FileSink::rotate(std::size_t lineSize) {
     makeOld(real, rotation_.keep);
     adopt(openSuccessor(real, *current));
   }
+  return true;
 }
 
 void FileSink::adopt(const FileDescriptor& next) {

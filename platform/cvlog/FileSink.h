@@ -50,7 +50,8 @@ class FileSink final : public Sink {
   };
 
   void followName(std::size_t lineSize);
-  void rotate(std::size_t lineSize);
+  /// False where another process has the lock.
+  bool rotate(std::size_t lineSize);
   void adopt(const Tarn::Common::FileDescriptor& next);
   [[nodiscard]] bool wouldOutgrow(off_t size, std::size_t lineSize) const;
   void report(std::string_view why) const;

@@ -61,9 +61,11 @@ Logger::Logger(ConfigurationFile file, std::optional<std::string> logOverride, s
       traceOverride_(std::move(traceOverride)),
       routes_(makeRoutes(nullptr)) {
   setThresholds(routes_.inForce());
+  CVLogger::isClosed_.store(false, std::memory_order_relaxed);
 }
 
 Logger::~Logger() {
+  CVLogger::isClosed_.store(true, std::memory_order_relaxed);
   CVLogger::logThreshold_.store(kNothing, std::memory_order_relaxed);
   CVLogger::traceThreshold_.store(kNothing, std::memory_order_relaxed);
 }
@@ -102,8 +104,8 @@ std::unique_ptr<const Logger::Routes> Logger::makeRoutes(const Routes* before) {
 
 Logger::Route Logger::makeRoute(const SinkSettings& wanted, const SinkSettings& fallback, const Route* before,
                                 std::vector<ConfigurationProblem>& problems) {
-  if (before != nullptr && before->wanted == wanted && !before->isFallback) {
-    return *before;
+  if (before != nullptr && !before->isFallback && wanted.differsOnlyInLevel(before->wanted)) {
+    return {.wanted = wanted, .isFallback = false, .level = wanted.level, .sink = before->sink};
   }
   try {
     return {.wanted = wanted, .isFallback = false, .level = wanted.level, .sink = openSink(wanted)};

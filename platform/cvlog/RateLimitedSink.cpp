@@ -36,8 +36,8 @@ void RateLimitedSink::write(const Message& message) {
 }
 
 void RateLimitedSink::noteDropped(system_clock::time_point time, unsigned count) {
-  const std::string text =
-      std::to_string(count) + " messages were dropped; the limit is " + std::to_string(perMinute_) + " a minute";
+  const std::string text = std::to_string(count) + (count == 1 ? " message was" : " messages were") +
+                           " dropped; the limit is " + std::to_string(perMinute_) + " a minute";
   target_->write({.time = time,
                   .level = kLevelWarning,
                   .component = "Corvane.Logger",

@@ -31,6 +31,12 @@ struct SinkSettings {
   unsigned perMinute = 0;                ///< messages; 0 is no limit
   Rotation rotation = kDefaultRotation;  ///< of a file
 
+  /// The level stands in front of the sink: another one needs no other sink.
+  bool differsOnlyInLevel(SinkSettings other) const {
+    other.level = level;
+    return other == *this;
+  }
+
   friend bool operator==(const SinkSettings&, const SinkSettings&) = default;
 };
 

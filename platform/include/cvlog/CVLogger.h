@@ -56,6 +56,8 @@ class CVLogger {
   static constexpr int kNotConfigured = std::numeric_limits<int>::min();
   static inline std::atomic<int> logThreshold_{kNotConfigured};
   static inline std::atomic<int> traceThreshold_{kNotConfigured};
+  // The logger has gone: what a thread logs while the process ends must not look after its configuration.
+  static inline std::atomic<bool> isClosed_{false};
 };
 
 }  // namespace CVLog

@@ -85,6 +85,17 @@ TEST_F(FollowingLogger, TakesOtherLevels) {
   EXPECT_FALSE(CVLogger::traceTakes(6000));
 }
 
+TEST_F(FollowingLogger, KeepsTheFileThatIsOpenWhereOnlyTheLevelChanges) {
+  configure(to("log"));
+  CVLog::Logger logger = makeLogger();
+  std::filesystem::rename(path("log"), path("moved"));
+  std::filesystem::create_directory(path("log"));  // it could not be opened again
+  reconfigure(to("log") + "log.level = info\n");
+  logger.followConfiguration();
+  EXPECT_TRUE(CVLogger::logTakes(4000));
+  EXPECT_THAT(content("moved"), EndsWith(kReadAgain));
+}
+
 TEST_F(FollowingLogger, SaysThatItHasReadItsFileAgain) {
   configure("log.level = info\n" + to("log"));
   CVLog::Logger logger = makeLogger();
@@ -236,6 +247,15 @@ TEST_F(FollowingProcess, DoesNotLookForTheSakeOfDetails) {
   reconfigure("log.level = debug\nlog.destination = file:" + path("log") + "\n");
   std::this_thread::sleep_for(std::chrono::milliseconds(1100));
   log(3999, "lost, too");
+  EXPECT_FALSE(std::filesystem::exists(path("log")));
+}
+
+// A thread may still log while the process ends.
+TEST_F(FollowingLogger, IsNotLookedAfterOnceItIsGone) {
+  configure(to("log"));
+  { const CVLog::Logger logger = makeLogger(); }
+  std::filesystem::remove(path("log"));
+  log(6000, "nobody is there");
   EXPECT_FALSE(std::filesystem::exists(path("log")));
 }
 

@@ -71,7 +71,7 @@ TEST_F(RateLimit, SurvivesAClockThatIsSetBack) {
     writeAt(100'000, text);
   }
   writeAt(5, "d");
-  EXPECT_THAT(texts_, ElementsAre("a", "b", "1 messages were dropped; the limit is 2 a minute", "d"));
+  EXPECT_THAT(texts_, ElementsAre("a", "b", "1 message was dropped; the limit is 2 a minute", "d"));
 }
 
 }  // namespace

@@ -104,6 +104,17 @@ TEST_F(LogRotation, RotatesTheFileThatALinkLeadsTo) {
   EXPECT_EQ(content("disk/real"), line("c"));
 }
 
+TEST_F(LogRotation, MakesTheFileAnewThatALinkLedTo) {
+  std::filesystem::create_directory(path("disk"));
+  std::filesystem::create_symlink("disk/real", path("log"));
+  FileSink sink(path("log"), {.size = 0, .keep = 1});
+  writeAll(sink, "a");
+  std::filesystem::remove(path("disk/real"));
+  writeAll(sink, "b");
+  EXPECT_EQ(content("disk/real"), line("b"));
+  EXPECT_TRUE(std::filesystem::is_symlink(path("log")));
+}
+
 TEST_F(LogRotation, LeavesAFileAloneThatIsOnlyKnownAsADescriptor) {
   const Tarn::Common::FileDescriptor output(open(path("output").c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
   FileSink sink("/dev/fd/" + std::to_string(output.number()), {.size = twoLines(), .keep = 1});
