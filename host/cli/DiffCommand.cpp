@@ -29,10 +29,24 @@ void checkIgnored(const std::vector<std::string>& ignored) {
   }
 }
 
+/// A file's name on its machine: that of a captured one has the capture's directory before it.
+std::string_view onItsMachine(std::string_view file) {
+  for (const std::string_view top : {"/sys/", "/proc/"}) {
+    if (const std::size_t at = file.rfind(top); at != std::string_view::npos) {
+      return file.substr(at);
+    }
+  }
+  return file;
+}
+
+bool isSame(const Unread& a, const Unread& b) {
+  return onItsMachine(a.file) == onItsMachine(b.file) && a.reason == b.reason;
+}
+
 std::vector<Unread> unreadInOne(const Tree& one, const Tree& other) {
   std::vector<Unread> entries;
   std::ranges::copy_if(one.unread(), std::back_inserter(entries), [&](const Unread& entry) {
-    return std::ranges::find(other.unread(), entry) == other.unread().end();
+    return std::ranges::none_of(other.unread(), [&](const Unread& each) { return isSame(entry, each); });
   });
   return entries;
 }

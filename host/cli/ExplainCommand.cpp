@@ -1,13 +1,13 @@
 #include "host/cli/ExplainCommand.h"
 
 #include <algorithm>
-#include <stdexcept>
 #include <utility>
 
 #include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
 #include "host/cli/Explanation.h"
 #include "host/cli/ExplanationWriters.h"
+#include "host/cli/Options.h"
 #include "platform/instrumentation/ProcessTree.h"
 #include "platform/instrumentation/Source.h"
 
@@ -41,7 +41,7 @@ void checkSelection(const std::vector<std::string>& selection, const std::vector
         known.push_back(source->property);
       }
     }
-    throw std::runtime_error(text);
+    throw UsageError(text);
   }
 }
 

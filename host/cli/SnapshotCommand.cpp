@@ -1,6 +1,7 @@
 #include "host/cli/SnapshotCommand.h"
 
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -30,6 +31,12 @@ void writeFile(const std::string& file, std::string_view text, Identifiers ident
   const Tarn::Common::FileDescriptor target(
       ::open(file.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC | O_NOCTTY, modeOf(identifiers)));
   if (!target) {
+    fail(file, errno);
+  }
+  // A file that was there before has a mode of its own.
+  struct stat status {};
+  if (identifiers == Identifiers::Kept && ::fstat(target.number(), &status) == 0 && S_ISREG(status.st_mode) &&
+      ::fchmod(target.number(), modeOf(identifiers)) != 0) {
     fail(file, errno);
   }
   while (!text.empty()) {

@@ -10,7 +10,7 @@ constexpr Format drawingFormats[] = {Format::Text, Format::Svg, Format::Dot};
 
 constexpr std::string_view pathDetails =
     "PATH is an object path such as\n"
-    "  root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"0-0\"\n"
+    "  root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"P0.C0\"\n"
     "as ein prints it; the namespace may be left out.\n";
 
 constexpr std::string_view classDetails =

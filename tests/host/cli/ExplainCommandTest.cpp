@@ -268,7 +268,7 @@ TEST(ExplainCommand, JsonHasEverything) {
 TEST(ExplainCommand, AnUnknownPropertyIsNamed) {
   const Finished run = corvcimOn(smallBoard(), {"explain", "P0.C0", "EnabledState,Colour"});
 
-  EXPECT_EQ(run, (Finished{1, "",
+  EXPECT_EQ(run, (Finished{2, "",
                            "corvcim: explain: no property 'Colour'; there are InstanceID, Caption, Description, "
                            "ElementName, CoreEnabledState, EnabledState, RequestedState, HealthState, "
                            "OperationalStatus\n"}));

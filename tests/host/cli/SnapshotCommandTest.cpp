@@ -81,6 +81,10 @@ TEST_F(SnapshotCommand, WritesAFileThatOthersCanReadOnlyWhereItIsMasked) {
   const mode_t mask = ::umask(0);
   ::umask(mask);
   EXPECT_EQ(modeOf(kept), 0600U & ~mask);
+  // One that is there already has a mode of its own.
+  ::chmod(kept.c_str(), 0644);
+  EXPECT_EQ(corvcim({"-i", source_, "snapshot", "--unmasked", kept}), (Finished{0, "", ""}));
+  EXPECT_EQ(modeOf(kept), 0600U);
   EXPECT_EQ(modeOf(masked), 0644U & ~mask);
 }
 
