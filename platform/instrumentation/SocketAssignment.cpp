@@ -116,8 +116,8 @@ class Assigner {
 
   void addAlone() {
     for (const Socket& socket : sockets_) {
-      const bool isCandidate = std::ranges::find(candidates_, &socket) != candidates_.end();
-      const bool isUnseen = std::ranges::find(unseen_, &socket) != unseen_.end();
+      const bool isCandidate = std::ranges::binary_search(candidates_, &socket);
+      const bool isUnseen = std::ranges::binary_search(unseen_, &socket);
       // Where the kernel has more packages than there are enabled sockets, it may well see a disabled one.
       const bool isDisabled = socket.isPopulated() && !isCandidate && processors_.size() <= enabled_;
       if (!socket.isPopulated() || isUnseen || isDisabled) {
@@ -135,9 +135,9 @@ class Assigner {
   const std::vector<Socket>& sockets_;
   const KernelView& kernel_;
   const std::vector<KernelProcessor>& processors_;
-  std::vector<const Socket*> candidates_;
+  std::vector<const Socket*> candidates_;  // in the order of sockets_, and so ascending
   std::size_t enabled_ = 0;
-  std::vector<const Socket*> unseen_;
+  std::vector<const Socket*> unseen_;  // in the order of sockets_
   SocketAssignment result_;
 };
 

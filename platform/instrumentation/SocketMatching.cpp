@@ -2,7 +2,9 @@
 
 #include <algorithm>
 #include <array>
-#include <iterator>
+#include <cstddef>
+#include <map>
+#include <string>
 #include <string_view>
 #include <utility>
 
@@ -63,7 +65,7 @@ class Matcher {
     }
     std::vector<Group> groups = {std::move(all)};
     for (const Criterion& criterion : criteria) {
-      groups = split(criterion, std::move(groups));
+      groups = split(criterion, groups);
     }
     for (const Group& group : groups) {
       settle(group);
@@ -74,37 +76,43 @@ class Matcher {
 
  private:
   // Takes out of each group what agrees in the criterion, if equally many do on both sides.
-  std::vector<Group> split(const Criterion& criterion, std::vector<Group> groups) const {
+  std::vector<Group> split(const Criterion& criterion, const std::vector<Group>& groups) const {
     std::vector<Group> parts;
-    for (Group& group : groups) {
-      for (std::size_t i = 0; i < group.packages.size();) {
-        Group part = alike(criterion, group, packages_[group.packages[i]]);
-        const bool isAll = part.sockets.size() == group.sockets.size() && part.packages.size() == group.packages.size();
-        if (isAll || part.packages.empty() || part.sockets.size() != part.packages.size()) {
-          ++i;
-          continue;
+    for (const Group& group : groups) {
+      Group rest;
+      const auto firstOfThese = static_cast<std::ptrdiff_t>(parts.size());
+      for (auto& [value, part] : alike(criterion, group)) {
+        if (!value.empty() && part.sockets.size() == part.packages.size()) {
+          parts.push_back(std::move(part));
+        } else {
+          append(part, rest);
         }
-        remove(group.sockets, part.sockets);
-        remove(group.packages, part.packages);
-        parts.push_back(std::move(part));
-        i = 0;
       }
-      parts.push_back(std::move(group));
+      std::sort(parts.begin() + firstOfThese, parts.end(),
+                [](const Group& one, const Group& other) { return one.packages.front() < other.packages.front(); });
+      std::ranges::sort(rest.sockets);
+      std::ranges::sort(rest.packages);
+      parts.push_back(std::move(rest));
     }
     return parts;
   }
 
-  Group alike(const Criterion& criterion, const Group& group, const ProcessorMark& mark) const {
-    Group part;
-    std::ranges::copy_if(group.sockets, std::back_inserter(part.sockets),
-                         [&](std::size_t socket) { return agree(criterion, mark, sockets_[socket]); });
-    std::ranges::copy_if(group.packages, std::back_inserter(part.packages),
-                         [&](std::size_t package) { return agree(criterion, mark, packages_[package]); });
-    return part;
+  // The members of the group by their value. Comparing each with each would take too long on a machine, or
+  // with a made-up table, of very many sockets.
+  std::map<std::string, Group> alike(const Criterion& criterion, const Group& group) const {
+    std::map<std::string, Group> parts;
+    for (const std::size_t socket : group.sockets) {
+      parts[criterion.value(sockets_[socket])].sockets.push_back(socket);
+    }
+    for (const std::size_t package : group.packages) {
+      parts[criterion.value(packages_[package])].packages.push_back(package);
+    }
+    return parts;
   }
 
-  static void remove(Indexes& from, const Indexes& what) {
-    std::erase_if(from, [&](std::size_t index) { return std::ranges::find(what, index) != what.end(); });
+  static void append(const Group& part, Group& rest) {
+    rest.sockets.insert(rest.sockets.end(), part.sockets.begin(), part.sockets.end());
+    rest.packages.insert(rest.packages.end(), part.packages.begin(), part.packages.end());
   }
 
   void settle(const Group& group) {

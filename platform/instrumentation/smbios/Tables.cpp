@@ -26,13 +26,9 @@ void checkHandles(const std::vector<Structure>& structures, Problems& problems) 
 
 // What a processor calls its caches must be caches.
 void checkCaches(const Tables& tables, Problems& problems) {
-  std::vector<bool> isCache(handles);
-  for (const Cache& cache : tables.caches) {
-    isCache[cache.structure.handle] = true;
-  }
   for (const Processor& processor : tables.processors) {
     for (const Field<std::uint16_t>& handle : processor.caches) {
-      if (handle && !isCache[*handle]) {
+      if (handle && tables.cache(*handle) == nullptr) {
         problems.add({Problem::Place::Table, processor.structure.offset + handle.offset,
                       "there is no cache with the handle " + detail::hexadecimal(*handle, 4),
                       processor.structure.number, processor.structure.handle});
@@ -63,6 +59,7 @@ Tables decodeTable(const EntryPoint& entryPoint, Bytes table, Problems& problems
         tables.processors.push_back(readProcessor(structure, problems));
         break;
       case StructureType::cache:
+        tables.cacheByHandle.emplace(structure.handle, tables.caches.size());
         tables.caches.push_back(readCache(structure, problems));
         break;
       default:
@@ -82,8 +79,8 @@ const Structure* Tables::structure(std::uint16_t handle) const {
 }
 
 const Cache* Tables::cache(std::uint16_t handle) const {
-  const auto found = std::ranges::find(caches, handle, [](const Cache& cache) { return cache.structure.handle; });
-  return found == caches.end() ? nullptr : &*found;
+  const auto found = cacheByHandle.find(handle);
+  return found == cacheByHandle.end() ? nullptr : &caches[found->second];
 }
 
 Decoded decode(Bytes entryPoint, Bytes table) {

@@ -1,7 +1,9 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_SMBIOS_TABLES_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_SMBIOS_TABLES_H
 
+#include <cstddef>
 #include <cstdint>
+#include <map>
 #include <variant>
 #include <vector>
 
@@ -37,6 +39,9 @@ struct Tables {
   std::vector<Processor> processors;  ///< sockets, in the table's order; empty ones included
   std::vector<Cache> caches;          ///< in the table's order
   std::vector<Problem> problems;      ///< what was wrong; everything that was right is delivered all the same
+
+  /// Where in `caches` the one with a handle is, the first if there are several.
+  std::map<std::uint16_t, std::size_t> cacheByHandle;
 
   /// The structure with this handle, the first if there are several; nullptr where there is none.
   const Structure* structure(std::uint16_t handle) const;

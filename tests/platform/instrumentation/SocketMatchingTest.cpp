@@ -107,6 +107,39 @@ TEST(SocketMatching, NothingIsKnownAndMoreAreLeft) {
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 1}));
 }
 
+TEST(SocketMatching, ContradictionsAreInTheOrderOfThePackages) {
+  const SocketMatching matching =
+      matchSockets(Marks{{.signature = "1", .name = "a"}, {.signature = "2", .name = "z"}, {.signature = "3"}},
+                   Marks{{.signature = "4", .name = "z"}, {.signature = "5", .name = "a"}, {.signature = "6"}});
+
+  ASSERT_EQ(matching.contradictions.size(), 3U);
+  EXPECT_EQ(matching.contradictions[0].sockets, std::vector<std::size_t>{1});
+  EXPECT_EQ(matching.contradictions[1].sockets, std::vector<std::size_t>{0});
+  EXPECT_EQ(matching.contradictions[2].sockets, std::vector<std::size_t>{2});
+}
+
+TEST(SocketMatching, WhatIsLeftOverStaysInItsOrder) {
+  const SocketMatching matching = matchSockets(Marks{{.name = "z"}, {.name = "y"}, {.name = "m"}, {.name = "x"}},
+                                               Marks{{.name = "d"}, {.name = "m"}, {.name = "c"}, {.name = "b"}});
+
+  EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 2, 1, 3}));
+}
+
+// Comparing each with each would take minutes.
+TEST(SocketMatching, VeryManyAreToldApart) {
+  constexpr unsigned int count = 20000;
+  Marks sockets;
+  Marks packages;
+  std::vector<std::size_t> expected;
+  for (unsigned int i = 0; i < count; ++i) {
+    sockets.push_back({.signature = "A", .cores = i});
+    packages.push_back({.signature = "A", .cores = count - 1 - i});
+    expected.push_back(count - 1 - i);
+  }
+
+  EXPECT_EQ(socketsOf(matchSockets(sockets, packages)), expected);
+}
+
 TEST(SocketMatching, NoSocketAtAllIsAContradiction) {
   const SocketMatching matching = matchSockets(Marks{}, Marks{{}});
 
