@@ -80,11 +80,11 @@ class Masker {
       // A text that two fields share is masked if either identifies.
       (field.identifies ? done : kept).insert(index);
     }
-    for (unsigned int index = 1; index <= structure.stringCount(); ++index) {
-      if (!kept.contains(index) && !done.contains(index) && maskText(structure.string(index))) {
+    structure.eachString([&](unsigned int index, Bytes text) {
+      if (!kept.contains(index) && !done.contains(index) && maskText(text)) {
         add("text " + std::to_string(index));
       }
-    }
+    });
     if (structure.type == Smbios::StructureType::system && maskUuid(structure)) {
       add("UUID");
     }
@@ -104,9 +104,7 @@ class Masker {
 
   bool maskWhole(const Structure& structure) {
     bool any = clear(structure.formatted.subspan(Structure::headerLength));
-    for (unsigned int index = 1; index <= structure.stringCount(); ++index) {
-      any = maskText(structure.string(index)) || any;
-    }
+    structure.eachString([&](unsigned int, Bytes text) { any = maskText(text) || any; });
     return any;
   }
 

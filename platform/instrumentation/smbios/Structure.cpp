@@ -24,6 +24,12 @@ class Walker {
                     "the table ends after " + std::to_string(table.size()) + " of the " +
                         std::to_string(entryPoint.tableLength) + " bytes that its entry point announces"});
     }
+    if (table_.size() > largestTable) {
+      problems.add({Problem::Place::Table, largestTable,
+                    "the table has " + std::to_string(table_.size()) + " bytes; what is behind the first " +
+                        std::to_string(largestTable) + " is not read"});
+      table_ = table_.first(largestTable);
+    }
   }
 
   std::vector<Structure> walk() {
@@ -138,14 +144,19 @@ class Walker {
 std::optional<Bytes> Structure::string(unsigned int index) const {
   Bytes rest = strings;
   for (unsigned int at = 1; !rest.empty(); ++at) {
-    const auto end = std::ranges::find(rest, zero);
-    const auto length = static_cast<std::size_t>(end - rest.begin());
+    const Bytes text = takeString(rest);
     if (at == index) {
-      return rest.first(length);
+      return text;
     }
-    rest = rest.subspan(std::min(length + 1, rest.size()));
   }
   return std::nullopt;
+}
+
+Bytes Structure::takeString(Bytes& rest) {
+  const auto length = static_cast<std::size_t>(std::ranges::find(rest, zero) - rest.begin());
+  const Bytes text = rest.first(length);
+  rest = rest.subspan(std::min(length + 1, rest.size()));
+  return text;
 }
 
 unsigned int Structure::stringCount() const {

@@ -40,7 +40,25 @@ struct Structure {
 
   /// How many strings it has.
   unsigned int stringCount() const;
+
+  /// Hands every string to `take(index, bytes)`, in their order and counted as above. Asking for one number after the
+  /// other would look for each from the beginning.
+  template <class Take>
+  void eachString(Take take) const {
+    Bytes rest = strings;
+    for (unsigned int index = 1; !rest.empty(); ++index) {
+      take(index, takeString(rest));
+    }
+  }
+
+ private:
+  // The first string of these; what follows its zero is left.
+  static Bytes takeString(Bytes& rest);
 };
+
+/// How much of a table is read, bytes: many times what the largest machines have, and little enough that the texts of a
+/// broken or made-up table, each of which any number of fields may refer to, do not fill the memory.
+inline constexpr std::size_t largestTable = std::size_t{1} << 20U;
 
 /// "SMBIOS type 4, handle 0x0043", or with an offset in the structure "SMBIOS type 4, handle 0x0043, offset 0x12".
 std::string placeOf(const Structure& structure);
@@ -49,7 +67,8 @@ std::string placeOf(const Structure& structure, std::size_t offset);
 /// Finds the structures of a table. What is no structure ends the walk, as the length of a broken one does not tell
 /// where the next begins; a structure whose formatted area does not fit is not among them. The end-of-table structure
 /// is the last one under _SM3_. Under the older entry points it is the last one only when as many structures as were
-/// announced have been seen, since there the whole length of the table counts.
+/// announced have been seen, since there the whole length of the table counts. What is behind the first `largestTable`
+/// bytes is not read.
 std::vector<Structure> walk(const EntryPoint& entryPoint, Bytes table, Problems& problems);
 
 }  // namespace Tarn::Smbios

@@ -90,6 +90,22 @@ TEST(SmbiosMask, KeepsOnlyTheHeadersOfWhatTheInventoryDoesNotRead) {
   EXPECT_FALSE(contains(masked.table, "hidden"));
 }
 
+// Looking for each text from the first on would take minutes.
+TEST(SmbiosMask, TakesVeryManyTexts) {
+  const std::vector<std::string> texts(200000, "a");
+  SmbiosEncoder encoder;
+  encoder.add(Support::SmbiosOther{.type = 0, .strings = texts});
+  encoder.add(Support::SmbiosOther{.type = 200, .strings = texts});
+  encoder.end();
+
+  const Masked masked(encoder);
+
+  ASSERT_EQ(masked.notes.size(), 2U);
+  EXPECT_THAT(masked.notes[0], testing::EndsWith(", text 200000"));
+  EXPECT_EQ(masked.after.structures.at(1).stringCount(), 200000U);
+  EXPECT_FALSE(contains(masked.table, "a"));
+}
+
 TEST(SmbiosMask, TakesTextsThatNoFieldRefersTo) {
   SmbiosEncoder encoder;
   encoder.add(Support::SmbiosProcessor{.frame = {.handle = 4, .length = 0x1A}});

@@ -239,6 +239,30 @@ TEST(BrokenTable, OfMoreStructuresThanHandlesEndsThere) {
             "SMBIOS table, offset 0x60000: the table has more structures than there can be handles");
 }
 
+TEST(BrokenTable, LargerThanAnyIsReadUpToTheLimit) {
+  const SmbiosEncoder encoder(3, 0);
+  SmbiosEncoder filled = encoder;
+  filled.add(SmbiosOther{.type = StructureType::inactive, .fields = std::string(250, 'x')});
+  std::string table;
+  while (table.size() < largestTable) {
+    table += filled.table();
+  }
+  ASSERT_EQ(table.size(), largestTable) << "the structures fill it";
+  SmbiosEncoder more = encoder;
+  more.add(SmbiosOther{.type = 201});
+  more.end();
+  filled.announceLength(0x7FFFFFFF);
+
+  const Decoding full(filled.entryPoint(), table);
+  const Decoding tables(filled.entryPoint(), table + more.table());
+
+  EXPECT_THAT(full.problems(),
+              ElementsAre("SMBIOS table, offset 0x100000: the table ends without an end-of-table structure"));
+  EXPECT_EQ(tables->structures.size(), largestTable / filled.table().size());
+  EXPECT_EQ(tables.problems().front(),
+            "SMBIOS table, offset 0x100000: the table has 1048588 bytes; what is behind the first 1048576 is not read");
+}
+
 TEST(BrokenTable, OfGarbageGivesNothingButWhy) {
   SmbiosEncoder encoder(3, 0);
   encoder.announceLength(64);

@@ -70,6 +70,24 @@ TEST(Structure, CountsItsStringsFromOne) {
   EXPECT_EQ(textOf(tables->structures[1].string(1)), "-");
 }
 
+TEST(Structure, HandsOutItsStringsInTheirOrder) {
+  SmbiosEncoder encoder;
+  encoder.add(SmbiosOther{.type = 11, .strings = {"one", "t", "three"}});
+  encoder.end();
+  const Decoding whole(encoder);
+  const Decoding cut(encoder.entryPoint(), encoder.table().substr(0, 4 + 4 + 2 + 3));
+  const auto stringsOf = [](const Structure& structure) {
+    std::vector<std::string> strings;
+    structure.eachString(
+        [&](unsigned int index, Bytes text) { strings.push_back(std::to_string(index) + ' ' + textOf(text)); });
+    return strings;
+  };
+
+  EXPECT_THAT(stringsOf(whole->structures[0]), testing::ElementsAre("1 one", "2 t", "3 three"));
+  EXPECT_THAT(stringsOf(whole->structures[1]), testing::IsEmpty());
+  EXPECT_THAT(stringsOf(cut->structures[0]), testing::ElementsAre("1 one", "2 t", "3 thr"));
+}
+
 TEST(Structure, KnowsItsPlaceInWords) {
   SmbiosEncoder encoder;
   encoder.add(SmbiosOther{.frame = {.handle = 0x43}, .type = 4});
