@@ -77,12 +77,14 @@ std::string labelForPath(const Smbios::Processor& processor) {
   return plain && label.size() <= longestLabel ? label : std::string();
 }
 
+// Whether the field of the identification register holds another identifier than the kernel's.
+bool holdsSocId(const Smbios::Processor& processor) {
+  return processor.characteristics && (*processor.characteristics & Smbios::ProcessorCharacteristic::armSocId) != 0;
+}
+
 ProcessorMark markOf(const Smbios::Processor& processor) {
   ProcessorMark mark;
-  // With this bit the field holds another identifier than the kernel's.
-  const bool isOther =
-      processor.characteristics && (*processor.characteristics & Smbios::ProcessorCharacteristic::armSocId) != 0;
-  if (processor.id && !isOther) {
+  if (processor.id && !holdsSocId(processor)) {
     const Smbios::Bytes signature = processor.id.raw.first(signatureLength);
     const bool isZero = std::ranges::all_of(signature, [](std::byte byte) { return byte == std::byte{0}; });
     mark.signature = isZero ? std::string() : byteText(signature);
@@ -100,11 +102,14 @@ constexpr std::array<std::string_view, 7> x86Makers = {
 std::optional<unsigned int> x86Stepping(const Smbios::Processor& processor) {
   const std::string maker = comparableName(firmwareText(processor.manufacturer));
   const bool isX86 = std::ranges::any_of(x86Makers, [&](std::string_view known) { return maker.starts_with(known); });
-  return isX86 && processor.id ? std::optional(static_cast<unsigned int>(*processor.id & 0xFU)) : std::nullopt;
+  // Without a signature the feature bits behind it say nothing of the stepping.
+  const bool isTold = processor.id && (*processor.id & 0xFFFFFFFFU) != 0;
+  return isX86 && isTold ? std::optional(static_cast<unsigned int>(*processor.id & 0xFU)) : std::nullopt;
 }
 
 std::optional<unsigned int> widthOf(const Smbios::Processor& processor) {
-  if (!processor.characteristics) {
+  // A processor without any characteristic is one whose characteristics nobody filled in.
+  if (!processor.characteristics || *processor.characteristics == 0) {
     return std::nullopt;
   }
   return (*processor.characteristics & Smbios::ProcessorCharacteristic::wide64) != 0 ? 64 : 32;
@@ -155,8 +160,7 @@ class Collector {
       facts_.number(PropFamily, CimFamily::unknown, told(processor_.family, "no family is told: unknown"));
     }
     text(PropProcessorName, processor_.version);
-    const std::string id = processor_.id ? byteText(processor_.id.raw) : std::string();
-    facts_.text(PropProcessorId, id, told(processor_.id, "its bytes as they stand"));
+    addId();
     const std::optional<unsigned int> stepping = x86Stepping(processor_);
     facts_.text(PropStepping, stepping ? std::to_string(*stepping) : std::string(),
                 told(processor_.id, "the lowest four bits of an x86 signature"));
@@ -172,6 +176,13 @@ class Collector {
     text(PropSerialNumber, processor_.serialNumber);
     text(PropAssetTag, processor_.assetTag);
     text(PropPartNumber, processor_.partNumber);
+  }
+
+  // Two identifiers of one processor do not contradict each other: the kernel's counts.
+  void addId() {
+    const bool isOther = holdsSocId(processor_) && !matched_.empty();
+    const std::string id = processor_.id && !isOther ? byteText(processor_.id.raw) : std::string();
+    facts_.text(PropProcessorId, id, told(processor_.id, "its bytes as they stand"));
   }
 
   template <class Value>

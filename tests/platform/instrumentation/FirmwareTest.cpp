@@ -151,6 +151,41 @@ TEST(Firmware, AnotherSignatureIsAnotherProcessor) {
                                        "SMBIOS type 4, handle 0x0010, offset 0x08"}));
 }
 
+TEST(Firmware, AnIdentifierOfAnotherKindContradictsNothing) {
+  SmbiosProcessor board = xeon("SoC");
+  board.id = 0x000306C3;
+  board.characteristics = 0x2FC;
+  SmbiosProcessor removed = board;
+  removed.socket = "SoC2";
+  removed.status = 2;
+
+  const Tree tree = packages(1).firmware(tablesOf(board, removed)).tree();
+
+  EXPECT_EQ(textAt(tree, "P0", PropSocket), "SoC");
+  EXPECT_EQ(textAt(tree, "P0", PropProcessorId), "57 06 05 00");
+  EXPECT_EQ(textAt(tree, "S:SoC2", PropProcessorId), "C3 06 03 00 00 00 00 00") << "nothing else is known of it";
+  EXPECT_TRUE(tree.disagreements().empty());
+}
+
+TEST(Firmware, WhatNobodyFilledInTellsNothing) {
+  SmbiosProcessor told = xeon("CPU2");
+  told.status = 2;
+  told.manufacturer = "GenuineIntel";
+  SmbiosProcessor blank = told;
+  blank.socket = "CPU3";
+  blank.id = 0xBFEBFBFF00000000;
+  blank.characteristics = 0;
+
+  const Tree tree = packages(1).firmware(tablesOf(xeon("CPU1"), told, blank)).tree();
+
+  EXPECT_EQ(textAt(tree, "S:CPU2", PropStepping), "7");
+  EXPECT_EQ(numberAt(tree, "S:CPU2", PropDataWidth), 64U);
+  EXPECT_EQ(numberAt(tree, "S:CPU2", PropAddressWidth), 64U);
+  EXPECT_EQ(textAt(tree, "S:CPU3", PropStepping), std::nullopt) << "the feature bits alone are there";
+  EXPECT_EQ(numberAt(tree, "S:CPU3", PropDataWidth), std::nullopt);
+  EXPECT_EQ(numberAt(tree, "S:CPU3", PropAddressWidth), std::nullopt);
+}
+
 TEST(Firmware, AProcessorThatTheKernelDoesNotSeeIsThereWhereItsIdentityTells) {
   SmbiosProcessor other = xeon("CPU1");
   other.id = 0x000306C3;
