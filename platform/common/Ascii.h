@@ -19,6 +19,9 @@ constexpr bool isUpper(char c) {
 constexpr bool isLetter(char c) {
   return isLower(c) || isUpper(c);
 }
+constexpr bool isControl(char c) {
+  return static_cast<unsigned char>(c) < ' ' || c == '\x7F';
+}
 constexpr char lower(char c) {
   return isUpper(c) ? static_cast<char>(c - 'A' + 'a') : c;
 }

@@ -5,7 +5,6 @@
 #include <utility>
 #include <variant>
 
-#include "platform/common/Ascii.h"
 #include "platform/instrumentation/PropertyTable.h"
 #include "platform/instrumentation/SystemModel.h"
 
@@ -94,7 +93,7 @@ std::string byteText(Smbios::Bytes bytes) {
 }
 
 std::string firmwareText(const Smbios::Field<std::string>& field) {
-  std::string text(Common::trimmed(field ? std::string_view(*field) : std::string_view()));
+  std::string text = plainText(field ? std::string_view(*field) : std::string_view());
   return isPlaceholder(text) ? std::string() : text;
 }
 

@@ -49,7 +49,7 @@ Origin originInTables(const Smbios::Structure& structure, const Smbios::Field<Va
 /// The bytes as they stand, each with two digits: "57 06 05 00".
 std::string byteText(Smbios::Bytes bytes);
 
-/// A text that the firmware gives, without the blanks around it; empty where nobody filled it in.
+/// A text that the firmware gives, as plainText has it; empty where nobody filled it in.
 std::string firmwareText(const Smbios::Field<std::string>& field);
 
 }  // namespace Tarn::Inventory

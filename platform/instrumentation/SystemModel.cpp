@@ -5,6 +5,7 @@
 #include <cerrno>
 #include <string_view>
 
+#include "platform/common/Ascii.h"
 #include "platform/instrumentation/CpuIdentity.h"
 #include "platform/instrumentation/PropertyTable.h"
 
@@ -48,7 +49,7 @@ struct Found {
 };
 
 Found inFile(Machine& machine, const char* file) {
-  return {std::string(machine.root().text(file).value_or(std::string_view())), file, "as it stands"};
+  return {plainText(machine.root().text(file).value_or(std::string_view())), file, "as it stands"};
 }
 
 /// A text that the firmware gives; empty where nobody filled it in.
@@ -115,6 +116,12 @@ void add(Facts& facts, Properties id, const Machine& machine, const Found& found
 }
 
 }  // namespace
+
+std::string plainText(std::string_view text) {
+  std::string plain(text);
+  std::ranges::replace_if(plain, Common::isControl, ' ');
+  return std::string(Common::trimmed(plain));
+}
 
 bool isPlaceholder(std::string_view text) {
   return std::ranges::binary_search(placeholders, text);

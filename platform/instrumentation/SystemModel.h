@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_SYSTEMMODEL_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_SYSTEMMODEL_H
 
+#include <string>
 #include <string_view>
 
 #include "platform/instrumentation/Facts.h"
@@ -13,6 +14,10 @@ namespace Tarn::Inventory {
 /// "Virtual Machine", if the kernel says that it runs under a hypervisor. `firmware` is nullptr where
 /// there are no tables. The origins look into the machine, which must outlive them.
 Facts readSystemFacts(Machine& machine, const Facts* firmware);
+
+/// A text of the firmware's without the blanks around it, and with a blank for each control character: those
+/// can not stand in the XML that brokers send.
+std::string plainText(std::string_view text);
 
 /// Whether a text is what firmware vendors leave in a field that they did not fill in.
 bool isPlaceholder(std::string_view text);

@@ -186,6 +186,24 @@ TEST(Firmware, WhatNobodyFilledInTellsNothing) {
   EXPECT_EQ(numberAt(tree, "S:CPU3", PropAddressWidth), std::nullopt);
 }
 
+TEST(Firmware, ControlCharactersOfItsTextsAreBlanks) {
+  SmbiosProcessor empty = emptySocket("\001CPU\0372\177");
+  SmbiosProcessor processor = xeon("CPU1");
+  processor.serialNumber = "\x1B[1mSN\t1\n";
+  processor.assetTag = "\x02";
+  processor.partNumber = "To Be Filled By O.E.M.\x03";
+  KernelFiles files = packages(1).firmware(tablesOf(processor, empty));
+  MemoryFileSystem root(files.files());
+
+  const Tree tree = readLiveInventory(root, Detail::WithOrigins);
+
+  EXPECT_EQ(nodeAt(tree, "S:CPU2").description, "Socket CPU 2");
+  EXPECT_EQ(textAt(tree, "P0", PropSerialNumber), "[1mSN 1");
+  EXPECT_EQ(tree.origin(tree.find("/P0"), PropSerialNumber)->raw, "\x1B[1mSN\t1\n");
+  EXPECT_EQ(textAt(tree, "P0", PropAssetTag), std::nullopt);
+  EXPECT_EQ(textAt(tree, "P0", PropPartNumber), std::nullopt);
+}
+
 TEST(Firmware, AProcessorThatTheKernelDoesNotSeeIsThereWhereItsIdentityTells) {
   SmbiosProcessor other = xeon("CPU1");
   other.id = 0x000306C3;

@@ -45,6 +45,15 @@ TEST(SystemModel, IsTheProductNameAlsoUnderAHypervisor) {
             "Standard PC (Q35 + ICH9, 2009)");
 }
 
+TEST(SystemModel, HasBlanksForControlCharacters) {
+  const Tree tree =
+      machine().file(productName, "\001Box\002 9\037\n").file("sys/class/dmi/id/sys_vendor", "\177Maker\010\n").tree();
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Box  9");
+  EXPECT_EQ(nodeAt(tree, "system").description, "Box  9");
+  EXPECT_EQ(textAt(tree, "system", PropSystemManufacturer), "Maker");
+}
+
 TEST(SystemModel, IsNoPlaceholder) {
   for (const char* text : {"To Be Filled By O.E.M.", "To be filled by O.E.M.", "System Product Name", "Default string",
                            "Not Specified", "Not Applicable", "None", "O.E.M.", "Undefined", "", "  "}) {
