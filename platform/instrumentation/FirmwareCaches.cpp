@@ -73,11 +73,9 @@ class CacheNode {
  public:
   CacheNode(TreeBuilder& tree, const FirmwareCache& cache) : tree_(tree), cache_(cache), structure_(*cache.structure) {}
 
-  void add(const std::string& path) {
-    const bool off = isOff(structure_);
-    tree_.cache(path).status(off ? Status::disabled : Status::inUse).from([&] {
-      return told(structure_.enabled, off ? "bit 7 is 0: the cache is off, 16" : "bit 7 is 1: the cache is on, 1");
-    });
+  void add(const std::string& path, const Facts::Explain& offline) {
+    tree_.cache(path);
+    addStatus(offline);
     tree_.description(label(cache_)).from([&] { return told(structure_.level, "level and contents"); });
     tree_.text(PropCacheName, nameOf(cache_)).from([&] {
       return told(structure_.level, "L and the level in bits 0 to 2, behind it d for data, i for instructions");
@@ -95,6 +93,20 @@ class CacheNode {
   }
 
  private:
+  // What the firmware turned off stays off when the CPUs come back.
+  void addStatus(const Facts::Explain& offline) {
+    if (isOff(structure_)) {
+      tree_.status(Status::disabled).from([&] { return told(structure_.enabled, "bit 7 is 0: the cache is off, 16"); });
+    } else if (offline) {
+      tree_.status(Status::offline).from(offline);
+    } else {
+      tree_.status(Status::inUse).from([&] {
+        return told(structure_.enabled, structure_.enabled ? "bit 7 is 1: the cache is on, 1"
+                                                           : "the structure ends before bit 7: taken as on, 1");
+      });
+    }
+  }
+
   // The firmware tells no line size. CIM has 1 for what has no blocks; larger caches than that can count
   // are told in KiB.
   void addSize() {
@@ -224,14 +236,15 @@ std::optional<unsigned int> associativityCode(const Smbios::Cache& cache) {
   return cache.ways ? associativityCode(*cache.ways) : std::nullopt;
 }
 
-void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& caches, const std::string& processor) {
+void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& caches, const std::string& processor,
+                       const Facts::Explain& offline) {
   std::vector<std::string> taken;
   for (const FirmwareCache& cache : caches) {
     std::string path = processor + '.' + nameOf(cache);
     if (std::ranges::find(taken, path) != taken.end()) {
       path += '#' + hex4(cache.structure->structure.handle);
     }
-    CacheNode(tree, cache).add(path);
+    CacheNode(tree, cache).add(path, offline);
     taken.push_back(std::move(path));
   }
 }

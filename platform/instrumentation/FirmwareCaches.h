@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "platform/instrumentation/Caches.h"
+#include "platform/instrumentation/Facts.h"
 #include "platform/instrumentation/Socket.h"
 #include "platform/instrumentation/Tree.h"
 #include "platform/instrumentation/TreeBuilder.h"
@@ -40,7 +41,10 @@ inline constexpr const char* associativityRule =
 
 /// Puts the caches below the processor that was added last, for where the kernel shows none. Their paths
 /// are the processor's with the cache's name: "P0.L2"; a second one of that name has its handle behind it.
-void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& caches, const std::string& processor);
+/// `offline` says that none of the processor's CPUs is online, and so its caches are offline as well; it is empty
+/// where one is online, and where the kernel shows no CPUs.
+void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& caches, const std::string& processor,
+                       const Facts::Explain& offline);
 
 /// Compares the firmware's caches of a processor with those that the kernel shows of it, one at least.
 /// `cpuFiles` are the files below sys/devices/system/cpu.

@@ -122,7 +122,7 @@ class LiveReader {
     const std::vector<FirmwareCache> told =
         socket == nullptr ? std::vector<FirmwareCache>() : cachesOf(*socket, firmware_->tables);
     if (kernel.empty()) {
-      addFirmwareCaches(tree_, told, path);
+      addFirmwareCaches(tree_, told, path, offlineOrigin(package));
       return;
     }
     addCaches(tree_, kernel_, package, path, told);
@@ -132,6 +132,16 @@ class LiveReader {
     if (offline.empty()) {
       compareCaches(told, kernel, machine_.cpus().files(), path, disagreements_);
     }
+  }
+
+  // Why the parts of a package are offline; empty where one of its CPUs is online.
+  Facts::Explain offlineOrigin(const Package& package) const {
+    if (kernel_.isOnline(package.cpus)) {
+      return {};
+    }
+    return [this] {
+      return machine_.originIn("sys/devices/system/cpu/online", "none of the processor's CPUs is online: offline, 12");
+    };
   }
 
   // A socket that stands for itself: nothing is known of it but what the firmware says.
@@ -144,7 +154,7 @@ class LiveReader {
     }
     facts.addTo(tree_);
     if (socket.isPopulated()) {
-      addFirmwareCaches(tree_, cachesOf(socket, firmware_->tables), socket.path);
+      addFirmwareCaches(tree_, cachesOf(socket, firmware_->tables), socket.path, {});
     }
   }
 

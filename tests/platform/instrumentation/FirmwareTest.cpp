@@ -345,6 +345,48 @@ TEST(Firmware, TellsOfTheCachesWhereTheKernelShowsNone) {
   EXPECT_TRUE(nodeAt(tree, "P0.L2d").cpus.empty()) << "the firmware does not tell who shares it";
 }
 
+/// A processor whose CPU is offline, beside one at work, with two caches that only the firmware tells of.
+Tree withOfflineProcessor(const SmbiosCache& first, const SmbiosCache& second) {
+  KernelFiles files = packages(2).online("0").remove("sys/devices/system/cpu/cpu1/cache");
+  SmbiosEncoder tables;
+  tables.add(xeon("CPU1"));
+  SmbiosProcessor processor = xeon("CPU2");
+  processor.caches = {tables.add(first), tables.add(second), 0xFFFF};
+  tables.add(processor);
+  tables.end();
+  MemoryFileSystem root(files.firmware(tables).files());
+  return readLiveInventory(root, Detail::WithOrigins);
+}
+
+TEST(Firmware, CachesOfAProcessorThatIsOfflineAreOffline) {
+  const Tree tree = withOfflineProcessor({.level = 1}, {.level = 2, .enabled = false});
+
+  ASSERT_EQ(statusAt(tree, "P1"), Status::offline);
+  EXPECT_EQ(statusAt(tree, "P1.L1"), Status::offline);
+  EXPECT_EQ(*tree.statusOrigin(tree.find("/P1.L1")),
+            (Origin{cpuDirectory + "/online", "0", "none of the processor's CPUs is online: offline, 12"}));
+  EXPECT_EQ(statusAt(tree, "P1.L2"), Status::disabled) << "whether the CPUs are online or not";
+  EXPECT_EQ(*tree.statusOrigin(tree.find("/P1.L2")),
+            (Origin{"SMBIOS type 7, handle 0x0012, offset 0x05", "01 01", "bit 7 is 0: the cache is off, 16"}));
+}
+
+TEST(Firmware, CachesOfAProcessorAtWorkAreOn) {
+  KernelFiles files = packages(1).remove("sys/devices/system/cpu/cpu0/cache");
+  SmbiosEncoder tables;
+  SmbiosProcessor processor = xeon("CPU1");
+  processor.caches = {tables.add(SmbiosCache{.level = 1}), tables.add(SmbiosCache{.frame = {.length = 5}}), 0xFFFF};
+  tables.add(processor);
+  tables.end();
+  MemoryFileSystem root(files.firmware(tables).files());
+
+  const Tree tree = readLiveInventory(root, Detail::WithOrigins);
+
+  EXPECT_EQ(statusAt(tree, "P0.L1"), Status::inUse);
+  EXPECT_EQ(tree.statusOrigin(tree.find("/P0.L1"))->rule, "bit 7 is 1: the cache is on, 1");
+  EXPECT_EQ(statusAt(tree, "P0.L2"), Status::inUse);
+  EXPECT_EQ(tree.statusOrigin(tree.find("/P0.L2"))->rule, "the structure ends before bit 7: taken as on, 1");
+}
+
 TEST(Firmware, CachesThatAreNotInstalledOrNotInTheTableAreNone) {
   KernelFiles files = packages(1);
   files.remove("sys/devices/system/cpu/cpu0/cache");
