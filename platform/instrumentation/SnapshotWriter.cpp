@@ -64,7 +64,8 @@ Snapshot takeSnapshot(std::string_view specification, Identifiers identifiers, c
     comment(snapshot.text, "Nothing is masked: serial numbers and other identifiers are as they were read.");
   }
   if (!snapshot.error.empty()) {
-    comment(snapshot.text, "No inventory came of it: " + snapshot.error);
+    // Not the error itself: it names the captured directory.
+    comment(snapshot.text, "No inventory came of it; reading this file as a source says why.");
   }
   snapshot.text += writeArchive(record.files);
   return snapshot;
