@@ -37,7 +37,6 @@ class Assigner {
         result_.alone.push_back(&socket);
       }
     } else if (!sockets_.empty()) {
-      chooseCandidates();
       match();
       addAlone();
     }
@@ -45,34 +44,55 @@ class Assigner {
   }
 
  private:
-  // Those whose processor can be at work. Where the kernel has as many packages as there are processors at
-  // all, it works with those that the firmware calls disabled as well.
-  void chooseCandidates() {
+  // Those count whose processor can be at work. Where the kernel has as many packages as there are processors
+  // at all, it works with those that the firmware calls disabled as well; and so it may where the others are
+  // not the kernel's processors, which would else be in the tree a second time, as disabled.
+  void match() {
     std::vector<const Socket*> populated;
+    std::vector<const Socket*> enabled;
     for (const Socket& socket : sockets_) {
       if (socket.isPopulated()) {
         populated.push_back(&socket);
       }
       if (socket.isEnabled()) {
-        candidates_.push_back(&socket);
+        enabled.push_back(&socket);
       }
     }
-    enabled_ = candidates_.size();
-    if (enabled_ != processors_.size() && populated.size() == processors_.size()) {
-      candidates_ = std::move(populated);
-    }
-  }
-
-  void match() {
-    std::vector<ProcessorMark> sockets;
-    for (const Socket* socket : candidates_) {
-      sockets.push_back(socket->mark);
-    }
+    enabled_ = enabled.size();
     std::vector<ProcessorMark> packages;
     for (const KernelProcessor& processor : processors_) {
       packages.push_back(markOf(processor));
     }
-    const SocketMatching matching = matchSockets(sockets, packages);
+    const bool areAll = enabled.size() != packages.size() && populated.size() == packages.size();
+    const SocketMatching matching = matchSockets(marksOf(areAll ? populated : enabled), packages);
+    if (!areAll && enabled.size() < populated.size() && isRefused(matching)) {
+      const SocketMatching ofAll = matchSockets(marksOf(populated), packages);
+      if (ofAll.contradictions.empty()) {
+        take(std::move(populated), ofAll, packages);
+        return;
+      }
+    }
+    take(areAll ? std::move(populated) : std::move(enabled), matching, packages);
+  }
+
+  static std::vector<ProcessorMark> marksOf(const std::vector<const Socket*>& sockets) {
+    std::vector<ProcessorMark> marks;
+    for (const Socket* socket : sockets) {
+      marks.push_back(socket->mark);
+    }
+    return marks;
+  }
+
+  // Whether there are as many sockets as packages and it is the signatures that do not fit.
+  static bool isRefused(const SocketMatching& matching) {
+    return std::ranges::any_of(matching.contradictions, [](const SocketMatching::Contradiction& contradiction) {
+      return contradiction.sockets.size() == contradiction.packages.size();
+    });
+  }
+
+  void take(std::vector<const Socket*> candidates, const SocketMatching& matching,
+            const std::vector<ProcessorMark>& packages) {
+    candidates_ = std::move(candidates);
     for (std::size_t i = 0; i < packages.size(); ++i) {
       const SocketMatching::Match& match = matching.packages[i];
       if (match.socket != SocketMatching::none) {
@@ -83,20 +103,20 @@ class Assigner {
       unseen_.push_back(candidates_[socket]);
     }
     for (const SocketMatching::Contradiction& contradiction : matching.contradictions) {
-      addContradiction(contradiction, sockets, packages);
+      addContradiction(contradiction, packages);
     }
   }
 
-  void addContradiction(const SocketMatching::Contradiction& contradiction, const std::vector<ProcessorMark>& sockets,
+  void addContradiction(const SocketMatching::Contradiction& contradiction,
                         const std::vector<ProcessorMark>& packages) {
     if (contradiction.sockets.size() == 1 && contradiction.packages.size() == 1) {
       const std::size_t package = contradiction.packages.front();
       const Socket& socket = *candidates_[contradiction.sockets.front()];
       const Facts::Fact* told = processors_[package].facts.find(PropProcessorId);
-      result_.disagreements.push_back(
-          {processorPath(kernel_.topology.packages[package]), "ProcessorId", packages[package].signature,
-           told == nullptr ? kernelSource() : told->explain().source, sockets[contradiction.sockets.front()].signature,
-           Smbios::placeOf(socket.structure->structure, socket.structure->id)});
+      result_.disagreements.push_back({processorPath(kernel_.topology.packages[package]), "ProcessorId",
+                                       packages[package].signature,
+                                       told == nullptr ? kernelSource() : told->explain().source, socket.mark.signature,
+                                       Smbios::placeOf(socket.structure->structure, socket.structure->id)});
       return;
     }
     std::string paths;

@@ -111,6 +111,37 @@ TEST(Firmware, ADisabledProcessorThatTheKernelUsesIsADisagreement) {
                                                              "SMBIOS type 4, handle 0x0011, offset 0x18"}));
 }
 
+TEST(Firmware, ADisabledProcessorThatTheKernelUsesIsThereOnce) {
+  SmbiosProcessor enabled = xeon("CPU1");
+  enabled.id = 0x000306C3;
+  SmbiosProcessor disabled = xeon("CPU2");
+  disabled.status = 2;
+
+  const Tree tree = packages(1).firmware(tablesOf(enabled, disabled)).tree();
+
+  EXPECT_THAT(pathsOf(tree, NodeProcessor), ElementsAre("P0", "S:CPU1"));
+  EXPECT_EQ(textAt(tree, "P0", PropSocket), "CPU2");
+  EXPECT_THAT(tree.disagreements(),
+              ElementsAre(Disagreement{"S:CPU1", "status", "1", "SMBIOS type 4, handle 0x0010, offset 0x18",
+                                       "(no such processor)", cpuDirectory},
+                          Disagreement{"P0", "status", "1", cpuDirectory + "/online", "16",
+                                       "SMBIOS type 4, handle 0x0011, offset 0x18"}));
+}
+
+TEST(Firmware, WhereNoSocketFitsADisabledOneStandsForItself) {
+  SmbiosProcessor enabled = xeon("CPU1");
+  enabled.id = 0x000306C3;
+  SmbiosProcessor disabled = enabled;
+  disabled.socket = "CPU2";
+  disabled.status = 2;
+
+  const Tree tree = packages(1).firmware(tablesOf(enabled, disabled)).tree();
+
+  EXPECT_THAT(pathsOf(tree, NodeProcessor), ElementsAre("P0", "S:CPU2"));
+  EXPECT_EQ(textAt(tree, "P0", PropSocket), std::nullopt);
+  EXPECT_EQ(tree.disagreements().size(), 1U);
+}
+
 TEST(Firmware, SocketsThatCanNotBeToldApartAndAreTooManyStayOut) {
   const Tree tree = packages(1).firmware(tablesOf(xeon("CPU1"), xeon("CPU2"))).tree();
 
