@@ -7,8 +7,9 @@
 namespace Tarn::Inventory {
 
 FileError OverlayFileSystem::read(const char* path, std::string& contents) {
-  const auto found = front_->files.find(prefix_ + path);
-  if (found != front_->files.end()) {
+  const MemoryFileSystem::Files& own = front_->files.files();
+  const auto found = own.find(prefix_ + path);
+  if (found != own.end()) {
     contents = found->second.contents;
     return found->second.error;
   }
@@ -18,8 +19,7 @@ FileError OverlayFileSystem::read(const char* path, std::string& contents) {
 
 FileError OverlayFileSystem::list(const char* directory, std::vector<std::string>& names) {
   std::vector<std::string> own;
-  MemoryFileSystem front(front_->files);
-  const FileError ownError = front.list((prefix_ + directory).c_str(), own);
+  const FileError ownError = front_->files.list((prefix_ + directory).c_str(), own);
   names.clear();
   const FileError error = behind_ ? behind_->list(directory, names) : ENOENT;
   std::vector<std::string> all;
@@ -35,7 +35,7 @@ std::unique_ptr<FileSystem> OverlayFileSystem::below(const char* directory) {
 
 std::string OverlayFileSystem::nameOf(std::string_view path) const {
   const std::string whole = prefix_ + std::string(path);
-  if (front_->files.contains(whole)) {
+  if (front_->files.files().contains(whole)) {
     return front_->name;
   }
   return behind_ ? behind_->nameOf(path) : '/' + whole;

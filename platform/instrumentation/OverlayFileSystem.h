@@ -15,7 +15,7 @@ class OverlayFileSystem final : public FileSystem {
  public:
   /// `name` is what people see in the place of the files in front. There may be nothing behind them.
   OverlayFileSystem(MemoryFileSystem::Files front, const std::string& name, std::unique_ptr<FileSystem> behind)
-      : OverlayFileSystem(std::make_shared<const Front>(Front{std::move(front), name}), {}, std::move(behind)) {}
+      : OverlayFileSystem(std::make_shared<Front>(std::move(front), name), {}, std::move(behind)) {}
 
   FileError read(const char* path, std::string& contents) override;
   FileError list(const char* directory, std::vector<std::string>& names) override;
@@ -24,14 +24,16 @@ class OverlayFileSystem final : public FileSystem {
 
  private:
   struct Front {
-    MemoryFileSystem::Files files;
+    Front(MemoryFileSystem::Files own, std::string shown) : files(std::move(own)), name(std::move(shown)) {}
+
+    MemoryFileSystem files;
     std::string name;
   };
 
-  OverlayFileSystem(std::shared_ptr<const Front> front, std::string prefix, std::unique_ptr<FileSystem> behind)
+  OverlayFileSystem(std::shared_ptr<Front> front, std::string prefix, std::unique_ptr<FileSystem> behind)
       : front_(std::move(front)), prefix_(std::move(prefix)), behind_(std::move(behind)) {}
 
-  std::shared_ptr<const Front> front_;
+  std::shared_ptr<Front> front_;
   std::string prefix_;  // of this directory in the paths of the files in front
   std::unique_ptr<FileSystem> behind_;
 };
