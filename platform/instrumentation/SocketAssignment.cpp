@@ -60,6 +60,7 @@ class Assigner {
     }
     enabled_ = enabled.size();
     std::vector<ProcessorMark> packages;
+    packages.reserve(processors_.size());
     for (const KernelProcessor& processor : processors_) {
       packages.push_back(markOf(processor));
     }
@@ -77,6 +78,7 @@ class Assigner {
 
   static std::vector<ProcessorMark> marksOf(const std::vector<const Socket*>& sockets) {
     std::vector<ProcessorMark> marks;
+    marks.reserve(sockets.size());
     for (const Socket* socket : sockets) {
       marks.push_back(socket->mark);
     }

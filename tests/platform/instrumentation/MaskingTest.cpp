@@ -90,7 +90,7 @@ TEST(SmbiosMask, KeepsOnlyTheHeadersOfWhatTheInventoryDoesNotRead) {
   EXPECT_FALSE(contains(masked.table, "hidden"));
 }
 
-// Looking for each text from the first on would take minutes.
+// Looking for each text from the first on would take very long.
 TEST(SmbiosMask, TakesVeryManyTexts) {
   const std::vector<std::string> texts(200000, "a");
   SmbiosEncoder encoder;

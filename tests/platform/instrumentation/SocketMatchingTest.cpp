@@ -125,7 +125,7 @@ TEST(SocketMatching, WhatIsLeftOverStaysInItsOrder) {
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 2, 1, 3}));
 }
 
-// Comparing each with each would take minutes.
+// Comparing each with each would take very long.
 TEST(SocketMatching, VeryManyAreToldApart) {
   constexpr unsigned int count = 20000;
   Marks sockets;
