@@ -33,7 +33,7 @@ set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME corvane-cpu-tools)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS
   "${CPACK_DEBIAN_PACKAGE_DEPENDS}, corvane-cpu-provider (= ${PROJECT_VERSION})")
 if(CORVANE_HWLOC AND CORVANE_HWLOC_USABLE)
-  string(APPEND CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS ", libhwloc15 (>= 2.4.0)")
+  set(CPACK_DEBIAN_TOOLS_PACKAGE_RECOMMENDS "libhwloc15 (>= 2.4.0)")
 endif()
 
 # What CPack does not know: Multi-Arch, a description for each package, compressed manual pages, a

@@ -1,7 +1,5 @@
 #include "host/hwloc/HwlocParts.h"
 
-#include <hwloc/cpukinds.h>
-
 #include <algorithm>
 #include <array>
 #include <charconv>
@@ -100,12 +98,12 @@ HwlocCoreKind readKind(hwloc_const_cpuset_t cpus, unsigned int infoCount, const 
 
 std::vector<HwlocCoreKind> readKinds(hwloc_topology_t topology) {
   std::vector<HwlocCoreKind> kinds;
-  const int count = hwloc_cpukinds_get_nr(topology, 0);
-  const std::unique_ptr<hwloc_bitmap_s, decltype(&hwloc_bitmap_free)> cpus(hwloc_bitmap_alloc(), hwloc_bitmap_free);
+  const int count = hwloc().cpukindsGetNr(topology, 0);
+  const std::unique_ptr<hwloc_bitmap_s, decltype(&hwloc_bitmap_free)> cpus(hwloc().bitmapAlloc(), hwloc().bitmapFree);
   for (int index = 0; index < count; ++index) {
     unsigned int infoCount = 0;
     hwloc_info_s* infos = nullptr;
-    if (hwloc_cpukinds_get_info(topology, static_cast<unsigned int>(index), cpus.get(), nullptr, &infoCount, &infos,
+    if (hwloc().cpukindsGetInfo(topology, static_cast<unsigned int>(index), cpus.get(), nullptr, &infoCount, &infos,
                                 0) == 0) {
       kinds.push_back(readKind(cpus.get(), infoCount, infos));
     }
@@ -115,7 +113,8 @@ std::vector<HwlocCoreKind> readKinds(hwloc_topology_t topology) {
 
 class Collection {
  public:
-  explicit Collection(hwloc_topology_t topology) : topology_(topology), machine_(hwloc_get_root_obj(topology)) {}
+  explicit Collection(hwloc_topology_t topology)
+      : topology_(topology), machine_(hwloc().getObjByDepth(topology, 0, 0)) {}
 
   HwlocParts collect() {
     forEach([](hwloc_obj_t object) { return object->type == HWLOC_OBJ_PACKAGE; },
@@ -128,7 +127,7 @@ class Collection {
                       [](const HwlocPackage& entry) { return std::tuple(entry.package.id, entry.package.lowestCpu); });
     forEach([](hwloc_obj_t object) { return object->type == HWLOC_OBJ_CORE; },
             [this](hwloc_obj_t object) { addCore(object); });
-    forEach([](hwloc_obj_t object) { return hwloc_obj_type_is_cache(object->type) != 0; },
+    forEach([](hwloc_obj_t object) { return hwloc().objTypeIsCache(object->type) != 0; },
             [this](hwloc_obj_t object) { addCache(object); });
     for (HwlocPackage& entry : parts_.packages) {
       sort(entry);
@@ -145,9 +144,9 @@ class Collection {
  private:
   template <class Holds, class Action>
   void forEach(Holds holds, Action action) const {
-    for (int depth = 0; depth < hwloc_topology_get_depth(topology_); ++depth) {
-      for (unsigned int i = 0; i < hwloc_get_nbobjs_by_depth(topology_, depth); ++i) {
-        if (hwloc_obj_t object = hwloc_get_obj_by_depth(topology_, depth, i); holds(object)) {
+    for (int depth = 0; depth < hwloc().topologyGetDepth(topology_); ++depth) {
+      for (unsigned int i = 0; i < hwloc().getNbobjsByDepth(topology_, depth); ++i) {
+        if (hwloc_obj_t object = hwloc().getObjByDepth(topology_, depth, i); holds(object)) {
           action(object);
         }
       }

@@ -42,21 +42,25 @@ void settleEnvironment() {
   setenv("HWLOC_HIDE_ERRORS", "2", 1);
 }
 
-HwlocTopology newTopology() {
+HwlocTopology newTopology(const std::string& name) {
   settleEnvironment();
+  if (!hwloc().problem.empty()) {
+    throw InventoryError(whatFailed, name, "it takes hwloc: " + hwloc().problem,
+                         "install hwloc 2.4 or later (libhwloc15) for corvcim's architecture");
+  }
   hwloc_topology_t topology = nullptr;
-  if (hwloc_topology_init(&topology) != 0) {
+  if (hwloc().topologyInit(&topology) != 0) {
     throw std::runtime_error("hwloc can not make a topology");
   }
   HwlocTopology owned(topology);
-  hwloc_topology_set_all_types_filter(topology, HWLOC_TYPE_FILTER_KEEP_ALL);
-  hwloc_topology_set_io_types_filter(topology, HWLOC_TYPE_FILTER_KEEP_NONE);
-  hwloc_topology_set_flags(topology, HWLOC_TOPOLOGY_FLAG_INCLUDE_DISALLOWED);
+  hwloc().topologySetAllTypesFilter(topology, HWLOC_TYPE_FILTER_KEEP_ALL);
+  hwloc().topologySetIoTypesFilter(topology, HWLOC_TYPE_FILTER_KEEP_NONE);
+  hwloc().topologySetFlags(topology, HWLOC_TOPOLOGY_FLAG_INCLUDE_DISALLOWED);
   return owned;
 }
 
 void load(const HwlocTopology& topology, const std::string& name, const char* remedy) {
-  if (hwloc_topology_load(topology.get()) != 0) {
+  if (hwloc().topologyLoad(topology.get()) != 0) {
     throw InventoryError(whatFailed, name, "hwloc can not make a topology of it", remedy);
   }
 }
@@ -88,9 +92,9 @@ HwlocTopology loadXml(const std::string& text, const std::string& name) {
   if (text.size() >= std::numeric_limits<int>::max()) {
     throw InventoryError(whatFailed, name, "it is larger than any description of a machine", aboutXml);
   }
-  HwlocTopology topology = newTopology();
+  HwlocTopology topology = newTopology(name);
   // The size that hwloc asks for includes the final NUL.
-  if (hwloc_topology_set_xmlbuffer(topology.get(), text.c_str(), static_cast<int>(text.size() + 1)) != 0) {
+  if (hwloc().topologySetXmlbuffer(topology.get(), text.c_str(), static_cast<int>(text.size() + 1)) != 0) {
     throw InventoryError(whatFailed, name, "hwloc does not find a topology in it", aboutXml);
   }
   load(topology, name, aboutXml);
@@ -102,8 +106,8 @@ HwlocTopology loadSynthetic(const std::string& description, const std::string& n
     throw InventoryError(whatFailed, name, "it describes more than " + std::to_string(CpuSet::limit) + " CPUs",
                          "describe a smaller machine");
   }
-  HwlocTopology topology = newTopology();
-  if (hwloc_topology_set_synthetic(topology.get(), description.c_str()) != 0) {
+  HwlocTopology topology = newTopology(name);
+  if (hwloc().topologySetSynthetic(topology.get(), description.c_str()) != 0) {
     throw InventoryError(whatFailed, name, "hwloc does not understand the description", aboutSynthetic);
   }
   load(topology, name, aboutSynthetic);
@@ -115,10 +119,10 @@ CpuSet cpuSetOf(hwloc_const_bitmap_t set) {
   if (set == nullptr) {
     return cpus;
   }
-  if (hwloc_bitmap_last(set) < 0 && !hwloc_bitmap_iszero(set)) {
+  if (hwloc().bitmapLast(set) < 0 && !hwloc().bitmapIszero(set)) {
     throw std::invalid_argument("a set of CPUs has no end");
   }
-  for (int cpu = hwloc_bitmap_first(set); cpu >= 0; cpu = hwloc_bitmap_next(set, cpu)) {
+  for (int cpu = hwloc().bitmapFirst(set); cpu >= 0; cpu = hwloc().bitmapNext(set, cpu)) {
     const auto number = static_cast<unsigned int>(cpu);
     if (number >= CpuSet::limit) {
       throw std::invalid_argument("CPU " + std::to_string(number) + " has a number above " +

@@ -1,17 +1,16 @@
 #ifndef HOST_HWLOC_HWLOCTOPOLOGY_H
 #define HOST_HWLOC_HWLOCTOPOLOGY_H
 
-#include <hwloc.h>
-
 #include <memory>
 #include <string>
 
+#include "host/hwloc/HwlocLibrary.h"
 #include "platform/instrumentation/CpuSet.h"
 
 namespace Corvcim {
 
 struct HwlocRelease {
-  void operator()(hwloc_topology* topology) const { hwloc_topology_destroy(topology); }
+  void operator()(hwloc_topology* topology) const { hwloc().topologyDestroy(topology); }
 };
 /// A topology that was loaded.
 using HwlocTopology = std::unique_ptr<hwloc_topology, HwlocRelease>;

@@ -88,7 +88,7 @@ std::string_view firmwareRemark(hwloc_obj_t object, std::initializer_list<const 
 class Writer {
  public:
   Writer(hwloc_topology_t topology, const std::string& name)
-      : machine_(hwloc_get_root_obj(topology)), parts_(readParts(topology)), name_(name) {}
+      : machine_(hwloc().getObjByDepth(topology, 0, 0)), parts_(readParts(topology)), name_(name) {}
 
   Tree write() {
     addSystem();

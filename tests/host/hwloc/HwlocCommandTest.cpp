@@ -94,6 +94,41 @@ TEST(HwlocCommand, ADescriptionAndAnInventoryAreTwoSources) {
       (Finished{2, "", "corvcim: tree takes no option '--from': it belongs to inventory; see 'corvcim --help'\n"}));
 }
 
+/// What a conversion says where hwloc's library is another file than hwloc's.
+Finished withLibrary(const Directory& directory) {
+  return shell("LD_LIBRARY_PATH='" + directory.file("") + "' \"$corvcim\" inventory --from 'hwloc-synthetic:pu:1'");
+}
+
+constexpr const char* remedy = "; install hwloc 2.4 or later (libhwloc15) for corvcim's architecture\n";
+
+TEST(HwlocCommand, ALibraryThatCanNotBeLoadedIsOneLine) {
+  const Directory directory;
+  const std::string library = directory.write("libhwloc.so.15", "");
+
+  EXPECT_EQ(withLibrary(directory), (Finished{1, "",
+                                              "corvcim: can not read the inventory: \"pu:1\": it takes hwloc: " +
+                                                  library + ": file too short" + remedy}));
+}
+
+TEST(HwlocCommand, ALibraryWithoutAFunctionIsOneLine) {
+  const Directory directory;
+  shell("ln -s \"$(ldd \"$corvcim\" | sed -n 's/.*=> \\(.*libm\\.so[^ ]*\\).*/\\1/p')\" '" +
+        directory.file("libhwloc.so.15") + "'");
+
+  const Finished run = withLibrary(directory);
+
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.output, "");
+  EXPECT_TRUE(run.errors.ends_with(std::string("undefined symbol: hwloc_topology_init") + remedy)) << run;
+}
+
+TEST(HwlocCommand, OnlyAConversionLoadsIt) {
+  const std::string count = " 2>&1 | grep -c 'calling init:.*libhwloc'";
+
+  EXPECT_EQ(shell("LD_DEBUG=files \"$corvcim\" inventory --from 'hwloc-synthetic:pu:1'" + count).output, "1\n");
+  EXPECT_EQ(shell("LD_DEBUG=files \"$corvcim\" ei HALDA_CPUProcessor" + count).output, "0\n");
+}
+
 TEST(HwlocCommand, NoPluginIsLoaded) {
   const Finished run = shell(
       "LD_DEBUG=files \"$corvcim\" inventory --from 'hwloc-synthetic:pu:1' 2>&1 | "
