@@ -7,7 +7,7 @@
 #include <fstream>
 
 #include "bench/Rows.h"
-#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 
 namespace Corvane::Bench {
 namespace {

@@ -7,7 +7,7 @@
 #include <string>
 
 #include "bench/NullBroker.h"
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvane::Bench {
 

@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <string>
 
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvane::Bench {
 

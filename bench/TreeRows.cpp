@@ -8,12 +8,12 @@
 #include <vector>
 
 #include "bench/Rows.h"
-#include "platform/instrumentation/FileSystem.h"
-#include "platform/instrumentation/FirmwareTables.h"
-#include "platform/instrumentation/LiveSource.h"
-#include "platform/instrumentation/OverlayFileSystem.h"
-#include "platform/instrumentation/PropertyTable.h"
-#include "platform/instrumentation/RecordingFileSystem.h"
+#include "platform/instrumentation/files/FileSystem.h"
+#include "platform/instrumentation/files/OverlayFileSystem.h"
+#include "platform/instrumentation/files/RecordingFileSystem.h"
+#include "platform/instrumentation/firmware/FirmwareTables.h"
+#include "platform/instrumentation/live/LiveSource.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 #include "tests/support/SmbiosEncoder.h"
 
 namespace Corvane::Bench {

@@ -6,7 +6,7 @@
 
 #include <algorithm>
 #include <iterator>
-#include "platform/instrumentation/PropertyTable.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Tarn::ComputerSystemProvider {
 namespace {

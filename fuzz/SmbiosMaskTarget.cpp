@@ -3,8 +3,8 @@
 #include <span>
 
 #include "fuzz/Target.h"
-#include "platform/instrumentation/SmbiosMask.h"
 #include "platform/instrumentation/smbios/Tables.h"
+#include "platform/instrumentation/snapshot/SmbiosMask.h"
 
 namespace {
 

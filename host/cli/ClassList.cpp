@@ -5,8 +5,8 @@
 
 #include "host/ClassTable.h"
 #include "host/broker/Value.h"
-#include "host/cli/JsonBuilder.h"
 #include "host/cli/Text.h"
+#include "host/cli/results/JsonBuilder.h"
 
 namespace Corvcim {
 namespace {

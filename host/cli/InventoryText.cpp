@@ -5,8 +5,8 @@
 #include <vector>
 
 #include "host/cli/Text.h"
-#include "host/cli/Topology.h"
-#include "platform/instrumentation/PropertyTable.h"
+#include "host/cli/drawing/Topology.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Corvcim {
 namespace {

@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim {
 

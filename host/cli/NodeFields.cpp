@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <array>
 
-#include "platform/instrumentation/PropertyTable.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Corvcim {
 namespace {

@@ -8,8 +8,8 @@
 #include <variant>
 #include <vector>
 
-#include "host/cli/JsonBuilder.h"
-#include "platform/instrumentation/Tree.h"
+#include "host/cli/results/JsonBuilder.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim {
 

@@ -6,7 +6,7 @@
 #include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
 #include "host/cli/DirectEnumeration.h"
-#include "host/cli/ResultWriter.h"
+#include "host/cli/results/ResultWriter.h"
 #include "platform/instrumentation/ProcessTree.h"
 
 namespace Corvcim {

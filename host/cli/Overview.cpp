@@ -9,8 +9,8 @@
 #include "host/cli/Operations.h"
 #include "host/cli/Quantities.h"
 #include "host/cli/Text.h"
-#include "host/cli/TextWriter.h"
-#include "host/cli/ValueNames.h"
+#include "host/cli/results/TextWriter.h"
+#include "host/cli/results/ValueNames.h"
 #include "platform/instrumentation/ProcessTree.h"
 
 namespace Corvcim {

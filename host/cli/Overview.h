@@ -6,7 +6,7 @@
 
 #include "host/cli/Commands.h"
 #include "host/cli/OverviewData.h"
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim {
 

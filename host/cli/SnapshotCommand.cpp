@@ -8,9 +8,9 @@
 #include <stdexcept>
 
 #include "platform/common/FileDescriptor.h"
-#include "platform/instrumentation/FileSystem.h"
 #include "platform/instrumentation/ProcessTree.h"
-#include "platform/instrumentation/Snapshot.h"
+#include "platform/instrumentation/files/FileSystem.h"
+#include "platform/instrumentation/snapshot/Snapshot.h"
 
 namespace Corvcim {
 namespace {

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/instrumentation/Utf8.h"
+#include "platform/instrumentation/tree/Utf8.h"
 
 namespace Corvcim {
 namespace {

@@ -7,8 +7,8 @@
 #include <vector>
 
 #include "host/hwloc/HwlocTopology.h"
-#include "platform/instrumentation/Caches.h"
-#include "platform/instrumentation/Topology.h"
+#include "platform/instrumentation/kernel/Caches.h"
+#include "platform/instrumentation/kernel/Topology.h"
 
 namespace Corvcim {
 

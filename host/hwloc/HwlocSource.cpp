@@ -4,8 +4,8 @@
 #include <string>
 
 #include "host/hwloc/HwlocConversion.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/FileSystem.h"
+#include "platform/instrumentation/files/FileSystem.h"
+#include "platform/instrumentation/tree/Error.h"
 
 namespace Corvcim {
 namespace {

@@ -3,7 +3,7 @@
 
 #include <string_view>
 
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim {
 

@@ -10,7 +10,7 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/instrumentation/Error.h"
+#include "platform/instrumentation/tree/Error.h"
 
 namespace Corvcim {
 namespace {

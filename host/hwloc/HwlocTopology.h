@@ -5,7 +5,7 @@
 #include <string>
 
 #include "host/hwloc/HwlocLibrary.h"
-#include "platform/instrumentation/CpuSet.h"
+#include "platform/instrumentation/tree/CpuSet.h"
 
 namespace Corvcim {
 

@@ -5,14 +5,14 @@
 
 #include "host/hwloc/HwlocConversion.h"
 #include "host/hwloc/HwlocParts.h"
-#include "platform/instrumentation/CacheNodes.h"
-#include "platform/instrumentation/CoreNodes.h"
-#include "platform/instrumentation/CpuIdentity.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/NodePaths.h"
-#include "platform/instrumentation/PropertyTable.h"
-#include "platform/instrumentation/SystemModel.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/kernel/CpuIdentity.h"
+#include "platform/instrumentation/kernel/SystemModel.h"
+#include "platform/instrumentation/live/CacheNodes.h"
+#include "platform/instrumentation/live/CoreNodes.h"
+#include "platform/instrumentation/live/NodePaths.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 
 namespace Corvcim {
 namespace {

@@ -1,5 +1,5 @@
 #include "host/hwloc/HwlocConversion.h"
-#include "platform/instrumentation/Error.h"
+#include "platform/instrumentation/tree/Error.h"
 
 namespace Corvcim {
 namespace {

@@ -2,9 +2,9 @@
 
 #include <algorithm>
 
-#include "platform/instrumentation/Paths.h"
 #include "platform/instrumentation/ProcessTree.h"
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Paths.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Tarn {
 

@@ -7,14 +7,14 @@
 #include <optional>
 #include <string>
 
-#include "platform/instrumentation/Archive.h"
-#include "platform/instrumentation/DumpFile.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/FileSystem.h"
-#include "platform/instrumentation/JsonTree.h"
-#include "platform/instrumentation/LiveSource.h"
-#include "platform/instrumentation/OverlayFileSystem.h"
-#include "platform/instrumentation/Snapshot.h"
+#include "platform/instrumentation/files/Archive.h"
+#include "platform/instrumentation/files/FileSystem.h"
+#include "platform/instrumentation/files/OverlayFileSystem.h"
+#include "platform/instrumentation/firmware/DumpFile.h"
+#include "platform/instrumentation/live/LiveSource.h"
+#include "platform/instrumentation/snapshot/Snapshot.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 
 namespace Tarn::Inventory {
 

@@ -4,8 +4,8 @@
 #include <memory>
 #include <string_view>
 
-#include "platform/instrumentation/FileSystem.h"
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/files/FileSystem.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Tarn::Inventory {
 

@@ -10,7 +10,7 @@
 #include "host/DmtfClasses.h"
 #include "host/broker/Names.h"
 #include "host/broker/Value.h"
-#include "host/cli/ValueNames.h"
+#include "host/cli/results/ValueNames.h"
 #include "tests/schema/Mof.h"
 
 namespace Corvcim {

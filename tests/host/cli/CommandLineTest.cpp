@@ -8,7 +8,7 @@
 #include <nlohmann/json.hpp>
 #include <string>
 
-#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 #include "tests/host/cli/Machines.h"
 #include "tests/host/cli/Program.h"
 

@@ -10,9 +10,9 @@
 #include "host/broker/Broker.h"
 #include "host/broker/ProviderLibrary.h"
 #include "host/broker/Request.h"
-#include "platform/instrumentation/JsonTree.h"
-#include "platform/instrumentation/PropertyTable.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/host/cli/Program.h"
 
 namespace Corvcim {

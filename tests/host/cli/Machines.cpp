@@ -3,7 +3,7 @@
 #include <string>
 #include <utility>
 
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 
 namespace Corvcim::Testing {
 namespace {

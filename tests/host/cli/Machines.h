@@ -1,7 +1,7 @@
 #ifndef TESTS_HOST_CLI_MACHINES_H
 #define TESTS_HOST_CLI_MACHINES_H
 
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim::Testing {
 

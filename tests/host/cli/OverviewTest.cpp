@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "host/cli/InventoryText.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/host/cli/Machines.h"
 
 namespace Corvcim {

@@ -9,7 +9,7 @@
 #include <stdexcept>
 #include <utility>
 
-#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 
 namespace Corvcim::Testing {
 namespace {

@@ -7,7 +7,7 @@
 #include <algorithm>
 #include <string>
 
-#include "platform/instrumentation/JsonTree.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 #include "tests/host/cli/Program.h"
 #include "tests/host/hwloc/HwlocXml.h"
 

@@ -3,9 +3,9 @@
 #include <cstdlib>
 
 #include "host/hwloc/HwlocSource.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/JsonTree.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 
 namespace Corvcim::Testing {
 namespace {

@@ -7,8 +7,8 @@
 #include "host/hwloc/HwlocConversion.h"
 #include "host/hwloc/HwlocSource.h"
 #include "host/hwloc/HwlocTopology.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/PropertyTable.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 #include "tests/host/hwloc/HwlocXml.h"
 
 namespace Corvcim::Testing {

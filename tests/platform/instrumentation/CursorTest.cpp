@@ -4,7 +4,7 @@
 #include <algorithm>
 
 #include "platform/instrumentation/ProcessTree.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 
 namespace Tarn {
 namespace {

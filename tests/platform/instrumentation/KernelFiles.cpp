@@ -2,9 +2,9 @@
 
 #include <stdexcept>
 
-#include "platform/instrumentation/FirmwareTables.h"
-#include "platform/instrumentation/LiveSource.h"
-#include "platform/instrumentation/Paths.h"
+#include "platform/instrumentation/firmware/FirmwareTables.h"
+#include "platform/instrumentation/live/LiveSource.h"
+#include "platform/instrumentation/tree/Paths.h"
 
 namespace Tarn::Inventory {
 

@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
-#include "platform/instrumentation/MemoryFileSystem.h"
-#include "platform/instrumentation/Tree.h"
+#include "platform/instrumentation/files/MemoryFileSystem.h"
+#include "platform/instrumentation/tree/Tree.h"
 #include "tests/support/SmbiosEncoder.h"
 
 namespace Tarn::Inventory {

@@ -8,9 +8,9 @@
 #include <latch>
 #include <thread>
 
-#include "platform/instrumentation/Error.h"
 #include "platform/instrumentation/Source.h"
-#include "platform/instrumentation/TreeBuilder.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/platform/instrumentation/Scratch.h"
 
 namespace Tarn::Inventory {

@@ -10,11 +10,11 @@
 #include <filesystem>
 #include <fstream>
 
-#include "platform/instrumentation/Archive.h"
-#include "platform/instrumentation/Error.h"
-#include "platform/instrumentation/JsonTree.h"
-#include "platform/instrumentation/LiveSource.h"
-#include "platform/instrumentation/RecordingFileSystem.h"
+#include "platform/instrumentation/files/Archive.h"
+#include "platform/instrumentation/files/RecordingFileSystem.h"
+#include "platform/instrumentation/live/LiveSource.h"
+#include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/JsonTree.h"
 #include "tests/platform/instrumentation/Scratch.h"
 #include "tests/support/SmbiosEncoder.h"
 

@@ -6,7 +6,7 @@
 #include <regex>
 #include <set>
 
-#include "platform/instrumentation/Utf8.h"
+#include "platform/instrumentation/tree/Utf8.h"
 
 namespace {
 

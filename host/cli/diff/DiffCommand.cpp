@@ -1,0 +1,129 @@
+#include "host/cli/diff/DiffCommand.h"
+
+#include <algorithm>
+
+#include "host/cli/InventoryText.h"
+#include "host/cli/diff/DiffText.h"
+#include "host/cli/diff/InventoryDiff.h"
+#include "host/cli/results/JsonBuilder.h"
+#include "platform/instrumentation/Source.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::Tree;
+using Tarn::Inventory::Unread;
+
+void checkIgnored(const std::vector<std::string>& ignored) {
+  const std::vector<std::string_view> known = fieldNames();
+  for (const std::string& name : ignored) {
+    if (std::ranges::find(known, name) != known.end()) {
+      continue;
+    }
+    std::string text = "diff: '--ignore' names no field of an inventory: '" + name + "'; there are";
+    for (const std::string_view field : known) {
+      text.append(field == known.front() ? " " : ", ").append(field);
+    }
+    throw UsageError(text);
+  }
+}
+
+/// A file's name on its machine: that of a captured one has the capture's directory before it.
+std::string_view onItsMachine(std::string_view file) {
+  for (const std::string_view top : {"/sys/", "/proc/"}) {
+    if (const std::size_t at = file.rfind(top); at != std::string_view::npos) {
+      return file.substr(at);
+    }
+  }
+  return file;
+}
+
+bool isSame(const Unread& a, const Unread& b) {
+  return onItsMachine(a.file) == onItsMachine(b.file) && a.reason == b.reason;
+}
+
+std::vector<Unread> unreadInOne(const Tree& one, const Tree& other) {
+  std::vector<Unread> entries;
+  std::ranges::copy_if(one.unread(), std::back_inserter(entries), [&](const Unread& entry) {
+    return std::ranges::none_of(other.unread(), [&](const Unread& each) { return isSame(entry, each); });
+  });
+  return entries;
+}
+
+struct Difference {
+  const Options& options;
+  const Tree& before;
+  const Tree& after;
+  std::vector<NodeChange> changes;
+};
+
+std::string asText(const Difference& difference) {
+  if (difference.changes.empty()) {
+    return "No differences.\n";
+  }
+  std::string text = writeDiffText(difference.before, difference.after, difference.changes);
+  // A value may differ for the sole reason that one of them was not allowed to read it.
+  for (const std::string& section :
+       {writeUnread(unreadInOne(difference.before, difference.after), "Not read in A alone"),
+        writeUnread(unreadInOne(difference.after, difference.before), "Not read in B alone")}) {
+    text += section.empty() ? "" : '\n' + section;
+  }
+  return text;
+}
+
+void writeChange(JsonBuilder& json, const Difference& difference, const NodeChange& change) {
+  const auto& node = change.isRemoved() ? difference.before.node(change.before) : difference.after.node(change.after);
+  json.beginObject();
+  json.member("path", change.path);
+  json.member("type", Tarn::Inventory::nodeTypeName(node.type));
+  json.member("change", change.isRemoved() ? "removed" : change.isAdded() ? "added" : "changed");
+  json.key("fields");
+  json.beginObject();
+  for (const FieldChange& field : change.fields) {
+    json.key(field.name);
+    json.beginObject();
+    json.key("a");
+    writeFieldValue(json, field.before);
+    json.key("b");
+    writeFieldValue(json, field.after);
+    json.endObject();
+  }
+  json.endObject();
+  json.endObject();
+}
+
+std::string asJson(const Difference& difference) {
+  JsonBuilder json;
+  json.beginObject();
+  json.member("format", "corvane-inventory-diff");
+  json.key("version");
+  json.number(std::uint64_t{1});
+  json.member("a", difference.options.target);
+  json.member("b", difference.options.secondTarget);
+  json.key("equal");
+  json.boolean(difference.changes.empty());
+  json.key("changes");
+  json.beginArray();
+  for (const NodeChange& change : difference.changes) {
+    writeChange(json, difference, change);
+  }
+  json.endArray();
+  writeUnreadMember(json, "unreadInA", unreadInOne(difference.before, difference.after));
+  writeUnreadMember(json, "unreadInB", unreadInOne(difference.after, difference.before));
+  json.endObject();
+  return json.take();
+}
+
+}  // namespace
+
+Outcome diffInventories(const Options& options) {
+  checkIgnored(options.ignoredFields);
+  const Tree before = Tarn::Inventory::loadInventory(options.target);
+  const Tree after = Tarn::Inventory::loadInventory(options.secondTarget);
+  const Difference difference{options, before, after, compareInventories(before, after, options.ignoredFields)};
+  const std::string output = options.format == Format::Json ? asJson(difference) : asText(difference);
+  return {output, {}, !difference.changes.empty()};
+}
+
+}  // namespace Corvcim

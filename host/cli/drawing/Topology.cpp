@@ -1,0 +1,361 @@
+#include "host/cli/drawing/Topology.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+#include <utility>
+
+#include "host/cli/Quantities.h"
+#include "host/cli/Text.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::CpuSet;
+using Tarn::Inventory::Node;
+using Tarn::Inventory::NodeIndex;
+using Tarn::Inventory::Tree;
+namespace Lexicon = Tarn::NodeLexicon;
+
+unsigned int numberOf(const Tree& tree, const Node& node, Lexicon::Properties id) {
+  const unsigned int* value = tree.number(node, id);
+  return value == nullptr ? 0 : *value;
+}
+
+std::string textOf(const Tree& tree, const Node& node, Lexicon::Properties id) {
+  const std::string* value = tree.text(node, id);
+  return value == nullptr ? std::string() : toPrintable(*value);
+}
+
+/// Depth of a cache level in a drawing: L1 is nearest to the core; what has no level is outermost.
+constexpr unsigned int outermostDepth = 4;
+
+struct Level {
+  unsigned int code;
+  unsigned int depth;
+  std::string_view name;
+};
+
+constexpr std::array<Level, 3> levels = {{{3, 1, "L1"}, {4, 2, "L2"}, {5, 3, "L3"}}};
+
+unsigned int depthOf(unsigned int levelCode) {
+  const auto* const level = std::ranges::find(levels, levelCode, &Level::code);
+  return level == levels.end() ? outermostDepth : level->depth;
+}
+
+std::string cacheName(unsigned int levelCode, unsigned int typeCode, const std::string& givenName) {
+  const auto* const level = std::ranges::find(levels, levelCode, &Level::code);
+  if (level == levels.end()) {
+    return givenName.empty() ? "cache" : givenName;
+  }
+  constexpr unsigned int instruction = 1;
+  constexpr unsigned int data = 2;
+  const std::string_view suffix = typeCode == instruction ? "i" : typeCode == data ? "d" : "";
+  return std::string(level->name).append(suffix);
+}
+
+struct CacheNode {
+  CacheUnit unit;
+  unsigned int depth;
+  CpuSet cpus;
+};
+
+CacheNode readCache(const Tree& tree, const Node& node) {
+  const unsigned int level = numberOf(tree, node, Lexicon::PropCacheLevel);
+  CacheNode cache;
+  cache.unit.name =
+      cacheName(level, numberOf(tree, node, Lexicon::PropCacheType), textOf(tree, node, Lexicon::PropCacheName));
+  cache.unit.size = std::uint64_t{numberOf(tree, node, Lexicon::PropCacheBlockSize)} *
+                    numberOf(tree, node, Lexicon::PropCacheNumberOfBlocks);
+  cache.unit.status = node.status;
+  cache.depth = depthOf(level);
+  cache.cpus = node.cpus;
+  return cache;
+}
+
+bool isWithin(const CpuSet& inner, const CpuSet& outer) {
+  if (!outer.contains(inner.first())) {
+    return inner.empty();
+  }
+  CpuSet rest = inner;
+  rest.remove(outer);
+  return rest.empty();
+}
+
+/// Shared caches from the outside in, those of the same cores as one row.
+struct CacheRow {
+  std::vector<CacheUnit> caches;
+  unsigned int depth;
+  CpuSet cpus;
+};
+
+void sortByCpu(std::vector<TopologyPart>& parts) {
+  std::ranges::stable_sort(parts, {}, [](const TopologyPart& part) { return part.cpus.first(); });
+}
+
+/// Nests rows and cores by who lies within whom. `rows` are sorted from the outside in.
+class Nesting {
+ public:
+  Nesting(std::vector<CacheRow> rows, std::vector<TopologyPart> cores)
+      : rows_(std::move(rows)), cores_(std::move(cores)), isPlaced_(cores_.size(), false) {}
+
+  std::vector<TopologyPart> build() {
+    std::vector<TopologyPart> parts = partsWithin(0, nullptr);
+    sortByCpu(parts);
+    return parts;
+  }
+
+  /// Caches that no core was found for, after build().
+  std::vector<CacheUnit> takeUnplaced() { return std::move(unplaced_); }
+
+ private:
+  std::vector<TopologyPart> partsWithin(std::size_t firstRow, const CpuSet* bounds) {
+    std::vector<TopologyPart> parts;
+    for (std::size_t i = firstRow; i < rows_.size(); ++i) {
+      if (rows_[i].caches.empty() || (bounds != nullptr && !isWithin(rows_[i].cpus, *bounds))) {
+        continue;
+      }
+      addSharedCaches(parts, i);
+    }
+    for (std::size_t i = 0; i < cores_.size(); ++i) {
+      if (!isPlaced_[i] && (bounds == nullptr || (!cores_[i].cpus.empty() && isWithin(cores_[i].cpus, *bounds)))) {
+        isPlaced_[i] = true;
+        parts.push_back(std::move(cores_[i]));
+      }
+    }
+    return parts;
+  }
+
+  void addSharedCaches(std::vector<TopologyPart>& parts, std::size_t row) {
+    TopologyPart part;
+    part.caches = std::exchange(rows_[row].caches, {});
+    part.cpus = rows_[row].cpus;
+    part.parts = partsWithin(row + 1, &part.cpus);
+    if (part.parts.empty()) {
+      unplaced_.insert(unplaced_.end(), part.caches.begin(), part.caches.end());
+      return;
+    }
+    sortByCpu(part.parts);
+    part.coreCount = 0;
+    for (const TopologyPart& inner : part.parts) {
+      part.coreCount += inner.coreCount;
+      part.level = std::max(part.level, inner.level + 1);
+    }
+    parts.push_back(std::move(part));
+  }
+
+  std::vector<CacheRow> rows_;  // a row's caches are taken out when it is placed
+  std::vector<TopologyPart> cores_;
+  std::vector<bool> isPlaced_;
+  std::vector<CacheUnit> unplaced_;
+};
+
+void sortFromOutside(std::vector<CacheNode>& caches) {
+  std::ranges::stable_sort(caches, [](const CacheNode& left, const CacheNode& right) {
+    return left.depth != right.depth ? left.depth > right.depth : left.unit.name < right.unit.name;
+  });
+}
+
+/// Caches of the same level and the same CPUs become one row.
+void addToRows(std::vector<CacheRow>& rows, const CacheNode& cache) {
+  const auto row = std::ranges::find_if(
+      rows, [&](const CacheRow& other) { return other.depth == cache.depth && other.cpus == cache.cpus; });
+  if (row != rows.end()) {
+    row->caches.push_back(cache.unit);
+    return;
+  }
+  rows.push_back({{cache.unit}, cache.depth, cache.cpus});
+}
+
+TopologyPart* onlyUser(std::vector<TopologyPart>& cores, const CpuSet& cpus) {
+  for (TopologyPart& core : cores) {
+    if (isWithin(cpus, core.cpus)) {
+      return &core;
+    }
+  }
+  return nullptr;
+}
+
+void readParts(TopologyProcessor& processor, std::vector<CacheNode> caches, std::vector<TopologyPart> cores) {
+  sortFromOutside(caches);
+  std::vector<CacheRow> rows;
+  for (const CacheNode& cache : caches) {
+    if (cache.cpus.empty()) {
+      processor.otherCaches.push_back(cache.unit);
+    } else if (TopologyPart* core = onlyUser(cores, cache.cpus)) {
+      core->caches.push_back(cache.unit);
+    } else {
+      addToRows(rows, cache);
+    }
+  }
+  Nesting nesting(std::move(rows), std::move(cores));
+  processor.parts = nesting.build();
+  const std::vector<CacheUnit> unplaced = nesting.takeUnplaced();
+  processor.otherCaches.insert(processor.otherCaches.end(), unplaced.begin(), unplaced.end());
+}
+
+TopologyProcessor readProcessor(const Tree& tree, NodeIndex index) {
+  const Node& node = tree.node(index);
+  TopologyProcessor processor;
+  processor.path = node.path();
+  processor.name = textOf(tree, node, Lexicon::PropProcessorName);
+  processor.status = node.status;
+  processor.maxClock = numberOf(tree, node, Lexicon::PropMaxClockSpeed);
+  processor.threadCount = numberOf(tree, node, Lexicon::PropHardwareThreads);
+  std::vector<CacheNode> caches;
+  std::vector<TopologyPart> cores;
+  for (NodeIndex i = index + 1; i < node.end; ++i) {
+    const Node& part = tree.node(i);
+    if (part.type == Lexicon::NodeCacheMemory) {
+      caches.push_back(readCache(tree, part));
+    } else if (part.type == Lexicon::NodeProcessorCore) {
+      TopologyPart core;
+      core.corePath = part.path();
+      core.status = part.status;
+      core.cpus = part.cpus;
+      cores.push_back(std::move(core));
+    }
+  }
+  processor.coreCount = cores.size();
+  readParts(processor, std::move(caches), std::move(cores));
+  return processor;
+}
+
+void collectCores(std::span<const TopologyPart> parts, std::vector<const TopologyPart*>& cores) {
+  for (const TopologyPart& part : parts) {
+    if (part.isCore()) {
+      cores.push_back(&part);
+    } else {
+      collectCores(part.parts, cores);
+    }
+  }
+}
+
+}  // namespace
+
+std::string CacheUnit::label() const {
+  return size == 0 ? name : name + ' ' + formatBytes(size);
+}
+
+std::string stateNote(unsigned int status) {
+  namespace Status = Tarn::Inventory::Status;
+  switch (status) {
+    case Status::inUse:
+      return "";
+    case Status::offline:
+      return "offline";
+    case Status::emptySocket:
+      return "empty socket";
+    case Status::disabled:
+      return "disabled";
+    case Status::failed:
+      return "failed";
+    default:
+      return "status " + std::to_string(status);
+  }
+}
+
+std::string cpuListText(const CpuSet& cpus) {
+  if (cpus.empty()) {
+    return "";
+  }
+  return (cpus.count() == 1 ? "CPU " : "CPUs ") + cpus.toList();
+}
+
+std::string labelsOf(std::span<const CacheUnit> caches) {
+  std::string text;
+  while (!caches.empty()) {
+    std::size_t equal = 1;
+    while (equal < caches.size() && caches[equal] == caches.front()) {
+      ++equal;
+    }
+    const std::string note = stateNote(caches.front().status);
+    text += text.empty() ? "" : ", ";
+    text += equal == 1 ? "" : std::to_string(equal) + " × ";
+    text += caches.front().label();
+    text += note.empty() ? "" : " (" + note + ')';
+    caches = caches.subspan(equal);
+  }
+  return text;
+}
+
+std::vector<std::string> factsOf(const TopologyProcessor& processor) {
+  std::vector<std::string> facts;
+  if (processor.coreCount != 0) {
+    facts.push_back(counted(processor.coreCount, "core"));
+  }
+  if (processor.threadCount != 0) {
+    facts.push_back(counted(processor.threadCount, "thread"));
+  }
+  if (processor.maxClock != 0) {
+    facts.push_back("up to " + formatMegahertz(processor.maxClock));
+  }
+  if (std::string note = stateNote(processor.status); !note.empty()) {
+    facts.push_back(std::move(note));
+  }
+  return facts;
+}
+
+std::string summaryOf(const Topology& topology) {
+  std::size_t threads = 0;
+  for (const TopologyProcessor& processor : topology.processors) {
+    threads += processor.threadCount;
+  }
+  std::string summary = topology.model;
+  const auto add = [&summary](const std::string& fact) { summary += (summary.empty() ? "" : " · ") + fact; };
+  add(counted(topology.processors.size(), "processor"));
+  add(counted(topology.coreCount(), "core"));
+  if (threads != 0) {
+    add(counted(threads, "thread"));
+  }
+  return summary;
+}
+
+std::size_t Topology::coreCount() const {
+  std::size_t count = 0;
+  for (const TopologyProcessor& processor : processors) {
+    count += processor.coreCount;
+  }
+  return count;
+}
+
+Topology readTopology(const Tree& tree, std::string_view systemName) {
+  Topology topology;
+  topology.systemName = toPrintable(systemName);
+  for (const NodeIndex index : tree.ofType(Lexicon::NodeSystem)) {
+    topology.model = textOf(tree, tree.node(index), Lexicon::PropSystemModel);
+  }
+  for (const NodeIndex index : tree.ofType(Lexicon::NodeProcessor)) {
+    topology.processors.push_back(readProcessor(tree, index));
+  }
+  return topology;
+}
+
+bool hasSameShape(const TopologyPart& left, const TopologyPart& right, States states) {
+  return left.caches == right.caches && (states == States::Ignored || left.status == right.status) &&
+         left.cpus.count() == right.cpus.count() &&
+         std::ranges::equal(left.parts, right.parts, [states](const TopologyPart& one, const TopologyPart& other) {
+           return hasSameShape(one, other, states);
+         });
+}
+
+std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts, States states) {
+  std::vector<PartRun> runs;
+  while (!parts.empty()) {
+    std::size_t length = 1;
+    while (length < parts.size() && hasSameShape(parts.front(), parts[length], states)) {
+      ++length;
+    }
+    runs.push_back(parts.first(length));
+    parts = parts.subspan(length);
+  }
+  return runs;
+}
+
+std::vector<const TopologyPart*> coresOf(std::span<const TopologyPart> parts) {
+  std::vector<const TopologyPart*> cores;
+  collectCores(parts, cores);
+  return cores;
+}
+
+}  // namespace Corvcim

@@ -1,0 +1,122 @@
+#include "host/cli/drawing/TreeOutline.h"
+
+#include <utility>
+
+#include "host/cli/Quantities.h"
+#include "host/cli/Text.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::CpuSet;
+using Kind = OutlineItem::Kind;
+
+/// Up to so many cores each one has an item of its own.
+constexpr std::size_t fewCores = 16;
+
+void addDetail(OutlineItem& item, std::string detail) {
+  if (!detail.empty()) {
+    item.details.push_back(std::move(detail));
+  }
+}
+
+void addState(OutlineItem& item, unsigned int status) {
+  item.isInUse = status == Tarn::Inventory::Status::inUse;
+  addDetail(item, stateNote(status));
+}
+
+OutlineItem coreItem(const TopologyPart& core) {
+  OutlineItem item = {Kind::Core, "core " + core.corePath, {}, true, {}};
+  addDetail(item, cpuListText(core.cpus));
+  addDetail(item, labelsOf(core.caches));
+  addState(item, core.status);
+  return item;
+}
+
+std::string eachHas(const TopologyPart& core) {
+  const std::size_t threads = core.cpus.count();
+  std::string text = threads == 0 ? "" : counted(threads, "thread");
+  if (!core.caches.empty()) {
+    text += (text.empty() ? "" : ", ") + labelsOf(core.caches);
+  }
+  return text.empty() ? text : "each " + text;
+}
+
+CpuSet cpusOf(PartRun run) {
+  CpuSet cpus;
+  for (const TopologyPart& part : run) {
+    cpus.add(part.cpus);
+  }
+  return cpus;
+}
+
+OutlineItem coreRunItem(PartRun run) {
+  const TopologyPart& first = run.front();
+  const std::string label = counted(run.size(), "core") + ' ' + first.corePath + " to " + run.back().corePath;
+  OutlineItem item = {Kind::Core, label, {}, true, {}};
+  addDetail(item, cpuListText(cpusOf(run)));
+  addDetail(item, eachHas(first));
+  addState(item, first.status);
+  return item;
+}
+
+std::vector<OutlineItem> partItems(std::span<const TopologyPart> parts, bool isCompact);
+
+OutlineItem sharedItem(const TopologyPart& part, bool isCompact) {
+  return {Kind::Cache,
+          labelsOf(part.caches),
+          {"shared by " + counted(part.coreCount, "core")},
+          true,
+          partItems(part.parts, isCompact)};
+}
+
+OutlineItem sharedRunItem(PartRun run, bool isCompact) {
+  const TopologyPart& first = run.front();
+  return {Kind::Cache,
+          std::to_string(run.size()) + " × " + labelsOf(first.caches),
+          {"each shared by " + counted(first.coreCount, "core"), "the first:"},
+          true,
+          partItems(first.parts, isCompact)};
+}
+
+std::vector<OutlineItem> partItems(std::span<const TopologyPart> parts, bool isCompact) {
+  std::vector<OutlineItem> items;
+  for (const PartRun run : runsOfShape(parts)) {
+    if (isCompact && run.size() > 1) {
+      items.push_back(run.front().isCore() ? coreRunItem(run) : sharedRunItem(run, isCompact));
+      continue;
+    }
+    for (const TopologyPart& part : run) {
+      items.push_back(part.isCore() ? coreItem(part) : sharedItem(part, isCompact));
+    }
+  }
+  return items;
+}
+
+OutlineItem processorItem(const TopologyProcessor& processor, bool isCompact) {
+  OutlineItem item = {Kind::Processor, "processor " + processor.path, {}, true, {}};
+  addDetail(item, processor.name);
+  for (std::string& detail : factsOf(processor)) {
+    addDetail(item, std::move(detail));
+  }
+  item.isInUse = processor.status == Tarn::Inventory::Status::inUse;
+  item.below = partItems(processor.parts, isCompact);
+  if (!processor.otherCaches.empty()) {
+    item.below.push_back({Kind::Note, labelsOf(processor.otherCaches), {"sharing not known"}, true, {}});
+  }
+  return item;
+}
+
+}  // namespace
+
+OutlineItem outlineOf(const Topology& topology) {
+  const bool isCompact = topology.coreCount() > fewCores;
+  OutlineItem system = {Kind::System, topology.systemName, {}, true, {}};
+  addDetail(system, topology.model);
+  for (const TopologyProcessor& processor : topology.processors) {
+    system.below.push_back(processorItem(processor, isCompact));
+  }
+  return system;
+}
+
+}  // namespace Corvcim

@@ -1,0 +1,17 @@
+#ifndef HOST_CLI_DRAWING_TREETEXT_H
+#define HOST_CLI_DRAWING_TREETEXT_H
+
+#include <cstddef>
+#include <string>
+
+#include "host/cli/drawing/Topology.h"
+
+namespace Corvcim {
+
+/// The topology as a tree of lines. On machines with many cores, neighbours of the same shape share
+/// one line. `width` is the terminal's, where longer lines are cut; 0 for no limit.
+std::string drawTreeText(const Topology& topology, std::size_t width);
+
+}  // namespace Corvcim
+
+#endif

@@ -1,0 +1,77 @@
+#include "host/cli/explain/ExplainCommand.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "host/broker/Dispatcher.h"
+#include "host/broker/Names.h"
+#include "host/cli/Options.h"
+#include "host/cli/explain/Explanation.h"
+#include "host/cli/explain/ExplanationWriters.h"
+#include "platform/instrumentation/ProcessTree.h"
+#include "platform/instrumentation/Source.h"
+
+namespace Corvcim {
+namespace {
+
+using Tarn::Inventory::Tree;
+
+/// Every name must be that of a property, or of the inventory's field that it comes from, in one of the
+/// classes that are explained.
+void checkSelection(const std::vector<std::string>& selection, const std::vector<ExplanationTarget>& targets) {
+  std::vector<const PropertySource*> sources;
+  for (const PropertySource& source : propertySources()) {
+    if (std::ranges::find(targets, source.className, &ExplanationTarget::className) != targets.end()) {
+      sources.push_back(&source);
+    }
+  }
+  for (const std::string& name : selection) {
+    const bool isKnown = std::ranges::any_of(sources, [&](const PropertySource* source) {
+      return sameName(source->property, name) || sameName(source->field, name);
+    });
+    if (isKnown) {
+      continue;
+    }
+    std::vector<std::string_view> known;
+    std::string text = "explain: no property '";
+    text.append(name).append("'; there are");
+    for (const PropertySource* source : sources) {
+      if (std::ranges::find(known, source->property) == known.end()) {
+        text.append(known.empty() ? " " : ", ").append(source->property);
+        known.push_back(source->property);
+      }
+    }
+    throw UsageError(text);
+  }
+}
+
+}  // namespace
+
+Outcome explainValues(const LibraryFiles& files, const Options& options) {
+  const std::string source = Tarn::Inventory::chosenSource();
+  const Tree tree = Tarn::Inventory::loadInventory(source, Tarn::Inventory::Detail::WithOrigins);
+  const std::vector<ExplanationTarget> targets = explanationTargets(tree, options.target);
+  checkSelection(options.properties, targets);
+
+  Dispatcher dispatcher(files);
+  Explainer explainer(tree, dispatcher, options.nameSpace);
+  std::vector<ExplainedInstance> instances;
+  for (const ExplanationTarget& target : targets) {
+    ExplainedInstance explained = explainer.explain(target, options.properties);
+    if (!explained.properties.empty()) {
+      instances.push_back(std::move(explained));
+    }
+  }
+  Outcome outcome;
+  outcome.errors = explainer.failures();
+  if (options.format == Format::Json) {
+    outcome.output = writeExplanationsAsJson(tree, instances, source);
+  } else if (options.target.empty()) {
+    outcome.output = writeShortExplanations(tree, instances);
+  } else {
+    outcome.output = writeExplanations(tree, instances);
+  }
+  return outcome;
+}
+
+}  // namespace Corvcim

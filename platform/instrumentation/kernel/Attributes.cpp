@@ -1,0 +1,37 @@
+#include "platform/instrumentation/kernel/Attributes.h"
+
+#include <algorithm>
+
+namespace Tarn::Inventory {
+
+// Both leave room for the terminating zero; a path that did not fit names no file.
+char* Attributes::append(char* end, std::string_view part) {
+  const auto room = static_cast<std::size_t>(path_.data() + path_.size() - 1 - end);
+  return std::copy_n(part.data(), std::min(part.size(), room), end);
+}
+
+char* Attributes::append(char* end, unsigned int part) {
+  const auto [after, error] = std::to_chars(end, path_.data() + path_.size() - 1, part);
+  return error == std::errc() ? after : end;
+}
+
+std::optional<std::string_view> Attributes::read(const char* path) {
+  error_ = files_.read(path, contents_);
+  if (error_ != 0) {
+    return std::nullopt;
+  }
+  // The device tree ends its texts with a zero.
+  constexpr std::string_view white(" \t\n\0", 4);
+  const std::string_view value = contents_;
+  const std::size_t first = value.find_first_not_of(white);
+  return first == std::string_view::npos ? std::string_view()
+                                         : value.substr(first, value.find_last_not_of(white) - first + 1);
+}
+
+std::optional<unsigned int> Attributes::toNumber(std::string_view text) {
+  unsigned int number = 0;
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+  return error == std::errc() && end == text.data() + text.size() ? std::optional(number) : std::nullopt;
+}
+
+}  // namespace Tarn::Inventory

@@ -1,0 +1,35 @@
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_CPUIDENTITY_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_CPUIDENTITY_H
+
+#include <optional>
+#include <string>
+
+#include "platform/instrumentation/kernel/ArmParts.h"
+#include "platform/instrumentation/kernel/CimFamily.h"
+#include "platform/instrumentation/kernel/CpuInfo.h"
+
+namespace Tarn::Inventory {
+
+enum class Architecture { Unknown, X86, Arm, PowerPc, S390, RiscV, LoongArch };
+
+/// What /proc/cpuinfo says of one logical CPU, in one form for all architectures. A text is empty, and a
+/// number absent, where it does not say.
+struct CpuIdentity {
+  Architecture architecture = Architecture::Unknown;
+  std::string vendor;
+  std::string name;
+  std::string stepping;
+  std::string processorId;  ///< the identification register, as SMBIOS writes it: bytes in memory order
+  unsigned int family = CimFamily::unknown;
+  const FamilyRow* familyRow = nullptr;    ///< the row that told the family, if one did
+  const ArmPart* armPart = nullptr;        ///< the design that told name and family, if it is known
+  std::optional<unsigned int> width;       ///< bits of a general register
+  std::optional<unsigned int> clockSpeed;  ///< MHz at this moment
+  bool hypervisor = false;                 ///< it says itself that it is virtual
+};
+
+CpuIdentity identifyCpu(const CpuInfo& info, unsigned int cpu);
+
+}  // namespace Tarn::Inventory
+
+#endif

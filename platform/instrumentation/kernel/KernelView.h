@@ -1,0 +1,40 @@
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_KERNELVIEW_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_KERNELVIEW_H
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/instrumentation/kernel/Caches.h"
+#include "platform/instrumentation/kernel/CoreKinds.h"
+#include "platform/instrumentation/kernel/Machine.h"
+#include "platform/instrumentation/kernel/Topology.h"
+
+namespace Tarn::Inventory {
+
+/// What the kernel tells of the machine's parts, read once.
+struct KernelView {
+  explicit KernelView(Machine& whole);
+
+  /// The caches that stand below the package: a cache belongs to the processor of its lowest CPU, also
+  /// where several processors share it.
+  std::vector<const Cache*> cachesOf(const Package& package) const;
+
+  bool isOnline(const CpuSet& cpus) const { return cpus.intersects(topology.online); }
+
+  /// The state of a part with these CPUs, and where that comes from.
+  unsigned int statusOf(const CpuSet& cpus) const;
+  Origin statusOrigin(const CpuSet& cpus) const;
+
+  Machine& machine;
+  const Topology topology;
+  const std::vector<CoreKind> kinds;
+  const std::vector<Cache> caches;
+};
+
+/// The kind of part and its number, which its path ends with: "L2 cache 3", "Core at CPU 8".
+std::string describeByPath(const std::string& label, std::string_view path);
+
+}  // namespace Tarn::Inventory
+
+#endif

@@ -1,0 +1,109 @@
+#include "platform/instrumentation/kernel/Machine.h"
+
+#include <array>
+#include <cerrno>
+#include <utility>
+
+namespace Tarn::Inventory {
+
+namespace {
+
+constexpr const char* cpuInfoFile = "proc/cpuinfo";
+constexpr const char* cpuDirectoryPath = "sys/devices/system/cpu";
+
+std::string reasonOf(FileError error) {
+  return error == 0 ? "it holds no usable value" : describeError(error);
+}
+
+std::string remedyOf(FileError error, const std::string& otherwise) {
+  return error == EACCES || error == EPERM ? "run as root, or let this process read it" : otherwise;
+}
+
+std::string attributeOf(unsigned int cpu, std::string_view suffix) {
+  return std::string(cpuDirectoryPath) + "/cpu" + std::to_string(cpu) + '/' + std::string(suffix);
+}
+
+std::string trimmed(std::string_view text) {
+  constexpr std::string_view white(" \t\n\0", 4);
+  const std::size_t first = text.find_first_not_of(white);
+  return first == std::string_view::npos ? std::string()
+                                         : std::string(text.substr(first, text.find_last_not_of(white) - first + 1));
+}
+
+// "name: value", or of a field's words "name: word" or "name: without word".
+std::string fieldText(const CpuInfo& info, unsigned int cpu, std::string_view field) {
+  const std::size_t slash = field.find('/');
+  const std::string_view name = field.substr(0, slash);
+  const std::string value(info.field(cpu, name));
+  if (slash == std::string_view::npos || value.empty()) {
+    return std::string(name) + ": " + (value.empty() ? "(not there)" : value);
+  }
+  const std::string word(field.substr(slash + 1));
+  const bool has = (' ' + value + ' ').find(' ' + word + ' ') != std::string::npos;
+  return std::string(name) + ": " + (has ? "" : "without ") + word;
+}
+
+}  // namespace
+
+Machine::Machine(FileSystem& root, Detail detail)
+    : detail_(detail),
+      recorder_(detail == Detail::WithOrigins ? std::make_unique<RecordingFileSystem>(root, record_) : nullptr),
+      cpuDirectory_((recorder_ ? *recorder_ : root).below(cpuDirectoryPath)),
+      root_(recorder_ ? *recorder_ : root),
+      cpus_(*cpuDirectory_) {
+  std::string text;
+  if (const FileError error = root_.files().read(cpuInfoFile, text)) {
+    noteUnread(root.nameOf(cpuInfoFile), error, "mount proc on /proc");
+  }
+  cpuInfo_ = CpuInfo(std::move(text));
+}
+
+void Machine::noteUnread(const std::string& file, FileError error, const std::string& remedy) {
+  unread_.add(file, reasonOf(error), remedyOf(error, remedy));
+}
+
+void Machine::noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, const std::string& remedy) {
+  noteUnreadOfCpu(cpu, suffix, reasonOf(cpus_.error()), remedyOf(cpus_.error(), remedy));
+}
+
+void Machine::noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, const std::string& reason,
+                              const std::string& remedy) {
+  unread_.addForCpu(cpuDirectory_->nameOf("cpu"), cpu, '/' + suffix, reason, remedy);
+}
+
+Origin Machine::originIn(const std::string& file, std::string rule) const {
+  return {root_.files().nameOf(file), rawOf(file), std::move(rule)};
+}
+
+Origin Machine::originOfCpu(unsigned int cpu, std::string_view suffix, std::string rule) const {
+  return originIn(attributeOf(cpu, suffix), std::move(rule));
+}
+
+Origin Machine::originOfCpus(const CpuSet& cpus, std::span<const std::string_view> suffixes, std::string_view field,
+                             std::string rule) const {
+  const auto hasField = [&](unsigned int cpu) { return !cpuInfo_.field(cpu, field).empty(); };
+  for (const std::string_view suffix : suffixes) {
+    for (unsigned int cpu = cpus.first(); cpu != CpuSet::limit; cpu = cpus.next(cpu)) {
+      if (!rawOf(attributeOf(cpu, suffix)).empty()) {
+        return originOfCpu(cpu, suffix, std::move(rule));
+      }
+    }
+  }
+  return !field.empty() && hasField(cpus.first()) ? originInCpuInfo(cpus.first(), std::array{field}, std::move(rule))
+                                                  : originOfCpu(cpus.first(), suffixes.front(), std::move(rule));
+}
+
+Origin Machine::originInCpuInfo(unsigned int cpu, std::span<const std::string_view> fields, std::string rule) const {
+  std::string raw;
+  for (const std::string_view field : fields) {
+    raw += (raw.empty() ? "" : "; ") + fieldText(cpuInfo_, cpu, field);
+  }
+  return {root_.files().nameOf(cpuInfoFile) + ", processor " + std::to_string(cpu), std::move(raw), std::move(rule)};
+}
+
+std::string Machine::rawOf(const std::string& file) const {
+  const auto found = record_.files.find(file);
+  return found == record_.files.end() ? std::string() : trimmed(found->second.contents);
+}
+
+}  // namespace Tarn::Inventory

@@ -1,0 +1,27 @@
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_SYSTEMMODEL_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_SYSTEMMODEL_H
+
+#include <string>
+#include <string_view>
+
+#include "platform/instrumentation/kernel/Machine.h"
+#include "platform/instrumentation/tree/Facts.h"
+
+namespace Tarn::Inventory {
+
+/// What the kernel says of the computer: its model (the firmware's product name, else the device tree's
+/// model) and its maker. Where there is no model, and `firmware`, which the tables told, has none either:
+/// "Virtual Machine", if the kernel says that it runs under a hypervisor. `firmware` is nullptr where
+/// there are no tables. The origins look into the machine, which must outlive them.
+Facts readSystemFacts(Machine& machine, const Facts* firmware);
+
+/// A text of the firmware's without the blanks around it, and with a blank for each control character: those
+/// can not stand in the XML that brokers send.
+std::string plainText(std::string_view text);
+
+/// Whether a text is what firmware vendors leave in a field that they did not fill in.
+bool isPlaceholder(std::string_view text);
+
+}  // namespace Tarn::Inventory
+
+#endif

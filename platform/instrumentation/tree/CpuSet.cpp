@@ -1,0 +1,155 @@
+#include "platform/instrumentation/tree/CpuSet.h"
+
+#include <algorithm>
+#include <bit>
+#include <charconv>
+
+namespace Tarn::Inventory {
+
+namespace {
+
+std::optional<unsigned int> takeNumber(std::string_view& text) {
+  unsigned int number = 0;
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+  if (error != std::errc() || number >= CpuSet::limit) {
+    return std::nullopt;
+  }
+  text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+  return number;
+}
+
+bool take(std::string_view& text, char c) {
+  if (text.empty() || text.front() != c) {
+    return false;
+  }
+  text.remove_prefix(1);
+  return true;
+}
+
+std::string_view trimmed(std::string_view text) {
+  const std::string_view white = " \t\n";
+  const std::size_t first = text.find_first_not_of(white);
+  return first == std::string_view::npos ? std::string_view()
+                                         : text.substr(first, text.find_last_not_of(white) - first + 1);
+}
+
+}  // namespace
+
+CpuSet::CpuSet(std::initializer_list<unsigned int> numbers) {
+  for (const unsigned int number : numbers) {
+    add(number);
+  }
+}
+
+std::optional<CpuSet> CpuSet::fromList(std::string_view list) {
+  CpuSet set;
+  std::string_view rest = trimmed(list);
+  if (rest.empty()) {
+    return set;
+  }
+  do {
+    const std::optional<unsigned int> low = takeNumber(rest);
+    const std::optional<unsigned int> high = low && take(rest, '-') ? takeNumber(rest) : low;
+    if (!high || *high < *low) {
+      return std::nullopt;
+    }
+    for (unsigned int number = *low; number <= *high; ++number) {
+      set.add(number);
+    }
+  } while (take(rest, ','));
+  return rest.empty() ? std::optional(std::move(set)) : std::nullopt;
+}
+
+std::string CpuSet::toList() const {
+  std::string list;
+  for (unsigned int low = first(); low != limit;) {
+    unsigned int high = low;
+    while (contains(high + 1)) {
+      ++high;
+    }
+    list += (list.empty() ? "" : ",") + std::to_string(low);
+    if (high != low) {
+      list += "-" + std::to_string(high);
+    }
+    low = next(high);
+  }
+  return list;
+}
+
+void CpuSet::add(unsigned int number) {
+  if (number >= limit) {
+    return;
+  }
+  const std::size_t word = number / bits;
+  if (word >= words_.size()) {
+    words_.resize(word + 1);
+  }
+  words_[word] |= Word{1} << number % bits;
+}
+
+void CpuSet::add(const CpuSet& other) {
+  words_.resize(std::max(words_.size(), other.words_.size()));
+  for (std::size_t i = 0; i < other.words_.size(); ++i) {
+    words_[i] |= other.words_[i];
+  }
+}
+
+void CpuSet::remove(const CpuSet& other) {
+  for (std::size_t i = 0; i < std::min(words_.size(), other.words_.size()); ++i) {
+    words_[i] &= ~other.words_[i];
+  }
+  trim();
+}
+
+void CpuSet::keepOnly(const CpuSet& other) {
+  words_.resize(std::min(words_.size(), other.words_.size()));
+  for (std::size_t i = 0; i < words_.size(); ++i) {
+    words_[i] &= other.words_[i];
+  }
+  trim();
+}
+
+bool CpuSet::contains(unsigned int number) const {
+  const std::size_t word = number / bits;
+  return word < words_.size() && ((words_[word] >> number % bits) & 1U) != 0;
+}
+
+bool CpuSet::intersects(const CpuSet& other) const {
+  for (std::size_t i = 0; i < std::min(words_.size(), other.words_.size()); ++i) {
+    if ((words_[i] & other.words_[i]) != 0) {
+      return true;
+    }
+  }
+  return false;
+}
+
+unsigned int CpuSet::count() const {
+  unsigned int total = 0;
+  for (const Word word : words_) {
+    total += static_cast<unsigned int>(std::popcount(word));
+  }
+  return total;
+}
+
+unsigned int CpuSet::from(unsigned int number) const {
+  std::size_t index = number / bits;
+  if (index >= words_.size()) {
+    return limit;
+  }
+  Word word = words_[index] & (~Word{0} << number % bits);
+  while (word == 0) {
+    if (++index == words_.size()) {
+      return limit;
+    }
+    word = words_[index];
+  }
+  return static_cast<unsigned int>(index) * bits + static_cast<unsigned int>(std::countr_zero(word));
+}
+
+void CpuSet::trim() {
+  while (!words_.empty() && words_.back() == 0) {
+    words_.pop_back();
+  }
+}
+
+}  // namespace Tarn::Inventory

@@ -1,0 +1,57 @@
+#ifndef CORVANE_PLATFORM_INSTRUMENTATION_TREE_CPUSET_H
+#define CORVANE_PLATFORM_INSTRUMENTATION_TREE_CPUSET_H
+
+#include <cstdint>
+#include <initializer_list>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace Tarn::Inventory {
+
+/// A set of logical CPU numbers, as the kernel counts them.
+class CpuSet {
+ public:
+  /// Numbers from here on are refused, so that a broken list can not ask for unbounded memory.
+  static constexpr unsigned int limit = 1U << 16;
+
+  CpuSet() = default;
+  CpuSet(std::initializer_list<unsigned int> numbers);
+
+  /// Reads the kernel's list form, such as "0-3,8,10-11"; an empty text is the empty set, and white
+  /// space around the list does not count. Nothing if the text is no such list.
+  static std::optional<CpuSet> fromList(std::string_view list);
+
+  /// The set in the kernel's list form.
+  std::string toList() const;
+
+  void add(unsigned int number);
+  void add(const CpuSet& other);
+  void remove(const CpuSet& other);
+  void keepOnly(const CpuSet& other);
+
+  bool empty() const { return words_.empty(); }
+  bool contains(unsigned int number) const;
+  bool intersects(const CpuSet& other) const;
+  unsigned int count() const;
+
+  /// The lowest number, and the lowest one after `number`; `limit` where there is none.
+  unsigned int first() const { return from(0); }
+  unsigned int next(unsigned int number) const { return from(number + 1); }
+
+  bool operator==(const CpuSet& other) const = default;
+
+ private:
+  using Word = std::uint64_t;
+  static constexpr unsigned int bits = 64;
+
+  unsigned int from(unsigned int number) const;
+  void trim();
+
+  std::vector<Word> words_;  // never ends with a zero, so that equal sets compare equal
+};
+
+}  // namespace Tarn::Inventory
+
+#endif

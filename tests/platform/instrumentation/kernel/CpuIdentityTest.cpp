@@ -1,0 +1,143 @@
+#include "platform/instrumentation/kernel/CpuIdentity.h"
+
+#include <gtest/gtest.h>
+
+namespace Tarn::Inventory {
+namespace {
+
+CpuIdentity identify(const std::string& block) {
+  return identifyCpu(CpuInfo("processor\t: 0\n" + block), 0);
+}
+
+std::string x86(const std::string& family, const std::string& model, const std::string& stepping) {
+  return "vendor_id\t: GenuineIntel\ncpu family\t: " + family + "\nmodel\t\t: " + model +
+         "\nmodel name\t: Intel(R) Xeon(R) CPU\nstepping\t: " + stepping +
+         "\ncpu MHz\t\t: 2299.998\nflags\t\t: fpu sse2 lm hypervisor\n";
+}
+
+TEST(CpuIdentity, OfX86) {
+  const CpuIdentity cpu = identify(x86("6", "207", "2"));
+
+  EXPECT_EQ(cpu.architecture, Architecture::X86);
+  EXPECT_EQ(cpu.vendor, "GenuineIntel");
+  EXPECT_EQ(cpu.name, "Intel(R) Xeon(R) CPU");
+  EXPECT_EQ(cpu.stepping, "2");
+  EXPECT_EQ(cpu.processorId, "F2 06 0C 00");
+  EXPECT_EQ(cpu.family, 179U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, 2300U);
+  EXPECT_TRUE(cpu.hypervisor);
+}
+
+TEST(CpuIdentity, FormsTheX86SignatureFromItsParts) {
+  EXPECT_EQ(identify(x86("6", "94", "3")).processorId, "E3 06 05 00");
+  EXPECT_EQ(identify(x86("25", "1", "1")).processorId, "11 0F A0 00");
+  EXPECT_EQ(identify(x86("15", "6", "1")).processorId, "61 0F 00 00");
+  EXPECT_EQ(identify(x86("5", "4", "3")).processorId, "43 05 00 00");
+  EXPECT_EQ(identify(x86("6", "94", "unknown")).processorId, "");
+  EXPECT_EQ(identify(x86("6", "94", "unknown")).stepping, "");
+}
+
+TEST(CpuIdentity, ReadsTheX86WidthFromTheFlags) {
+  const std::string begin = "vendor_id\t: x\ncpu family\t: 6\n";
+  EXPECT_EQ(identify(begin + "flags\t: fpu lm sse\n").width, 64U);
+  EXPECT_EQ(identify(begin + "flags\t: fpu lmx abm xlm\n").width, 32U) << "whole words";
+  EXPECT_EQ(identify(begin).width, std::nullopt);
+}
+
+TEST(CpuIdentity, LeavesOutAnX86NameThatIsUnknown) {
+  EXPECT_EQ(identify("cpu family\t: 6\nmodel name\t: unknown\n").name, "");
+}
+
+TEST(CpuIdentity, TakesNoClockSpeedThatIsNone) {
+  for (const char* text : {"", "0.000", "-1", "unknown", "1e30", "nan", "99999999999"}) {
+    EXPECT_EQ(identify("cpu family\t: 6\ncpu MHz\t: " + std::string(text) + "\n").clockSpeed, std::nullopt) << text;
+  }
+}
+
+std::string arm(const std::string& part, const std::string& architecture) {
+  return "CPU implementer\t: 0x41\nCPU architecture: " + architecture + "\nCPU variant\t: 0x1\nCPU part\t: " + part +
+         "\nCPU revision\t: 3\n";
+}
+
+TEST(CpuIdentity, OfArm) {
+  const CpuIdentity cpu = identify(arm("0xd08", "8"));
+
+  EXPECT_EQ(cpu.architecture, Architecture::Arm);
+  EXPECT_EQ(cpu.name, "Cortex-A72");
+  EXPECT_EQ(cpu.stepping, "r1p3");
+  EXPECT_EQ(cpu.processorId, "83 D0 1F 41");
+  EXPECT_EQ(cpu.family, 257U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, std::nullopt);
+  EXPECT_FALSE(cpu.hypervisor);
+}
+
+TEST(CpuIdentity, OfArmPartsThatAreNotKnown) {
+  EXPECT_EQ(identify(arm("0xfff", "8")).name, "");
+  EXPECT_EQ(identify(arm("0xfff", "9")).family, 257U);
+  EXPECT_EQ(identify(arm("0xfff", "7")).family, 256U);
+  EXPECT_EQ(identify(arm("0xfff", "7")).width, 32U);
+  EXPECT_EQ(identify(arm("0xfff", "5TEJ")).family, 280U);
+  EXPECT_EQ(identify(arm("0xfff", "5TEJ")).processorId, "") << "older registers tell their version";
+}
+
+TEST(CpuIdentity, OfPowerPc) {
+  const CpuIdentity cpu =
+      identify("cpu\t\t: POWER9, altivec supported\nclock\t\t: 3425.000000MHz\nrevision\t: 2.2 (pvr 004e 1202)\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::PowerPc);
+  EXPECT_EQ(cpu.name, "POWER9, altivec supported");
+  EXPECT_EQ(cpu.stepping, "2.2");
+  EXPECT_EQ(cpu.family, 32U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, 3425U);
+}
+
+TEST(CpuIdentity, OfS390) {
+  const CpuIdentity cpu = identifyCpu(CpuInfo("vendor_id       : IBM/S390\nfeatures\t: esan3 zarch stfle\n"
+                                              "processor 0: version = FF,  identification = 0123,  machine = 3931\n\n"
+                                              "cpu number      : 0\ncpu MHz dynamic : 5200\ncpu MHz static  : 5200\n"),
+                                      0);
+
+  EXPECT_EQ(cpu.architecture, Architecture::S390);
+  EXPECT_EQ(cpu.family, 204U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, 5200U);
+}
+
+TEST(CpuIdentity, OfRiscV) {
+  const CpuIdentity cpu = identify("hart\t\t: 1\nisa\t\t: rv64imafdc\nmmu\t\t: sv39\nuarch\t\t: sifive,u74-mc\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::RiscV);
+  EXPECT_EQ(cpu.name, "sifive,u74-mc");
+  EXPECT_EQ(cpu.family, 513U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(identify("isa\t: rv32imac\n").family, 512U);
+  EXPECT_EQ(identify("isa\t: rv32imac\n").width, 32U);
+}
+
+TEST(CpuIdentity, OfLoongArch) {
+  const CpuIdentity cpu = identify(
+      "package\t\t\t: 0\nModel Name\t\t: Loongson-3A5000-HV\nCPU Revision\t\t: 0x11\n"
+      "CPU MHz\t\t\t: 2500.00\nISA\t\t\t: loongarch32 loongarch64\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::LoongArch);
+  EXPECT_EQ(cpu.name, "Loongson-3A5000-HV");
+  EXPECT_EQ(cpu.family, 600U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.stepping, "0x11");
+  EXPECT_EQ(cpu.clockSpeed, 2500U);
+}
+
+TEST(CpuIdentity, OfACpuThatSaysNothing) {
+  const CpuIdentity cpu = identify("");
+
+  EXPECT_EQ(cpu.architecture, Architecture::Unknown);
+  EXPECT_EQ(cpu.family, 2U);
+  EXPECT_EQ(cpu.name, "");
+  EXPECT_EQ(cpu.width, std::nullopt);
+}
+
+}  // namespace
+}  // namespace Tarn::Inventory

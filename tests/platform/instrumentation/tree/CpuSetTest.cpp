@@ -1,0 +1,83 @@
+#include "platform/instrumentation/tree/CpuSet.h"
+
+#include <gtest/gtest.h>
+
+namespace Tarn::Inventory {
+namespace {
+
+TEST(CpuSet, ReadsTheKernelsLists) {
+  EXPECT_EQ(CpuSet::fromList("0-3,8,10-11\n"), (CpuSet{0, 1, 2, 3, 8, 10, 11}));
+  EXPECT_EQ(CpuSet::fromList("5"), CpuSet{5});
+  EXPECT_EQ(CpuSet::fromList("\n"), CpuSet());
+  EXPECT_EQ(CpuSet::fromList(""), CpuSet());
+}
+
+TEST(CpuSet, RefusesWhatIsNoList) {
+  for (const char* text : {"a", "1-", "-1", "3-1", "1,,2", "1,", "1 2", "0-65536", "99999999999", "0x3", "(null)"}) {
+    EXPECT_EQ(CpuSet::fromList(text), std::nullopt) << text;
+  }
+}
+
+TEST(CpuSet, WritesTheKernelsLists) {
+  for (const char* list : {"", "0", "0-1", "0-3,8,10-11", "63-64", "127,65535"}) {
+    EXPECT_EQ(CpuSet::fromList(list).value().toList(), list);
+  }
+}
+
+TEST(CpuSet, WalksItsNumbersInOrder) {
+  const CpuSet set{200, 3, 64, 63};
+
+  EXPECT_EQ(set.first(), 3U);
+  EXPECT_EQ(set.next(3), 63U);
+  EXPECT_EQ(set.next(63), 64U);
+  EXPECT_EQ(set.next(64), 200U);
+  EXPECT_EQ(set.next(200), CpuSet::limit);
+  EXPECT_EQ(CpuSet().first(), CpuSet::limit);
+}
+
+TEST(CpuSet, TellsItsMembers) {
+  const CpuSet set{0, 64, 127};
+
+  EXPECT_TRUE(set.contains(64));
+  EXPECT_FALSE(set.contains(63));
+  EXPECT_FALSE(set.contains(100000));
+  EXPECT_EQ(set.count(), 3U);
+  EXPECT_FALSE(set.empty());
+  EXPECT_TRUE(CpuSet().empty());
+}
+
+TEST(CpuSet, JoinsAndTakesAway) {
+  CpuSet set{1, 70};
+  set.add(CpuSet{2, 130});
+  EXPECT_EQ(set, (CpuSet{1, 2, 70, 130}));
+
+  set.remove(CpuSet{70, 130, 500});
+  EXPECT_EQ(set, (CpuSet{1, 2}));
+
+  set.remove(set);
+  EXPECT_TRUE(set.empty());
+}
+
+TEST(CpuSet, KeepsOnlyWhatIsCommon) {
+  CpuSet set{1, 2, 70, 200};
+  set.keepOnly(CpuSet{2, 3, 70});
+  EXPECT_EQ(set, (CpuSet{2, 70}));
+
+  set.keepOnly(CpuSet{500});
+  EXPECT_TRUE(set.empty());
+}
+
+TEST(CpuSet, IntersectsWhereANumberIsCommon) {
+  EXPECT_TRUE((CpuSet{1, 100}.intersects(CpuSet{100})));
+  EXPECT_FALSE((CpuSet{1, 100}.intersects(CpuSet{2})));
+  EXPECT_FALSE(CpuSet().intersects(CpuSet{0}));
+}
+
+TEST(CpuSet, IgnoresNumbersFromTheLimitOn) {
+  CpuSet set;
+  set.add(CpuSet::limit);
+  EXPECT_TRUE(set.empty());
+}
+
+}  // namespace
+}  // namespace Tarn::Inventory
