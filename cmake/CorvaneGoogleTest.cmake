@@ -1,6 +1,10 @@
 # GoogleTest from Debian's source package, so that one package serves both ABIs.
 
 set(CORVANE_GTEST_SOURCE /usr/src/googletest CACHE PATH "GoogleTest sources (Debian package googletest)")
+if(NOT EXISTS ${CORVANE_GTEST_SOURCE}/CMakeLists.txt)
+  message(FATAL_ERROR "No GoogleTest sources in ${CORVANE_GTEST_SOURCE}; install the Debian package googletest, "
+    "set CORVANE_GTEST_SOURCE, or build without tests: -DCORVANE_TESTS=OFF")
+endif()
 set(INSTALL_GTEST OFF CACHE BOOL "" FORCE)
 add_subdirectory(${CORVANE_GTEST_SOURCE} ${PROJECT_BINARY_DIR}/googletest EXCLUDE_FROM_ALL SYSTEM)
 foreach(library gtest gmock gtest_main gmock_main)
