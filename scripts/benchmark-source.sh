@@ -10,6 +10,7 @@ benchmark_source=$root/build/downloads/benchmark
 # One deb-src line for the release's main repository, in apt's own reading of the system's sources.
 source_lines() {
   local codename
+  # shellcheck source=/dev/null
   codename=$(. /etc/os-release && echo "$VERSION_CODENAME") || return
   # shellcheck disable=SC2016
   apt-get indextargets --no-release-info --format '$(REPO_URI) $(RELEASE) $(COMPONENT)' 'Created-By: Packages' |
