@@ -44,7 +44,7 @@ std::shared_ptr<const Tarn::Inventory::Tree> inventoryTree(const Options& option
     return Tarn::Inventory::processTree();
   }
   // hwloc trusts that a description is complete.
-  const CrashReport report("can not read the inventory: " + options.description +
+  const CrashReport report("cannot read the inventory: " + options.description +
                            ": hwloc crashed on it; correct the description");
   return std::make_shared<const Tarn::Inventory::Tree>(readHwloc(options.description));
 }

@@ -18,8 +18,8 @@ Outcome performOperation(const LibraryFiles& files, const Options& options);
 /// "CIM_ERR_NOT_FOUND: no such processor", the status as users of CIM know it.
 std::string describeStatus(CMPIrc rc, const std::optional<std::string>& message);
 
-/// Why the library had nothing to tell: the text of the error if the inventory can not be read. A
-/// provider that can not collect answers like one that has nothing.
+/// Why the library had nothing to tell: the text of the error if the inventory cannot be read. A
+/// provider that cannot collect answers like one that has nothing.
 std::optional<std::string> inventoryError();
 
 }  // namespace Corvcim

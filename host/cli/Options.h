@@ -39,7 +39,7 @@ struct Options {
   bool wantsVersion = false;
 };
 
-/// A command line that can not be understood; what() is one line that says what is wrong and how it
+/// A command line that cannot be understood; what() is one line that says what is wrong and how it
 /// is written.
 class UsageError : public std::runtime_error {
  public:

@@ -18,7 +18,7 @@ namespace {
 using Tarn::Inventory::Identifiers;
 
 [[noreturn]] void fail(const std::string& file, int error) {
-  throw std::runtime_error("can not write the snapshot: " + file + ": " + Tarn::Inventory::describeError(error) +
+  throw std::runtime_error("cannot write the snapshot: " + file + ": " + Tarn::Inventory::describeError(error) +
                            "; name a file that can be written, or none for standard output");
 }
 

@@ -14,7 +14,7 @@ void occupyStandardStreams();
 std::size_t terminalWidth();
 
 /// Writes to standard output, and has it all on its way when it returns. A reader that went away ends
-/// the program quietly, as SIGPIPE does. Throws std::runtime_error if the output can not be written.
+/// the program quietly, as SIGPIPE does. Throws std::runtime_error if the output cannot be written.
 void writeOutput(std::string_view text);
 
 /// Writes "corvcim: TEXT" as one line to standard error.

@@ -13,7 +13,7 @@ namespace Corvcim {
 std::string toValidUtf8(std::string_view text);
 
 /// The text for a terminal's line: valid UTF-8, and control characters as escapes (\n, \t, \x1B), so
-/// that a name in the inventory can not move the cursor.
+/// that a name in the inventory cannot move the cursor.
 std::string toPrintable(std::string_view text);
 
 /// The columns that valid UTF-8 takes; every character counts as one.

@@ -11,7 +11,7 @@ namespace Corvcim {
 /// What is called of hwloc. Only `inventory --from` needs it, so it is loaded when it is called first:
 /// linked, it would cost every start of corvcim a tenth of its time.
 ///
-/// hwloc's inline functions that call others can not be used, as they would have to be linked.
+/// hwloc's inline functions that call others cannot be used, as they would have to be linked.
 struct HwlocLibrary {
   decltype(&hwloc_topology_init) topologyInit = nullptr;
   decltype(&hwloc_topology_destroy) topologyDestroy = nullptr;
@@ -34,7 +34,7 @@ struct HwlocLibrary {
   decltype(&hwloc_bitmap_next) bitmapNext = nullptr;
   decltype(&hwloc_bitmap_last) bitmapLast = nullptr;
 
-  std::string problem;  ///< why it can not be called; empty where it can
+  std::string problem;  ///< why it cannot be called; empty where it can
 
   HwlocLibrary();
 };

@@ -39,7 +39,7 @@ struct HwlocParts {
   Tarn::Inventory::CpuSet homeless;  ///< those of which nothing tells the package
 };
 
-/// Throws std::invalid_argument where the topology describes what an inventory can not hold.
+/// Throws std::invalid_argument where the topology describes what an inventory cannot hold.
 HwlocParts readParts(hwloc_topology_t topology);
 
 /// An object's own remark; empty where it has none of that name.

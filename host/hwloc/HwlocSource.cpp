@@ -16,7 +16,7 @@ using Tarn::Inventory::Tree;
 Tree readFile(const std::string& file) {
   std::string text;
   if (const Tarn::Inventory::FileError error = Tarn::Inventory::openDirectory(".")->read(file.c_str(), text)) {
-    throw InventoryError("can not read the inventory", file, Tarn::Inventory::describeError(error),
+    throw InventoryError("cannot read the inventory", file, Tarn::Inventory::describeError(error),
                          "name an XML file as lstopo writes it");
   }
   return treeOfXml(text, file);
@@ -41,7 +41,7 @@ Tree readHwloc(std::string_view source) {
     }
   }
   throw InventoryError(
-      "can not convert the inventory", '"' + std::string(source) + '"', "it names no description to convert",
+      "cannot convert the inventory", '"' + std::string(source) + '"', "it names no description to convert",
       "--from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION, and --inventory what the library reads");
 }
 

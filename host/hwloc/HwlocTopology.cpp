@@ -18,7 +18,7 @@ namespace {
 using Tarn::Inventory::CpuSet;
 using Tarn::Inventory::InventoryError;
 
-constexpr const char* whatFailed = "can not read the inventory";
+constexpr const char* whatFailed = "cannot read the inventory";
 constexpr const char* aboutXml =
     "it takes XML as lstopo of version 2 or 1 writes it; HWLOC_XML_VERBOSE=1 lstopo -i FILE says what is wrong with it";
 constexpr const char* aboutSynthetic =
@@ -50,7 +50,7 @@ HwlocTopology newTopology(const std::string& name) {
   }
   hwloc_topology_t topology = nullptr;
   if (hwloc().topologyInit(&topology) != 0) {
-    throw std::runtime_error("hwloc can not make a topology");
+    throw std::runtime_error("hwloc cannot make a topology");
   }
   HwlocTopology owned(topology);
   hwloc().topologySetAllTypesFilter(topology, HWLOC_TYPE_FILTER_KEEP_ALL);
@@ -61,7 +61,7 @@ HwlocTopology newTopology(const std::string& name) {
 
 void load(const HwlocTopology& topology, const std::string& name, const char* remedy) {
   if (hwloc().topologyLoad(topology.get()) != 0) {
-    throw InventoryError(whatFailed, name, "hwloc can not make a topology of it", remedy);
+    throw InventoryError(whatFailed, name, "hwloc cannot make a topology of it", remedy);
   }
 }
 

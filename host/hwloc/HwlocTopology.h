@@ -24,7 +24,7 @@ HwlocTopology loadXml(const std::string& text, const std::string& name);
 HwlocTopology loadSynthetic(const std::string& description, const std::string& name);
 
 /// The set as the inventory has it; empty for none. Throws std::invalid_argument where it holds a CPU that
-/// an inventory can not have, or all CPUs there could be.
+/// an inventory cannot have, or all CPUs there could be.
 Tarn::Inventory::CpuSet cpuSetOf(hwloc_const_bitmap_t set);
 
 }  // namespace Corvcim

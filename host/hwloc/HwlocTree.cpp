@@ -223,7 +223,7 @@ Tree convert(const HwlocTopology& topology, const std::string& name) {
   try {
     return Writer(topology.get(), name).write();
   } catch (const std::invalid_argument& refused) {
-    throw InventoryError("can not read the inventory", name, refused.what(), "correct the description");
+    throw InventoryError("cannot read the inventory", name, refused.what(), "correct the description");
   }
 }
 

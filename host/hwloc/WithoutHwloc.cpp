@@ -6,7 +6,7 @@ namespace {
 
 [[noreturn]] void refuse(const std::string& name) {
   throw Tarn::Inventory::InventoryError(
-      "can not read the inventory", name, "this corvcim was built without hwloc",
+      "cannot read the inventory", name, "this corvcim was built without hwloc",
       "use one that was built where libhwloc-dev is installed for its architecture, and read its JSON with json:FILE");
 }
 

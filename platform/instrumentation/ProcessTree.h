@@ -10,7 +10,7 @@ namespace Tarn::Inventory {
 
 /// The tree that this process's cursors walk. The first call loads it, from the source that the
 /// override CORVANE_INVENTORY or else the configuration key "inventory" names, by default "live"; later
-/// calls share it. Throws std::exception's children if it can not be loaded; the next call tries again.
+/// calls share it. Throws std::exception's children if it cannot be loaded; the next call tries again.
 /// Safe from several threads.
 std::shared_ptr<const Tree> processTree();
 

@@ -31,7 +31,7 @@ std::string readWhole(const std::string& file, const char* remedy) {
   FileError error = 0;
   std::string contents = readWhole(file, error);
   if (error != 0) {
-    throw InventoryError("can not read the inventory", file, describeError(error), remedy);
+    throw InventoryError("cannot read the inventory", file, describeError(error), remedy);
   }
   return contents;
 }
@@ -47,7 +47,7 @@ std::unique_ptr<FileSystem> openRoot(const std::string& location) {
     return openDirectory(location);
   }
   if (error != 0) {
-    throw InventoryError("can not read the inventory", location, describeError(error),
+    throw InventoryError("cannot read the inventory", location, describeError(error),
                          "name a captured root directory, or a file of captured files");
   }
   return std::make_unique<MemoryFileSystem>(readArchive(archive, location));
@@ -98,7 +98,7 @@ std::optional<Choice> find(std::string_view specification) {
 Choice choose(std::string_view specification) {
   const std::optional<Choice> choice = find(specification);
   if (!choice) {
-    throw InventoryError("can not read the inventory", '"' + std::string(specification) + '"',
+    throw InventoryError("cannot read the inventory", '"' + std::string(specification) + '"',
                          "it names no source of an inventory",
                          "set CORVANE_INVENTORY, or inventory in the configuration, to live, root:DIRECTORY, "
                          "snapshot:FILE, json:FILE or smbios:FILE");

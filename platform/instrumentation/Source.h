@@ -21,7 +21,7 @@ namespace Tarn::Inventory {
 ///                   the same in the place of those tables that the machine shows
 ///
 /// With Detail::WithOrigins the tree also tells of each value where it comes from.
-/// Throws InventoryError where the text names no source, or its source can not be read.
+/// Throws InventoryError where the text names no source, or its source cannot be read.
 Tree loadInventory(std::string_view specification, Detail detail = Detail::Values);
 
 /// The root of the files that the live source's readers read for this source; nullptr where they read none (json:,

@@ -6,8 +6,8 @@
 
 namespace Corvcim {
 
-/// The verb diff: what differs between the two sources that the options name. Throws InventoryError where a source can
-/// not be read, and UsageError for a field to ignore that there is not.
+/// The verb diff: what differs between the two sources that the options name. Throws InventoryError where a source
+/// cannot be read, and UsageError for a field to ignore that there is not.
 Outcome diffInventories(const Options& options);
 
 }  // namespace Corvcim

@@ -8,7 +8,7 @@
 namespace Corvcim {
 
 /// The topology as a picture: SVG that needs nothing beside itself, on a light ground, with a title
-/// and a description for people who can not see it.
+/// and a description for people who cannot see it.
 std::string drawTreeSvg(const Topology& topology);
 
 }  // namespace Corvcim

@@ -22,7 +22,7 @@ class JsonBuilder {
   void text(std::string_view value);
   void number(std::uint64_t value);
   void number(std::int64_t value);
-  void number(double value);  ///< null for what JSON can not say: infinities and NaN
+  void number(double value);  ///< null for what JSON cannot say: infinities and NaN
   void boolean(bool value);
   void null();
 

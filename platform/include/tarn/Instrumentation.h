@@ -34,7 +34,7 @@ class Tree;
 /// On a cursor that stands on no node every getter answers empty, 0 or false.
 class Instrumentation {
  public:
-  /// A cursor on no node. Throws std::exception's children if the inventory can not be read; the text
+  /// A cursor on no node. Throws std::exception's children if the inventory cannot be read; the text
   /// says which file, where and why. The next cursor tries again.
   Instrumentation();
   ~Instrumentation();

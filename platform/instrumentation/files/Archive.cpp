@@ -49,7 +49,7 @@ class ArchiveReader {
 
  private:
   [[noreturn]] void refuse(const std::string& why, const std::string& remedy) const {
-    throw InventoryError("can not read the captured files", name_ + ", line " + std::to_string(number_), why, remedy);
+    throw InventoryError("cannot read the captured files", name_ + ", line " + std::to_string(number_), why, remedy);
   }
 
   void beginDirectory(std::string_view text) {

@@ -41,7 +41,7 @@ class FileSystem {
 };
 
 /// The file system below a directory: "/" for the machine's own, else a captured root.
-/// Throws InventoryError if the directory can not be opened.
+/// Throws InventoryError if the directory cannot be opened.
 std::unique_ptr<FileSystem> openDirectory(const std::string& directory);
 
 }  // namespace Tarn::Inventory

@@ -105,7 +105,7 @@ class RealFileSystem final : public FileSystem {
 std::unique_ptr<FileSystem> openDirectory(const std::string& directory) {
   FileDescriptor descriptor(::open(directory.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC));
   if (!descriptor) {
-    throw InventoryError("can not read the inventory", directory, describeError(errno),
+    throw InventoryError("cannot read the inventory", directory, describeError(errno),
                          "name a directory that holds sys/ and proc/ of a machine");
   }
   return std::make_unique<RealFileSystem>(std::move(descriptor), directory);

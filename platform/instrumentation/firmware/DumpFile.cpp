@@ -12,7 +12,7 @@ MemoryFileSystem::Files filesOfDump(const std::string& dump, const std::string& 
   const Smbios::Bytes bytes = Smbios::bytesOf(dump);
   const Smbios::Decoded decoded = Smbios::decodeDump(bytes);
   if (const auto* const problem = std::get_if<Smbios::Problem>(&decoded)) {
-    throw InventoryError("can not read the SMBIOS dump", name, Smbios::describe(*problem),
+    throw InventoryError("cannot read the SMBIOS dump", name, Smbios::describe(*problem),
                          "name a file that dmidecode --dump-bin wrote");
   }
   const Smbios::EntryPoint& entryPoint = std::get<Smbios::Tables>(decoded).entryPoint;

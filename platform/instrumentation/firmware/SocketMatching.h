@@ -35,7 +35,7 @@ struct SocketMatching {
   /// Sockets for which no package is left: what the kernel does not see.
   std::vector<std::size_t> unseen;
 
-  /// Sockets and packages that can not be told apart and are not equally many, or whose signatures
+  /// Sockets and packages that cannot be told apart and are not equally many, or whose signatures
   /// contradict each other.
   struct Contradiction {
     std::vector<std::size_t> sockets;

@@ -18,7 +18,7 @@ class Attributes {
  public:
   explicit Attributes(FileSystem& files) : files_(files) {}
 
-  /// The value without the white space around it; good until the next call. Nothing if the file can not
+  /// The value without the white space around it; good until the next call. Nothing if the file cannot
   /// be read.
   template <class... Parts>
   std::optional<std::string_view> text(const Parts&... parts) {

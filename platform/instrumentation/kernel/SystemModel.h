@@ -16,7 +16,7 @@ namespace Tarn::Inventory {
 Facts readSystemFacts(Machine& machine, const Facts* firmware);
 
 /// A text of the firmware's without the blanks around it, and with a blank for each control character: those
-/// can not stand in the XML that brokers send.
+/// cannot stand in the XML that brokers send.
 std::string plainText(std::string_view text);
 
 /// Whether a text is what firmware vendors leave in a field that they did not fill in.

@@ -172,7 +172,7 @@ Tree readLiveInventory(FileSystem& root, Detail detail) {
   LiveReader reader(root, detail);
   reader.readFirmware();
   if (!reader.knowsProcessors()) {
-    throw InventoryError("can not read the inventory", root.nameOf("sys/devices/system/cpu"),
+    throw InventoryError("cannot read the inventory", root.nameOf("sys/devices/system/cpu"),
                          "neither this directory nor /proc/cpuinfo tells of a processor",
                          "mount sysfs on /sys and proc on /proc");
   }
@@ -185,7 +185,7 @@ Tree readFirmwareInventory(FileSystem& root, Detail detail) {
   reader.readFirmware();
   if (!reader.knowsProcessors()) {
     const std::vector<Unread> unread = reader.unread();
-    throw InventoryError("can not read the inventory", root.nameOf(tableFile),
+    throw InventoryError("cannot read the inventory", root.nameOf(tableFile),
                          unread.empty() ? "its tables tell of no processor socket" : unread.front().reason,
                          "name a dump of a machine's SMBIOS tables, or join it with another source: smbios:FILE+live");
   }

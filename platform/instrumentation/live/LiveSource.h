@@ -13,7 +13,7 @@ namespace Tarn::Inventory {
 Tree readLiveInventory(FileSystem& root, Detail detail = Detail::Values);
 
 /// The inventory that the firmware's tables alone tell about: nothing else is expected below the root.
-/// Throws InventoryError if they can not be read, or tell of no processor socket.
+/// Throws InventoryError if they cannot be read, or tell of no processor socket.
 Tree readFirmwareInventory(FileSystem& root, Detail detail = Detail::Values);
 
 }  // namespace Tarn::Inventory

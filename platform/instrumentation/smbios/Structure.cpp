@@ -76,7 +76,7 @@ class Walker {
     return true;
   }
 
-  // False where the walk can not go on.
+  // False where the walk cannot go on.
   bool readStructure() {
     const Bytes rest = table_.subspan(offset_);
     const auto number = static_cast<unsigned int>(found_.size());

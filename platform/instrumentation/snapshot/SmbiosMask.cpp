@@ -193,7 +193,7 @@ std::vector<std::string> maskTable(std::string_view entryPoint, std::string& tab
     return {};
   }
   table.assign(table.size(), masked);
-  return {"everything, as its entry point can not be read"};
+  return {"everything, as its entry point cannot be read"};
 }
 
 }  // namespace Tarn::Inventory

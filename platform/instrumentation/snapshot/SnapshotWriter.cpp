@@ -45,7 +45,7 @@ void describeMasks(std::string& text, const std::vector<std::string>& masks) {
 Snapshot takeSnapshot(std::string_view specification, Identifiers identifiers, const std::string& program) {
   const std::unique_ptr<FileSystem> files = openSource(specification);
   if (!files) {
-    throw InventoryError("can not take a snapshot", std::string(specification),
+    throw InventoryError("cannot take a snapshot", std::string(specification),
                          "the source is one file already, and none of a machine's files is read for it",
                          "pass on that file, or name live, root:DIRECTORY or snapshot:FILE");
   }

@@ -13,7 +13,7 @@ namespace Tarn::Inventory {
 /// A set of logical CPU numbers, as the kernel counts them.
 class CpuSet {
  public:
-  /// Numbers from here on are refused, so that a broken list can not ask for unbounded memory.
+  /// Numbers from here on are refused, so that a broken list cannot ask for unbounded memory.
   static constexpr unsigned int limit = 1U << 16;
 
   CpuSet() = default;

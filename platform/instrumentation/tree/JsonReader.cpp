@@ -16,7 +16,7 @@ namespace {
 using Json = nlohmann::json;
 using namespace NodeLexicon;
 
-constexpr const char* whatFailed = "can not read the inventory";
+constexpr const char* whatFailed = "cannot read the inventory";
 constexpr const char* whatToDo = "correct the file; the format is described in docs/inventory.md";
 
 // The parser's messages begin with a tag for programmers, in brackets.
@@ -188,7 +188,7 @@ class Reader {
                       : entry->type == NodeProcessor ? !parent || parent == NodeSystem
                                                      : !parent;
     if (!fits) {
-      refuse(where, "is \"" + name + "\", which can not stand " +
+      refuse(where, "is \"" + name + "\", which cannot stand " +
                         (parent ? "below a " + std::string(nodeTypeName(*parent)) : "at the top"));
     }
     return entry->type;

@@ -26,7 +26,7 @@ namespace Tarn::Inventory {
 ///     builder.number(PropMaxClockSpeed, 3500).from([&] { return fileOrigin(...); });
 ///
 /// Processors go below the system, or stand at the top where there is none; cores and caches go below
-/// the processor added last. What can not be is refused with std::invalid_argument and a text that
+/// the processor added last. What cannot be is refused with std::invalid_argument and a text that
 /// names the node: a second system, a system after a processor, a core without a processor, a path
 /// that is empty, used twice or holds anything but visible ASCII characters, a property that is
 /// unknown, given twice, of another kind or of another node type.

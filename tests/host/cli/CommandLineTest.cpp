@@ -236,7 +236,7 @@ TEST(Corvcim, ALibraryThatIsNotThereIsOneLine) {
 
 TEST(Corvcim, AnInventoryThatCanNotBeReadIsSaidByEveryVerb) {
   const std::string why =
-      "can not read the inventory: /nowhere.json: no such file or directory; name a file that holds an inventory as "
+      "cannot read the inventory: /nowhere.json: no such file or directory; name a file that holds an inventory as "
       "JSON";
 
   EXPECT_EQ(corvcim({"-i", "json:/nowhere.json"}), failed(why));

@@ -156,7 +156,7 @@ TEST_F(Companion, AnInventoryThatCanNotBeReadIsAStatus) {
 
   EXPECT_EQ(response.rc, CMPI_RC_ERR_FAILED);
   EXPECT_EQ(response.message,
-            "can not read the inventory: /nowhere.json: no such file or directory; name a file that "
+            "cannot read the inventory: /nowhere.json: no such file or directory; name a file that "
             "holds an inventory as JSON");
 }
 

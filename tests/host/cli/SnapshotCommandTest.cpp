@@ -101,13 +101,13 @@ TEST_F(SnapshotCommand, SaysWhatItCanNotDo) {
 
   EXPECT_EQ(corvcim({"-i", source_, "snapshot", file}),
             (Finished{1, "",
-                      "corvcim: can not write the snapshot: " + file +
+                      "corvcim: cannot write the snapshot: " + file +
                           ": no such file or directory; name a file that can be written, or none for standard "
                           "output\n"}));
   EXPECT_EQ(
       corvcim({"-i", "json:x", "snapshot"}),
       (Finished{1, "",
-                "corvcim: can not take a snapshot: json:x: the source is one file already, and none of a machine's "
+                "corvcim: cannot take a snapshot: json:x: the source is one file already, and none of a machine's "
                 "files is read for it; pass on that file, or name live, root:DIRECTORY or snapshot:FILE\n"}));
   EXPECT_EQ(
       corvcim({"inventory", "--unmasked"}),

@@ -82,7 +82,7 @@ TEST(HwlocCommand, AFileThatHwlocCrashesOnIsOneLine) {
   EXPECT_EQ(run.status, 1);
   EXPECT_EQ(run.output, "");
   EXPECT_EQ(std::ranges::count(run.errors, '\n'), 1) << run;
-  EXPECT_TRUE(run.errors.starts_with("corvcim: can not read the inventory: ")) << run;
+  EXPECT_TRUE(run.errors.starts_with("corvcim: cannot read the inventory: ")) << run;
   EXPECT_NE(run.errors.find(file), std::string::npos) << run;
 }
 
@@ -106,7 +106,7 @@ TEST(HwlocCommand, ALibraryThatCanNotBeLoadedIsOneLine) {
   const std::string library = directory.write("libhwloc.so.15", "");
 
   EXPECT_EQ(withLibrary(directory), (Finished{1, "",
-                                              "corvcim: can not read the inventory: \"pu:1\": it takes hwloc: " +
+                                              "corvcim: cannot read the inventory: \"pu:1\": it takes hwloc: " +
                                                   library + ": file too short" + remedy}));
 }
 

@@ -131,13 +131,13 @@ TEST(HwlocSynthetic, WhatIsNoDescriptionIsRefused) {
       "hwloc does not understand the description; it takes levels and how many there are of each in the one above: "
       "\"package:2 l3:1 l2:4 core:1 pu:2\"";
 
-  EXPECT_EQ(complaint("hwloc-synthetic:foo"), "can not read the inventory: \"foo\": " + expected);
-  EXPECT_EQ(complaint("hwloc-synthetic:package:2 pu:"), "can not read the inventory: \"package:2 pu:\": " + expected);
+  EXPECT_EQ(complaint("hwloc-synthetic:foo"), "cannot read the inventory: \"foo\": " + expected);
+  EXPECT_EQ(complaint("hwloc-synthetic:package:2 pu:"), "cannot read the inventory: \"package:2 pu:\": " + expected);
 }
 
 TEST(HwlocSynthetic, MoreCpusThanAnInventoryCanHaveAreRefused) {
   EXPECT_EQ(complaint("hwloc-synthetic:package:4096 pu:17"),
-            "can not read the inventory: \"package:4096 pu:17\": it describes more than 65536 CPUs; describe a smaller "
+            "cannot read the inventory: \"package:4096 pu:17\": it describes more than 65536 CPUs; describe a smaller "
             "machine");
   EXPECT_NE(complaint("hwloc-synthetic:99999 99999"), "");
   EXPECT_NE(complaint("hwloc-synthetic:pu:99999999999999999999999"), "");
@@ -159,8 +159,8 @@ TEST(HwlocSynthetic, SourcesOfTheLibraryAreNotConverted) {
       "it names no description to convert; --from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION, and --inventory "
       "what the library reads";
 
-  EXPECT_EQ(complaint("live"), "can not convert the inventory: \"live\": " + end);
-  EXPECT_EQ(complaint("hwloc-synthetic:"), "can not convert the inventory: \"hwloc-synthetic:\": " + end);
+  EXPECT_EQ(complaint("live"), "cannot convert the inventory: \"live\": " + end);
+  EXPECT_EQ(complaint("hwloc-synthetic:"), "cannot convert the inventory: \"hwloc-synthetic:\": " + end);
 }
 
 }  // namespace

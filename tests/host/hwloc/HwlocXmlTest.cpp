@@ -254,7 +254,7 @@ TEST(HwlocXml, ANumberThatTwoPackagesHaveNamesNeither) {
 
 TEST(HwlocXml, WhatIsNoTopologyIsRefused) {
   const std::string expected =
-      "can not read the inventory: machine.xml: hwloc can not make a topology of it; it takes XML as lstopo of version "
+      "cannot read the inventory: machine.xml: hwloc cannot make a topology of it; it takes XML as lstopo of version "
       "2 or 1 writes it; HWLOC_XML_VERBOSE=1 lstopo -i FILE says what is wrong with it";
   const std::string whole = oneCore({}, {}).text();
 
@@ -296,7 +296,7 @@ TEST(HwlocXml, AFileThatIsNotThereIsNamed) {
     FAIL();
   } catch (const Tarn::Inventory::InventoryError& error) {
     EXPECT_STREQ(error.what(),
-                 "can not read the inventory: /nowhere.xml: no such file or directory; name an XML file as lstopo "
+                 "cannot read the inventory: /nowhere.xml: no such file or directory; name an XML file as lstopo "
                  "writes it");
   }
 }

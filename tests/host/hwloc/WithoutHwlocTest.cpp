@@ -7,7 +7,7 @@ namespace {
 
 Finished refused(const std::string& name) {
   return {1, "",
-          "corvcim: can not read the inventory: " + name +
+          "corvcim: cannot read the inventory: " + name +
               ": this corvcim was built without hwloc; use one that was built where libhwloc-dev is installed for its "
               "architecture, and read its JSON with json:FILE\n"};
 }

@@ -141,7 +141,7 @@ TEST_F(Cursor, ConvertsEveryPathThereAndBack) {
     for (cursor.selectNode(type); cursor; ++cursor) {
       const std::string path = cursor.getPathToNode();
       const std::string printable = cursor.convertPathToString(path);
-      EXPECT_NE(printable, path) << "the forms can not be mistaken for each other";
+      EXPECT_NE(printable, path) << "the forms cannot be mistaken for each other";
       EXPECT_EQ(cursor.convertStringToPath(printable), path);
       const std::string parent = cursor.getPathToParentNode();
       EXPECT_EQ(cursor.convertStringToPath(cursor.convertPathToString(parent)), parent);

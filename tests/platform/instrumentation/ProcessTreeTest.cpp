@@ -71,7 +71,7 @@ TEST_F(ProcessTree, AFailedLoadIsToldAndTriedAgain) {
       const Instrumentation cursor;
       FAIL() << "there is nothing to read";
     } catch (const std::exception& error) {
-      EXPECT_EQ(error.what(), "can not read the inventory: " + file +
+      EXPECT_EQ(error.what(), "cannot read the inventory: " + file +
                                   ": no such file or directory; name a file that holds an inventory as JSON");
     }
   }
@@ -94,7 +94,7 @@ TEST_F(ProcessTree, AFailedLoadIsLoggedOnce) {
   const std::string text = contentsOf(log);
   EXPECT_EQ(std::ranges::count(text, '\n'), 2) << text;
   EXPECT_NE(text.find(" error Corvane.Inventory "), std::string::npos) << text;
-  EXPECT_NE(text.find(" can not read the inventory: /nothing/here: no such file or directory; "), std::string::npos)
+  EXPECT_NE(text.find(" cannot read the inventory: /nothing/here: no such file or directory; "), std::string::npos)
       << text;
 }
 

@@ -26,7 +26,7 @@ std::string ScratchDirectory::write(const std::string& path, const std::string& 
   std::ofstream stream(file, std::ios::binary);
   stream << contents;
   if (!stream.flush()) {
-    throw std::runtime_error("can not write " + file.string());
+    throw std::runtime_error("cannot write " + file.string());
   }
   return file.string();
 }
@@ -34,7 +34,7 @@ std::string ScratchDirectory::write(const std::string& path, const std::string& 
 std::string contentsOf(const std::string& file) {
   std::ifstream stream(file, std::ios::binary);
   if (!stream) {
-    throw std::runtime_error("can not read " + file);
+    throw std::runtime_error("cannot read " + file);
   }
   return {std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
 }

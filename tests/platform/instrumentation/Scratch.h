@@ -25,7 +25,7 @@ class ScratchDirectory {
   std::filesystem::path directory_;
 };
 
-/// The contents of a file; the test fails where it can not be read.
+/// The contents of a file; the test fails where it cannot be read.
 std::string contentsOf(const std::string& file);
 
 }  // namespace Tarn::Inventory

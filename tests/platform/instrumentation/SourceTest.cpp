@@ -77,7 +77,7 @@ TEST(Source, ACaptureOfTheLiveMachineGivesTheSameTree) {
 TEST(Source, RefusesWhatNamesNoSource) {
   for (const char* text : {"", "foo", "foo:x", "json", "json:", "root", "root:", "live:", "live:x", "Live", " live",
                            "snapshot", "snapshot:", "smbios", "smbios:"}) {
-    EXPECT_EQ(refusalOf(text), "can not read the inventory: \"" + std::string(text) +
+    EXPECT_EQ(refusalOf(text), "cannot read the inventory: \"" + std::string(text) +
                                    "\": it names no source of an inventory; set CORVANE_INVENTORY, or inventory in the "
                                    "configuration, to live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE");
   }
@@ -136,13 +136,13 @@ TEST(Source, RefusesWhatIsNoDump) {
   const std::string fixtureFile = fixture + "root.txt";
   EXPECT_THAT(
       refusalOf("smbios:" + fixtureFile),
-      testing::AllOf(testing::StartsWith("can not read the SMBIOS dump: " + fixtureFile + ": SMBIOS entry point"),
+      testing::AllOf(testing::StartsWith("cannot read the SMBIOS dump: " + fixtureFile + ": SMBIOS entry point"),
                      testing::EndsWith("; name a file that dmidecode --dump-bin wrote")));
   EXPECT_EQ(refusalOf("smbios:/nothing"),
-            "can not read the inventory: /nothing: no such file or directory; name a file that dmidecode --dump-bin "
+            "cannot read the inventory: /nothing: no such file or directory; name a file that dmidecode --dump-bin "
             "wrote");
   EXPECT_EQ(refusalOf("smbios:" + dump + "+root:/nothing"),
-            "can not read the inventory: /nothing: no such file or directory; name a captured root directory, or a "
+            "cannot read the inventory: /nothing: no such file or directory; name a captured root directory, or a "
             "file of captured files");
 }
 
@@ -154,33 +154,33 @@ TEST(Source, RefusesADumpWithoutSockets) {
   const std::string file = directory.write("dump.bin", tables.dump());
 
   EXPECT_EQ(refusalOf("smbios:" + file),
-            "can not read the inventory: " + file +
+            "cannot read the inventory: " + file +
                 ": its tables tell of no processor socket; name a dump of a machine's SMBIOS tables, or join it with "
                 "another source: smbios:FILE+live");
 }
 
 TEST(Source, RefusesFilesThatCanNotBeRead) {
   EXPECT_EQ(refusalOf("json:/nothing"),
-            "can not read the inventory: /nothing: no such file or directory; name a file that holds an inventory as "
+            "cannot read the inventory: /nothing: no such file or directory; name a file that holds an inventory as "
             "JSON");
   EXPECT_EQ(refusalOf("json:/"),
-            "can not read the inventory: /: is a directory; name a file that holds an inventory as JSON");
+            "cannot read the inventory: /: is a directory; name a file that holds an inventory as JSON");
   EXPECT_EQ(refusalOf("root:/nothing"),
-            "can not read the inventory: /nothing: no such file or directory; name a captured root directory, or a "
+            "cannot read the inventory: /nothing: no such file or directory; name a captured root directory, or a "
             "file of captured files");
 }
 
 TEST(Source, RefusesARootWithoutAnyProcessor) {
   const ScratchDirectory directory;
   EXPECT_EQ(refusalOf("root:" + directory.name()),
-            "can not read the inventory: " + directory.name() +
+            "cannot read the inventory: " + directory.name() +
                 "/sys/devices/system/cpu: neither this directory nor /proc/cpuinfo tells of a processor; mount sysfs "
                 "on /sys and proc on /proc");
 }
 
 TEST(Source, RefusesAFileThatHoldsNoCapture) {
   EXPECT_EQ(refusalOf("root:" + fixture + "tree.json"),
-            "can not read the captured files: " + fixture +
+            "cannot read the captured files: " + fixture +
                 "tree.json, line 1: no file name with a colon behind it; write name: contents");
 }
 

@@ -72,7 +72,7 @@ TEST_F(DiffCommand, AFieldToLeaveOutThatThereIsNotIsNamed) {
 TEST_F(DiffCommand, TroubleGivesStatusTwo) {
   const std::string machine = source("a.json", smallBoard());
   const std::string why =
-      "corvcim: can not read the inventory: /nowhere.json: no such file or directory; name a file that holds an "
+      "corvcim: cannot read the inventory: /nowhere.json: no such file or directory; name a file that holds an "
       "inventory as JSON\n";
 
   EXPECT_EQ(corvcim({"diff", machine, "json:/nowhere.json"}), (Finished{2, "", why}));

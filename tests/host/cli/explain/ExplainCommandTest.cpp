@@ -300,7 +300,7 @@ TEST(ExplainCommand, AClassThatCanNotBeAskedIsAFailure) {
 
 TEST(ExplainCommand, AnInventoryThatCanNotBeReadIsAnError) {
   EXPECT_EQ(corvcim({"-i", "json:/nowhere.json", "explain"}).errors,
-            "corvcim: can not read the inventory: /nowhere.json: no such file or directory; name a file that holds an "
+            "corvcim: cannot read the inventory: /nowhere.json: no such file or directory; name a file that holds an "
             "inventory as JSON\n");
 }
 

@@ -82,38 +82,37 @@ TEST(Archive, NamesEachDirectoryOnce) {
 
 TEST(Archive, RefusesWhatIsNone) {
   EXPECT_EQ(refusalOf("[sys\n"),
-            "can not read the captured files: root.txt, line 1: a directory without its closing bracket; "
+            "cannot read the captured files: root.txt, line 1: a directory without its closing bracket; "
             "write [sys/devices/system/cpu]");
   EXPECT_EQ(refusalOf("# x\nonline: 0\n"),
-            "can not read the captured files: root.txt, line 2: a file before the first directory; begin with a line "
+            "cannot read the captured files: root.txt, line 2: a file before the first directory; begin with a line "
             "such as [sys/devices/system/cpu]");
   EXPECT_EQ(refusalOf("[a]\nonline\n"),
-            "can not read the captured files: root.txt, line 2: no file name with a colon behind it; write name: "
+            "cannot read the captured files: root.txt, line 2: no file name with a colon behind it; write name: "
             "contents");
   EXPECT_EQ(refusalOf("[a]\nb: 1\nb: 1\n"),
-            "can not read the captured files: root.txt, line 3: a/b is there twice; remove one of the two");
+            "cannot read the captured files: root.txt, line 3: a/b is there twice; remove one of the two");
   EXPECT_EQ(refusalOf("[a]\n\tx\n"),
-            "can not read the captured files: root.txt, line 2: a line of contents that belongs to no file; begin with "
+            "cannot read the captured files: root.txt, line 2: a line of contents that belongs to no file; begin with "
             "a line name: above it");
   EXPECT_EQ(refusalOf("[a]\nb! EOOPS\n"),
-            "can not read the captured files: root.txt, line 2: unknown error EOOPS; use a name such as EACCES, EIO or "
+            "cannot read the captured files: root.txt, line 2: unknown error EOOPS; use a name such as EACCES, EIO or "
             "ENOENT, or the error's number");
   EXPECT_EQ(refusalOf("[a]\nb/c: 1\n"),
-            "can not read the captured files: root.txt, line 2: a file name with a slash; write the directory in "
+            "cannot read the captured files: root.txt, line 2: a file name with a slash; write the directory in "
             "brackets on a line above");
   for (const char* digits : {"0", "012", "0G", "AB", "01 02"}) {
     EXPECT_EQ(refusalOf("[a]\nb#\n\t0102\n\t" + std::string(digits) + '\n'),
-              "can not read the captured files: root.txt, line 4: bytes that are not pairs of the digits 0 to 9 and a "
+              "cannot read the captured files: root.txt, line 4: bytes that are not pairs of the digits 0 to 9 and a "
               "to f; write two digits for each byte");
   }
   for (const char* listing : {"./: one", "./# 00"}) {
-    EXPECT_EQ(
-        refusalOf("[a]\n" + std::string(listing) + '\n'),
-        "can not read the captured files: root.txt, line 2: a directory's names beside its own; write them below, "
-        "one on each line, behind a tab");
+    EXPECT_EQ(refusalOf("[a]\n" + std::string(listing) + '\n'),
+              "cannot read the captured files: root.txt, line 2: a directory's names beside its own; write them below, "
+              "one on each line, behind a tab");
   }
   EXPECT_EQ(refusalOf("[a]\n./:\n./:\n"),
-            "can not read the captured files: root.txt, line 3: a/./ is there twice; remove one of the two");
+            "cannot read the captured files: root.txt, line 3: a/./ is there twice; remove one of the two");
 }
 
 TEST(Archive, HoldsFilesThatAreNoText) {

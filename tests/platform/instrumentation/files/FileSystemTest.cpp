@@ -179,7 +179,7 @@ TEST(FileSystem, RefusesADirectoryThatIsNotThere) {
     FAIL();
   } catch (const InventoryError& error) {
     EXPECT_STREQ(error.what(),
-                 "can not read the inventory: /nothing/here: no such file or directory; name a directory that holds "
+                 "cannot read the inventory: /nothing/here: no such file or directory; name a directory that holds "
                  "sys/ and proc/ of a machine");
   }
 }

@@ -73,7 +73,7 @@ int main(int argc, char** argv) {
     std::ofstream file(std::string(arguments[1]) + '/' + name, std::ios::binary);
     file << bytes;
     if (!file.flush()) {
-      std::fprintf(stderr, "can not write %s/%s\n", arguments[1], name);
+      std::fprintf(stderr, "cannot write %s/%s\n", arguments[1], name);
       return 1;
     }
   }

@@ -167,7 +167,7 @@ TEST(SmbiosMask, TakesWhatFollowsTheTable) {
 TEST(SmbiosMask, TakesEverythingWhereNothingCanBeDecoded) {
   std::string table = "a serial number";
 
-  EXPECT_THAT(maskTable("no entry point", table), ElementsAre("everything, as its entry point can not be read"));
+  EXPECT_THAT(maskTable("no entry point", table), ElementsAre("everything, as its entry point cannot be read"));
   EXPECT_EQ(table, "XXXXXXXXXXXXXXX");
 }
 
@@ -281,7 +281,7 @@ TEST(Masking, TakesATableWithoutItsEntryPointWhole) {
   files["sys/firmware/dmi/tables/DMI"] = {"serial"};
 
   EXPECT_THAT(maskIdentifiers(files),
-              ElementsAre("sys/firmware/dmi/tables/DMI: everything, as its entry point can not be read"));
+              ElementsAre("sys/firmware/dmi/tables/DMI: everything, as its entry point cannot be read"));
 }
 
 }  // namespace

@@ -136,7 +136,7 @@ TEST(Snapshot, OfWhatGivesNoInventoryIsTakenAllTheSame) {
 TEST(Snapshot, OfWhatIsOneFileAlreadyIsRefused) {
   EXPECT_EQ(
       refusalOf([] { takeSnapshot("json:x.json", Identifiers::Masked, "test"); }),
-      "can not take a snapshot: json:x.json: the source is one file already, and none of a machine's files is read "
+      "cannot take a snapshot: json:x.json: the source is one file already, and none of a machine's files is read "
       "for it; pass on that file, or name live, root:DIRECTORY or snapshot:FILE");
 }
 
@@ -144,7 +144,7 @@ TEST(Snapshot, OfADumpAloneIsRefused) {
   const std::string dump = "smbios:" + fixtures + "smbios/many-cores/dump.bin";
 
   EXPECT_EQ(refusalOf([&] { takeSnapshot(dump, Identifiers::Masked, "test"); }),
-            "can not take a snapshot: " + dump +
+            "cannot take a snapshot: " + dump +
                 ": the source is one file already, and none of a machine's files is read for it; pass on that file, or "
                 "name live, root:DIRECTORY or snapshot:FILE");
 }
@@ -152,18 +152,18 @@ TEST(Snapshot, OfADumpAloneIsRefused) {
 TEST(Snapshot, IsKnownByItsFirstLine) {
   for (const char* text : {"", "[proc]\ncpuinfo: x\n", "# corvane-snapshot 2\n", "# corvane-snapshot 10\n"}) {
     EXPECT_EQ(refusalOf([&] { readSnapshot(text, "file"); }),
-              "can not read the snapshot: file, line 1: it does not begin with \"# corvane-snapshot 1\"; take it with "
+              "cannot read the snapshot: file, line 1: it does not begin with \"# corvane-snapshot 1\"; take it with "
               "corvcim snapshot; captured files without this line are a source root:FILE");
   }
   EXPECT_EQ(readSnapshot("# corvane-snapshot 1\n[a]\nb: 1\n", "file").size(), 1U);
   EXPECT_EQ(refusalOf([] { readSnapshot("# corvane-snapshot 1\nb: 1\n", "file"); }),
-            "can not read the captured files: file, line 2: a file before the first directory; begin with a line such "
+            "cannot read the captured files: file, line 2: a file before the first directory; begin with a line such "
             "as [sys/devices/system/cpu]");
 }
 
 TEST(Snapshot, ThatIsNotThereIsAnError) {
   EXPECT_EQ(refusalOf([] { loadInventory("snapshot:/nothing"); }),
-            "can not read the inventory: /nothing: no such file or directory; name a file that corvcim snapshot wrote");
+            "cannot read the inventory: /nothing: no such file or directory; name a file that corvcim snapshot wrote");
 }
 
 }  // namespace

@@ -100,7 +100,7 @@ TEST_P(BrokenJson, IsRefusedWithThePlaceAndTheReason) {
     readJson(broken.text, "box.json");
     FAIL() << "was accepted";
   } catch (const InventoryError& error) {
-    EXPECT_EQ(error.what(), "can not read the inventory: box.json" + broken.where + ": " + broken.why +
+    EXPECT_EQ(error.what(), "cannot read the inventory: box.json" + broken.where + ": " + broken.why +
                                 "; correct the file; the format is described in docs/inventory.md");
   }
 }
@@ -157,12 +157,12 @@ INSTANTIATE_TEST_SUITE_P(
                 R"({"type": "processor", "path": "P", "status": 1}, {"type": "processor", "path": "P", "status": 1})"),
             ", /nodes/1/path", "is the path of /nodes/0, too"},
         Broken{document(R"({"type": "core", "path": "C", "status": 1})"), ", /nodes/0/type",
-               "is \"core\", which can not stand at the top"},
+               "is \"core\", which cannot stand at the top"},
         Broken{processor(R"("children": [{"type": "system", "path": "S", "status": 1}])"), ", /nodes/0/children/0/type",
-               "is \"system\", which can not stand below a processor"},
+               "is \"system\", which cannot stand below a processor"},
         Broken{processor(R"("children": [{"type": "core", "path": "C", "status": 1,
                               "children": [{"type": "cache", "path": "L", "status": 1}]}])"),
-               ", /nodes/0/children/0/children/0/type", "is \"cache\", which can not stand below a core"},
+               ", /nodes/0/children/0/children/0/type", "is \"cache\", which cannot stand below a core"},
         Broken{document(
                    R"({"type": "processor", "path": "P", "status": 1}, {"type": "system", "path": "S", "status": 1})"),
                ", /nodes/1/path", "system \"S\": the system is the first node, and the only one of its type"},
