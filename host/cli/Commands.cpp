@@ -2,14 +2,18 @@
 
 #include <tarn/Common.h>
 
+#include <algorithm>
 #include <cstdlib>
 #include <memory>
+#include <string>
+#include <vector>
 
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"
 #include "host/cli/CrashReport.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
+#include "host/cli/LibraryErrors.h"
 #include "host/cli/Operations.h"
 #include "host/cli/Overview.h"
 #include "host/cli/SnapshotCommand.h"
@@ -66,6 +70,30 @@ std::string treeOutput(Format format, std::size_t width) {
   }
 }
 
+Outcome askLibraries(const Options& options) {
+  const LibraryFiles files = libraryFiles(options);
+  if (options.verb->verb == Verb::Explain) {
+    return explainValues(files, options);
+  }
+  if (options.verb->verb == Verb::Overview) {
+    Dispatcher dispatcher(files);
+    return showOverview(dispatcher, options.nameSpace);
+  }
+  return performOperation(files, options);
+}
+
+/// What the libraries wrote beside their answers, as far as no error says it anyway.
+std::vector<std::string> remarksOf(const std::vector<std::string>& written, const std::vector<std::string>& errors) {
+  std::vector<std::string> remarks;
+  for (const std::string& line : written) {
+    const auto saysIt = [&](const std::string& error) { return error.find(line) != std::string::npos; };
+    if (std::ranges::none_of(errors, saysIt)) {
+      remarks.push_back("the provider library wrote: " + line);
+    }
+  }
+  return remarks;
+}
+
 }  // namespace
 
 Outcome runCommand(const Options& options, std::size_t width) {
@@ -84,15 +112,10 @@ Outcome runCommand(const Options& options, std::size_t width) {
     default:
       break;
   }
-  const LibraryFiles files = libraryFiles(options);
-  if (options.verb->verb == Verb::Explain) {
-    return explainValues(files, options);
-  }
-  if (options.verb->verb == Verb::Overview) {
-    Dispatcher dispatcher(files);
-    return showOverview(dispatcher, options.nameSpace);
-  }
-  return performOperation(files, options);
+  LibraryErrors written;
+  Outcome outcome = askLibraries(options);
+  outcome.remarks = remarksOf(written.take(), outcome.errors);
+  return outcome;
 }
 
 }  // namespace Corvcim

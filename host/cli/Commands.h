@@ -14,7 +14,8 @@ namespace Corvcim {
 struct Outcome {
   std::string output;
   std::vector<std::string> errors;
-  bool differs = false;  ///< two inventories were compared, and are not the same
+  bool differs = false;                ///< two inventories were compared, and are not the same
+  std::vector<std::string> remarks{};  ///< further lines for standard error; nothing has failed by them
 };
 
 /// Runs the command. Sets CORVANE_INVENTORY and CORVANE_LANGUAGE in this process as the options ask.

@@ -7,6 +7,9 @@
 #include <cstddef>
 #include <cstdlib>
 
+#include "host/cli/LibraryErrors.h"
+#include "host/cli/StandardStreams.h"
+
 namespace Corvcim {
 namespace {
 
@@ -27,7 +30,8 @@ void append(std::string_view text) {
 }
 
 void report(int) {
-  [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, message.data(), length);
+  LibraryErrors::show();
+  writeToStandardError({message.data(), length});
   _exit(EXIT_FAILURE);
 }
 

@@ -2,6 +2,7 @@
 
 #include <stdexcept>
 #include <utility>
+#include <vector>
 
 #include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
@@ -103,6 +104,37 @@ bool isEmpty(const Response& response) {
   return response.instances.empty() && response.paths.empty();
 }
 
+bool mentions(const std::optional<std::string>& text, const std::string& cause) {
+  return text && text->find(cause) != std::string::npos;
+}
+
+/// The error of the inventory where that is why an answer is empty. A provider that could not read it says so, finds
+/// nothing, or is content with nothing; what is wrong with the request or the library is wrong all the same.
+std::optional<std::string> unreadInventory(const Response& response) {
+  const std::optional<std::string> error = isEmpty(response) ? inventoryError() : std::nullopt;
+  const bool isCause =
+      error && (response.ok() || response.rc == CMPI_RC_ERR_NOT_FOUND || mentions(response.message, *error));
+  return isCause ? error : std::nullopt;
+}
+
+/// A line for each failure that has another cause than `known`, which is said elsewhere.
+std::vector<std::string> describeFailures(const Operation& operation, const Answer& answer,
+                                          const std::optional<std::string>& known) {
+  std::vector<std::string> lines;
+  if (!answer.response.ok() && answer.failures.empty() && !known) {
+    lines.push_back(describeStatus(answer.response.rc, answer.response.message));
+  }
+  for (const ClassFailure& failure : answer.failures) {
+    if (known && mentions(failure.message, *known)) {
+      continue;
+    }
+    // An operation on one class has said already which one it is.
+    const std::string className = sameName(failure.className, operation.path.className) ? "" : failure.className + ": ";
+    lines.push_back(className + describeStatus(failure.rc, failure.message));
+  }
+  return lines;
+}
+
 }  // namespace
 
 std::string describeStatus(CMPIrc rc, const std::optional<std::string>& message) {
@@ -131,19 +163,14 @@ Outcome performOperation(const LibraryFiles& files, const Options& options) {
     const Answer answer = ask(files, operation);
     if (answer.response.ok()) {
       outcome.output = write(options.format, operation, answer.response);
-    } else if (answer.failures.empty()) {
-      outcome.errors.push_back(what + describeStatus(answer.response.rc, answer.response.message));
     }
-    for (const ClassFailure& failure : answer.failures) {
-      // An operation on one class has said already which one it is.
-      const std::string className =
-          sameName(failure.className, operation.path.className) ? "" : failure.className + ": ";
-      outcome.errors.push_back(what + className + describeStatus(failure.rc, failure.message));
+    const std::optional<std::string> unreadable = unreadInventory(answer.response);
+    outcome.errors = describeFailures(operation, answer, unreadable);
+    if (unreadable) {
+      outcome.errors.push_back(*unreadable);
     }
-    if (isEmpty(answer.response)) {
-      if (const std::optional<std::string> error = inventoryError()) {
-        outcome.errors.push_back(what + *error);
-      }
+    for (std::string& error : outcome.errors) {
+      error.insert(0, what);
     }
   } catch (const std::exception& error) {
     outcome.errors.push_back(what + error.what());

@@ -8,11 +8,15 @@
 #include <stdexcept>
 #include <string>
 #include <system_error>
+#include <utility>
 
 #include "host/cli/Text.h"
 
 namespace Corvcim {
 namespace {
+
+/// The caller's standard error.
+int standardError = STDERR_FILENO;
 
 /// 0, or the number of the error.
 int writeAll(int descriptor, std::string_view text) {
@@ -54,7 +58,28 @@ void writeOutput(std::string_view text) {
 }
 
 void writeError(std::string_view text) {
-  writeAll(STDERR_FILENO, "corvcim: " + toPrintable(text) + '\n');
+  writeToStandardError("corvcim: " + toPrintable(text) + '\n');
+}
+
+void writeToStandardError(std::string_view text) {
+  writeAll(standardError, text);
+}
+
+bool replaceStandardError(int descriptor) {
+  const int callers = fcntl(STDERR_FILENO, F_DUPFD_CLOEXEC, 0);
+  if (callers == -1 || dup2(descriptor, STDERR_FILENO) == -1) {
+    if (callers != -1) {
+      close(callers);
+    }
+    return false;
+  }
+  standardError = callers;
+  return true;
+}
+
+void restoreStandardError() {
+  dup2(standardError, STDERR_FILENO);
+  close(std::exchange(standardError, STDERR_FILENO));
 }
 
 }  // namespace Corvcim

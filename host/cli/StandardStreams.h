@@ -17,8 +17,15 @@ std::size_t terminalWidth();
 /// the program quietly, as SIGPIPE does. Throws std::runtime_error if the output cannot be written.
 void writeOutput(std::string_view text);
 
-/// Writes "corvcim: TEXT" as one line to standard error.
+/// Writes "corvcim: TEXT" as one line to standard error, the caller's even where it is replaced.
 void writeError(std::string_view text);
+
+/// Writes the text as it is to the caller's standard error. The handler of a signal may call it.
+void writeToStandardError(std::string_view text);
+
+/// Puts a file in the place of standard error, until it is restored. Whether that could be done.
+bool replaceStandardError(int descriptor);
+void restoreStandardError();
 
 }  // namespace Corvcim
 

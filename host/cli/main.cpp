@@ -36,6 +36,9 @@ int run(const Corvcim::Options& options) {
   for (const std::string& error : outcome.errors) {
     Corvcim::writeError(error);
   }
+  for (const std::string& remark : outcome.remarks) {
+    Corvcim::writeError(remark);
+  }
   return !outcome.errors.empty() ? failureStatus(options) : outcome.differs ? Differs : Success;
 }
 

@@ -4,10 +4,13 @@
 #include <cmpimacs.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <csignal>
 #include <cstdlib>
+#include <iterator>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 
 #include "host/broker/Request.h"
 #include "tests/host/broker/ScriptedProvider.h"
@@ -53,56 +56,89 @@ std::string describe(const ScriptedProvider& provider, const ProviderCall& call)
   return result;
 }
 
-CMPIStatus perform(const std::string& own, const ScriptedProvider& provider, const ProviderCall& call) {
-  const std::string nameSpace = CMGetCharPtr(CMGetNameSpace(call.path, nullptr));
-  const std::string className = CMGetCharPtr(CMGetClassName(call.path, nullptr));
-  ++requests;
-  if (nameSpace == "crash") {
-    raise(SIGKILL);
-  }
-  if (nameSpace == "exit") {
-    _exit(3);
-  }
-  if (nameSpace == "throw") {
-    throw std::runtime_error("thrown");
-  }
-  if (nameSpace == "throw-number") {
-    throw 1;
-  }
-  if (nameSpace == "none") {
-    return ok();
-  }
-  if (nameSpace == "fail" || nameSpace == "fail " + own) {
-    CMReturnWithChars(broker, CMPI_RC_ERR_ACCESS_DENIED, "denied");
-  }
-  if (nameSpace == "count") {
-    returnInstance(call, className.c_str(), std::to_string(requests));
-    return ok();
-  }
-  if (nameSpace == "upcall") {
-    return callUp(call, "plain", "HALDA_ComputerSystem");
-  }
-  if (nameSpace == "upcall-own") {
-    return callUp(call, "plain", "HALDA_CPUMemory");
-  }
-  if (nameSpace == "upcall-unserved") {
-    return callUp(call, "plain", "CIM_Fan");
-  }
-  if (nameSpace == "loop") {
-    return callUp(call, "loop", className.c_str());
-  }
-  if (nameSpace == "upcall-crash") {
-    return callUp(call, "crash", "HALDA_CPUMemory");
-  }
-  if (provider.lastOperation.ends_with("Names")) {
-    CMReturnObjectPath(call.result, call.path);
-    return ok();
-  }
-  returnInstance(call, own.c_str(), describe(provider, call));
-  if (nameSpace == "two") {
-    returnInstance(call, own.c_str(), "second");
+struct Asked {
+  const std::string& own;  // the provider's class
+  const ScriptedProvider& provider;
+  const ProviderCall& call;
+  std::string className;  // as the request spells it
+};
+
+// The path, or an instance that tells what the provider was given.
+CMPIStatus answerPlainly(const Asked& asked) {
+  if (asked.provider.lastOperation.ends_with("Names")) {
+    CMReturnObjectPath(asked.call.result, asked.call.path);
+  } else {
+    returnInstance(asked.call, asked.own.c_str(), describe(asked.provider, asked.call));
   }
   return ok();
+}
+
+CMPIStatus answerTwice(const Asked& asked) {
+  const CMPIStatus status = answerPlainly(asked);
+  if (!asked.provider.lastOperation.ends_with("Names")) {
+    returnInstance(asked.call, asked.own.c_str(), "second");
+  }
+  return status;
+}
+
+CMPIStatus refuse(const Asked&) {
+  CMReturnWithChars(broker, CMPI_RC_ERR_ACCESS_DENIED, "denied");
+}
+
+void writeToStandardError(std::string_view text) {
+  [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, text.data(), text.size());
+}
+
+struct Action {
+  std::string_view nameSpace;
+  CMPIStatus (*perform)(const Asked& asked);
+};
+
+constexpr Action actions[] = {
+    {"plain", answerPlainly},
+    {"two", answerTwice},
+    {"none", [](const Asked&) { return ok(); }},
+    {"fail", refuse},
+    {"count",
+     [](const Asked& asked) {
+       returnInstance(asked.call, asked.className.c_str(), std::to_string(requests));
+       return ok();
+     }},
+    {"crash",
+     [](const Asked&) {
+       raise(SIGKILL);
+       return ok();
+     }},
+    {"exit", [](const Asked&) -> CMPIStatus { _exit(3); }},
+    {"throw", [](const Asked&) -> CMPIStatus { throw std::runtime_error("thrown"); }},
+    {"throw-number", [](const Asked&) -> CMPIStatus { throw 1; }},
+    {"write",
+     [](const Asked& asked) {
+       writeToStandardError("strange\x07\n\nstrange\x07\n");
+       return answerPlainly(asked);
+     }},
+    {"write-abort",
+     [](const Asked&) -> CMPIStatus {
+       writeToStandardError("last words\n");
+       std::abort();
+     }},
+    {"upcall", [](const Asked& asked) { return callUp(asked.call, "plain", "HALDA_ComputerSystem"); }},
+    {"upcall-own", [](const Asked& asked) { return callUp(asked.call, "plain", "HALDA_CPUMemory"); }},
+    {"upcall-unserved", [](const Asked& asked) { return callUp(asked.call, "plain", "CIM_Fan"); }},
+    {"upcall-crash", [](const Asked& asked) { return callUp(asked.call, "crash", "HALDA_CPUMemory"); }},
+    {"loop", [](const Asked& asked) { return callUp(asked.call, "loop", asked.className.c_str()); }},
+};
+
+// "fail CLASS" is for the provider of that class; the others answer plainly, as to any namespace without a row.
+CMPIStatus perform(const std::string& own, const ScriptedProvider& provider, const ProviderCall& call) {
+  const std::string nameSpace = CMGetCharPtr(CMGetNameSpace(call.path, nullptr));
+  const Asked asked{own, provider, call, CMGetCharPtr(CMGetClassName(call.path, nullptr))};
+  ++requests;
+  if (nameSpace == "fail " + own) {
+    return refuse(asked);
+  }
+  const auto* const action = std::ranges::find(actions, nameSpace, &Action::nameSpace);
+  return action == std::end(actions) ? answerPlainly(asked) : action->perform(asked);
 }
 
 ScriptedProvider makeProvider(const std::string& own, ScriptedProvider& self) {
