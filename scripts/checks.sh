@@ -17,10 +17,18 @@ tracked() {
   fi
 }
 
-# Captures under tests/fixtures are kept as the machine wrote them.
 check_hygiene() {
-  local texts sources file lines status=0
+  local status=0 check
   cd "$root" || return
+  for check in check_texts check_versions check_documented_messages check_undocumented_messages; do
+    $check || status=1
+  done
+  return $status
+}
+
+# Captures under tests/fixtures are kept as the machine wrote them.
+check_texts() {
+  local texts sources file lines status=0
   mapfile -t texts < <(tracked | grep -v '^tests/fixtures/' | xargs -r -d '\n' grep -lI .)
   mapfile -t sources < <(printf '%s\n' "${texts[@]}" | grep -E '\.(h|cpp|c|cmake|sh)$|CMakeLists\.txt$|^scripts/')
 
@@ -32,6 +40,27 @@ check_hygiene() {
     lines=$(wc -l <"$file")
     ((lines <= longest_source)) || { echo "$file: $lines lines, more than $longest_source" && status=1; }
   done
+  return $status
+}
+
+# same_version VERSION FILE SED-COMMAND: whether the versions that the command prints are all this one.
+same_version() {
+  local found
+  found=$(sed -En "$3" "$2" | sort -u | xargs)
+  [[ $found == "$1" ]] || { echo "$2: version ${found:-missing}, but $1 in CMakeLists.txt" && return 1; }
+}
+
+# The build takes the version from CMakeLists.txt; these places cannot, and have it once more.
+check_versions() {
+  local version number='([0-9]+(\.[0-9]+)+)' status=0 file
+  version=$(sed -En "s/^project\(.* VERSION $number.*/\1/p" CMakeLists.txt)
+  same_version "$version" CHANGELOG.md "/^## /{s/^## $number.*/\1/p;q}" || status=1
+  same_version "$version" docs/brokers.md "s/.*corvane-cpu-provider_${number}_.*/\1/p" || status=1
+  for file in schema/*.mof; do
+    same_version "$version" "$file" "s/.*Version\(\"$number\"\).*/\1/p" || status=1
+  done
+  same_version "$version" packaging/rpm/corvane-cpu.spec "s/^Version: *$number$/\1/p" || status=1
+  same_version "$version" packaging/rpm/corvane-cpu.spec "/^\* /{s/.* - $number-[0-9]+$/\1/p;q}" || status=1
   return $status
 }
 
