@@ -20,9 +20,14 @@ bool isNull(const Object* object) {
   return object == nullptr || object->hdl == nullptr;
 }
 
-/// The text, "" for NULL. It lives as long as the string.
+/// The text, or NULL when there is none. It lives as long as the string.
+inline const char* charsOrNull(const CMPIString* string, CMPIStatus* rc = nullptr) {
+  return isNull(string) ? nullptr : CMGetCharsPtr(string, rc);
+}
+
+/// The same with "" for NULL.
 inline const char* charsOf(const CMPIString* string, CMPIStatus* rc = nullptr) {
-  const char* chars = isNull(string) ? nullptr : CMGetCharsPtr(string, rc);
+  const char* chars = charsOrNull(string, rc);
   return chars != nullptr ? chars : "";
 }
 

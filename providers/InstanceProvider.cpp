@@ -10,7 +10,7 @@ bool lookUp(const InstanceProvider& provider, const InstanceRequest& request, CM
             CMPIStatus* status) {
   const auto& own = provider.getInstance;
   if (key != nullptr && own.tracesKey) {
-    provider.events.variable(own.key, charsOf(key), request.line, request.function);
+    provider.events.variable(own.key, charsOrNull(key), request.line, request.function);
   }
   CPUObjFactory* factory = provider.factory();
   const unsigned short code = key == nullptr
