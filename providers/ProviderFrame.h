@@ -60,14 +60,13 @@ inline CMPIStatus notSupported() {
 using Instances = std::vector<CMPIInstance*>;
 using Paths = std::vector<CMPIObjectPath*>;
 
-/// The text of a string key; NULL when the path does not have it or it is no string.
+/// The text of a string key; NULL when the path does not have it or it is no string. Minimal brokers
+/// leave the type of a string at 0.
 inline CMPIString* stringKey(const CMPIObjectPath* path, const char* name, CMPIStatus* status = nullptr) {
   const CMPIData key = CMGetKey(path, name, status);
   constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
-  if (key.type != CMPI_string || (key.state & noValue) != 0 || isNull(key.value.string)) {
-    return nullptr;
-  }
-  return key.value.string;
+  const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
+  return mayBeString && (key.state & noValue) == 0 && !isNull(key.value.string) ? key.value.string : nullptr;
 }
 
 /// Results are counted in 16 bits.
