@@ -158,8 +158,7 @@ CMPIStatus CPUConcreteComponent_AssociatorNames(CMPIAssociationMI* /*mi*/, const
 
 CMPIStatus CPUConcreteComponent_References(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                            const CMPIResult* result, const CMPIObjectPath* cop,
-                                           const char* /*resultClass*/, const char* /*role*/,
-                                           const char** /*properties*/) {
+                                           const char* /*resultClass*/, const char* /*role*/, const char** properties) {
   events.providerEntry();
   CMPIStatus status = succeeded();
   CPUObjFactory* factory = factoryOfProcessorsAndCores();
@@ -176,7 +175,7 @@ CMPIStatus CPUConcreteComponent_References(CMPIAssociationMI* /*mi*/, const CMPI
     return status;
   }
   forEachReference(
-      association, {cop, templatePath}, related,
+      association, {cop, templatePath, properties, filterKeys}, related,
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
   return status;
@@ -200,7 +199,7 @@ CMPIStatus CPUConcreteComponent_ReferenceNames(CMPIAssociationMI* /*mi*/, const 
                    related)) {
     return status;
   }
-  forEachReference(association, {cop, templatePath}, related,
+  forEachReference(association, {cop, templatePath, nullptr, filterKeys}, related,
                    [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
                      const CMPIObjectPath* path = pathOf(reference);
                      if (!isNull(path)) {
