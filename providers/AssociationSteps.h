@@ -92,12 +92,14 @@ struct WalkTexts {
   FailureTexts noAssociationPath;
 };
 
-/// The near ends of a walk: all object paths of one class, and the key that leads on from them.
+/// The near ends of a walk: all object paths of one class, the key that leads on from them, and how many
+/// elements to expect at the far end of each, where that is known.
 struct NearEnds {
   const char* objectClass;
   unsigned short (CPUObjFactory::*allPaths)(const CMPIBroker*, const CMPIObjectPath*, Paths&, CMPIStatus*);
   unsigned short (CPUObjFactory::*expected)() const;
   const char* key;
+  unsigned short (CPUObjFactory::*expectedFar)() const = nullptr;
 };
 
 /// Walks over every near end and, from its key, every element that `related` finds for it. Hands each
@@ -121,6 +123,9 @@ bool forEachPair(const Association& association, CPUObjFactory* factory, const C
     }
     stampPath(near, cop);
     Instances elements;
+    if (nearEnds.expectedFar != nullptr) {
+      elements.reserve((factory->*nearEnds.expectedFar)());
+    }
     if (related(stringKey(near, nearEnds.key), elements) != 0) {
       association.events.message(LevelError, texts.noRelated, line, function);
       return false;

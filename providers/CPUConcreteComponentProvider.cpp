@@ -19,7 +19,8 @@ CORVANE_ASSOCIATION_CLEANUP(CPUConcreteComponent)
 namespace {
 
 constexpr NearEnds processors{cpuProcessorClass, &CPUObjFactory::getAllCPUProcCMPIObjPaths,
-                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID"};
+                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID",
+                              &CPUObjFactory::getNumberOfProcCoreInstances};
 
 constexpr WalkTexts instanceTexts{
     "***Can't get ConcreteComponent ObjectPaths.             Exiting EnumerateInstanceNames***",

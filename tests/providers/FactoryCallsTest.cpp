@@ -285,15 +285,21 @@ TEST_F(WalkCalls, OfElementCapabilities) {
   EXPECT_EQ(walking("HALDA_CPUElementCapabilities", OperationKind::EnumerateInstanceNames), calls("properties NULL"));
 }
 
+// Also for the cores of each processor room is made.
 TEST_F(WalkCalls, OfConcreteComponent) {
   findTwo(processorPath("a"), processorPath("b"), corePath("core"));
   const auto navigation = [](const std::string& key) {
     return "getProcessorCoreRefByProcHandle(HALDA_CPUConcreteComponent, key " + key + ", properties NULL, isObjPath 1)";
   };
-  const Calls calls = {"getFactoryInstance(1, 0, 1)", "getAllCPUProcCMPIObjPaths(HALDA_CPUConcreteComponent)",
-                       navigation("a"), navigation("b")};
-  EXPECT_EQ(walking("HALDA_CPUConcreteComponent", OperationKind::EnumerateInstances), calls);
-  EXPECT_EQ(walking("HALDA_CPUConcreteComponent", OperationKind::EnumerateInstanceNames), calls);
+  const Calls calls = {"getFactoryInstance(1, 0, 1)",
+                       "getNumberOfProcInstances()",
+                       "getAllCPUProcCMPIObjPaths(HALDA_CPUConcreteComponent)",
+                       "getNumberOfProcCoreInstances()",
+                       navigation("a"),
+                       "getNumberOfProcCoreInstances()",
+                       navigation("b")};
+  EXPECT_EQ(enumerating("HALDA_CPUConcreteComponent", OperationKind::EnumerateInstances), calls);
+  EXPECT_EQ(enumerating("HALDA_CPUConcreteComponent", OperationKind::EnumerateInstanceNames), calls);
 }
 
 TEST_F(WalkCalls, OfSystemDevice) {
