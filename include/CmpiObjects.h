@@ -20,6 +20,12 @@ bool isNull(const Object* object) {
   return object == nullptr || object->hdl == nullptr;
 }
 
+/// Whether there is a value at all. What the value holds where there is none is anybody's guess.
+inline bool hasValue(const CMPIData& data) {
+  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
+  return (data.state & noValue) == 0;
+}
+
 /// The text, or NULL when there is none. It lives as long as the string.
 inline const char* charsOrNull(const CMPIString* string, CMPIStatus* rc = nullptr) {
   return isNull(string) ? nullptr : CMGetCharsPtr(string, rc);

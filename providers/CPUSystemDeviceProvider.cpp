@@ -47,23 +47,28 @@ CMPIEnumeration* enumerateSystems(const CMPIContext* context, const CMPIObjectPa
   return upCall([&, caller = broker] { return CBEnumInstances(caller, context, systemClass, nullptr, status); });
 }
 
-/// Hands each element of an enumeration to `handle`, until that returns false. An element that the broker
-/// fails to give is left out; a broker that goes on failing would never come to the end, and is not asked on.
-template <class Handle>
-bool forEach(const CMPIEnumeration* enumeration, Handle handle) {
+/// Hands each element of an enumeration, an instance or a path, to `handle`, until that returns false. What
+/// the broker fails to give is left out; one that has given nothing for very long would never come to the end,
+/// and is not asked on.
+template <class Element, class Handle>
+bool forEach(const CMPIEnumeration* enumeration, Element* CMPIValue::*kind, Handle handle,
+             const char* function = __builtin_FUNCTION()) {
+  constexpr int patience = 1000;
   if (isNull(enumeration)) {
     return true;
   }
-  CMPIStatus last = succeeded();
+  int callsInVain = 0;
   while (CMHasNext(enumeration, nullptr) != 0) {
-    CMPIStatus status = succeeded();
-    const CMPIData element = CMGetNext(enumeration, &status);
-    if (status.rc != CMPI_RC_OK && last.rc != CMPI_RC_OK) {
+    const CMPIData data = CMGetNext(enumeration, nullptr);
+    if (hasValue(data) && !isNull(data.value.*kind)) {
+      callsInVain = 0;
+      if (!handle(data.value.*kind)) {
+        return false;
+      }
+    } else if (++callsInVain == patience) {
+      events.message(LevelError, "1000 calls in a row gave no computer system: the enumeration is given up",
+                     __builtin_LINE(), function);
       break;
-    }
-    last = status;
-    if (!handle(element.value)) {
-      return false;
     }
   }
   return true;
@@ -109,10 +114,7 @@ bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStat
   if (!answered(*status, __builtin_LINE(), function)) {
     return false;
   }
-  return forEach(systems, [&](const CMPIValue& system) {
-    if (isNull(system.ref)) {
-      return true;
-    }
+  const auto linkProcessors = [&](const CMPIObjectPath* system) {
     Paths processors;
     processors.reserve(factory->getNumberOfProcInstances());
     if (factory->getAllCPUProcCMPIObjPaths(broker, cop, processors, status) != 0) {
@@ -130,12 +132,13 @@ bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStat
         fail(association, status, noAssociationPath, __builtin_LINE(), function);
         return false;
       }
-      if (!link(path, system.ref, processor)) {
+      if (!link(path, system, processor)) {
         return false;
       }
     }
     return true;
-  });
+  };
+  return forEach(systems, &CMPIValue::ref, linkProcessors, function);
 }
 
 }  // namespace
@@ -218,10 +221,8 @@ CMPIStatus CPUSystemDevice_Associators(CMPIAssociationMI* /*mi*/, const CMPICont
     if (!answered(status)) {
       return status;
     }
-    forEach(systems, [&](const CMPIValue& system) {
-      if (!isNull(system.inst)) {
-        CMReturnInstance(result, system.inst);
-      }
+    forEach(systems, &CMPIValue::inst, [&](const CMPIInstance* system) {
+      CMReturnInstance(result, system);
       return true;
     });
   } else if (targetClass == cpuProcessorClass) {
@@ -259,10 +260,8 @@ CMPIStatus CPUSystemDevice_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPI
     if (!answered(status)) {
       return status;
     }
-    forEach(systems, [&](const CMPIValue& system) {
-      if (!isNull(system.ref)) {
-        CMReturnObjectPath(result, system.ref);
-      }
+    forEach(systems, &CMPIValue::ref, [&](const CMPIObjectPath* system) {
+      CMReturnObjectPath(result, system);
       return true;
     });
   } else if (targetClass == cpuProcessorClass) {
@@ -303,12 +302,11 @@ bool forEachFarEnd(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPI
     if (!answered(*status, __builtin_LINE(), function)) {
       return false;
     }
-    forEach(systems, [&](const CMPIValue& system) {
-      if (!isNull(system.ref)) {
-        link(system.ref, true);
-      }
+    const auto linkSystem = [&](const CMPIObjectPath* system) {
+      link(system, true);
       return true;
-    });
+    };
+    forEach(systems, &CMPIValue::ref, linkSystem, function);
   }
   return true;
 }

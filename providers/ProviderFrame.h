@@ -64,9 +64,8 @@ using Paths = std::vector<CMPIObjectPath*>;
 /// leave the type of a string at 0.
 inline CMPIString* stringKey(const CMPIObjectPath* path, const char* name, CMPIStatus* status = nullptr) {
   const CMPIData key = CMGetKey(path, name, status);
-  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
   const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
-  return mayBeString && (key.state & noValue) == 0 && !isNull(key.value.string) ? key.value.string : nullptr;
+  return mayBeString && hasValue(key) && !isNull(key.value.string) ? key.value.string : nullptr;
 }
 
 /// Results are counted in 16 bits.
