@@ -6,6 +6,7 @@
 #include <variant>
 
 #include "platform/instrumentation/kernel/SystemModel.h"
+#include "platform/instrumentation/tree/PlainText.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Tarn::Inventory {

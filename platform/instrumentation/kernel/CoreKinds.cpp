@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "platform/instrumentation/kernel/CpuIdentity.h"
+#include "platform/instrumentation/tree/PlainText.h"
 
 namespace Tarn::Inventory {
 
@@ -36,7 +37,7 @@ std::vector<CoreKind> armKinds(const CpuInfo& info, const Topology& topology) {
   std::vector<CoreKind> kinds;
   for (auto& [part, cpus] : byPart) {
     const std::string name = identifyCpu(info, cpus.first()).name;
-    kinds.push_back({(name.empty() ? part : name) + " core", std::move(cpus)});
+    kinds.push_back({(name.empty() ? plainText(part) : name) + " core", std::move(cpus)});
   }
   return kinds;
 }

@@ -5,6 +5,8 @@
 #include <cmath>
 #include <string_view>
 
+#include "platform/instrumentation/tree/PlainText.h"
+
 namespace Tarn::Inventory {
 
 namespace {
@@ -15,6 +17,9 @@ class Fields {
   Fields(const CpuInfo& info, unsigned int cpu) : info_(info), cpu_(cpu) {}
 
   std::string_view operator[](std::string_view name) const { return info_.field(cpu_, name); }
+
+  /// A field that clients see.
+  std::string text(std::string_view name) const { return plainText((*this)[name]); }
 
   /// Decimal, or hexadecimal behind 0x; what stands behind the digits does not count.
   std::optional<unsigned int> number(std::string_view name) const {
@@ -86,7 +91,7 @@ void identifyX86(const Fields& fields, CpuIdentity& cpu) {
   const auto known = [](std::optional<unsigned int> number) {
     return number ? static_cast<int>(*number) : FamilyRow::any;
   };
-  cpu.name = fields["model name"] == "unknown" ? std::string_view() : fields["model name"];
+  cpu.name = fields["model name"] == "unknown" ? std::string() : fields.text("model name");
   setFamily(cpu, known(family), known(model));
   cpu.stepping = stepping ? std::to_string(*stepping) : std::string();
   if (family && model && stepping) {
@@ -130,9 +135,9 @@ void identifyArm(const Fields& fields, CpuIdentity& cpu) {
 
 void identifyPowerPc(const Fields& fields, CpuIdentity& cpu) {
   cpu.vendor = "PowerPC";
-  cpu.name = fields["cpu"];
+  cpu.name = fields.text("cpu");
   setFamily(cpu);
-  const std::string_view revision = fields["revision"];
+  const std::string revision = fields.text("revision");
   cpu.stepping = revision.substr(0, revision.find(' '));
   cpu.clockSpeed = fields.megahertz("clock");
   if (cpu.name.starts_with("POWER")) {
@@ -149,16 +154,16 @@ void identifyS390(const Fields& fields, CpuIdentity& cpu) {
 void identifyRiscV(const Fields& fields, CpuIdentity& cpu) {
   const bool is64 = fields["isa"].starts_with("rv64");
   cpu.vendor = is64 ? "RISC-V 64" : "RISC-V 32";
-  cpu.name = fields["uarch"];
+  cpu.name = fields.text("uarch");
   setFamily(cpu);
   cpu.width = is64 ? 64 : 32;
 }
 
 void identifyLoongArch(const Fields& fields, CpuIdentity& cpu) {
   cpu.vendor = "Loongson";
-  cpu.name = fields["Model Name"];
+  cpu.name = fields.text("Model Name");
   setFamily(cpu);
-  cpu.stepping = fields["CPU Revision"];
+  cpu.stepping = fields.text("CPU Revision");
   cpu.width = fields["ISA"].find("loongarch64") != std::string_view::npos ? 64 : 32;
   cpu.clockSpeed = fields.megahertz("CPU MHz");
 }
@@ -188,7 +193,7 @@ CpuIdentity identifyCpu(const CpuInfo& info, unsigned int cpu) {
     const std::string_view value = fields[dialect.field];
     if (!value.empty() && value.starts_with(dialect.begin)) {
       identity.architecture = dialect.architecture;
-      identity.vendor = fields["vendor_id"];
+      identity.vendor = fields.text("vendor_id");
       dialect.identify(fields, identity);
       break;
     }

@@ -5,8 +5,8 @@
 #include <cerrno>
 #include <string_view>
 
-#include "platform/common/Ascii.h"
 #include "platform/instrumentation/kernel/CpuIdentity.h"
+#include "platform/instrumentation/tree/PlainText.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Tarn::Inventory {
@@ -116,12 +116,6 @@ void add(Facts& facts, Properties id, const Machine& machine, const Found& found
 }
 
 }  // namespace
-
-std::string plainText(std::string_view text) {
-  std::string plain(text);
-  std::ranges::replace_if(plain, Common::isControl, ' ');
-  return std::string(Common::trimmed(plain));
-}
 
 bool isPlaceholder(std::string_view text) {
   return std::ranges::binary_search(placeholders, text);

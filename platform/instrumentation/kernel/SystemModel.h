@@ -15,10 +15,6 @@ namespace Tarn::Inventory {
 /// there are no tables. The origins look into the machine, which must outlive them.
 Facts readSystemFacts(Machine& machine, const Facts* firmware);
 
-/// A text of the firmware's without the blanks around it, and with a blank for each control character: those
-/// cannot stand in the XML that brokers send.
-std::string plainText(std::string_view text);
-
 /// Whether a text is what firmware vendors leave in a field that they did not fill in.
 bool isPlaceholder(std::string_view text);
 

@@ -130,6 +130,20 @@ TEST(CpuIdentity, OfLoongArch) {
   EXPECT_EQ(cpu.clockSpeed, 2500U);
 }
 
+TEST(CpuIdentity, HasBlanksForControlCharacters) {
+  const auto x86Name = [](const std::string& name) { return identify("cpu family\t: 6\nmodel name\t: " + name).name; };
+  EXPECT_EQ(x86Name("\001Some\tCPU\033[1m 9\177\n"), "Some CPU [1m 9");
+  EXPECT_EQ(x86Name("Some CPU\r\n"), "Some CPU");
+
+  const CpuIdentity powerPc = identify("cpu\t: POWER\0339\nclock\t: 3425MHz\nrevision\t: 2\033.2 (pvr)\n");
+  EXPECT_EQ(powerPc.name, "POWER 9");
+  EXPECT_EQ(powerPc.stepping, "2");
+  EXPECT_EQ(identify("isa\t: rv64\nuarch\t: a\010b\n").name, "a b");
+  const CpuIdentity loongArch = identify("Model Name\t: Loongson\002X\nCPU Revision\t: 0x\0211\n");
+  EXPECT_EQ(loongArch.name, "Loongson X");
+  EXPECT_EQ(loongArch.stepping, "0x 1");
+}
+
 TEST(CpuIdentity, OfACpuThatSaysNothing) {
   const CpuIdentity cpu = identify("");
 

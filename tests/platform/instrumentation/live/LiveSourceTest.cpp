@@ -118,6 +118,16 @@ TEST(LiveSource, HybridProcessorsNameTheirKindsOfCore) {
   EXPECT_EQ(numberAt(tree, "P0", PropMaxClockSpeed), 3500U) << "that of the faster kind";
 }
 
+TEST(LiveSource, KindsOfCoreHaveBlanksForControlCharacters) {
+  KernelFiles files;
+  files.cpus("0-1").file("proc/cpuinfo",
+                         "processor\t: 0\nCPU implementer\t: 0x41\033[1m\nCPU part\t: 0xffe\n\n"
+                         "processor\t: 1\nCPU implementer\t: 0x41\nCPU part\t: 0xfff\n");
+  files.cpu(0, {.package = 0, .core = 0, .siblings = "0"}).cpu(1, {.package = 0, .core = 1, .siblings = "1"});
+
+  EXPECT_EQ(nodeAt(files.tree(), "P0.C0").description, "0x41 [1m 0xffe core 0");
+}
+
 TEST(LiveSource, OneKindOfCoreIsNotNamed) {
   KernelFiles files;
   files.cpus("0").x86Block(0).file("sys/devices/cpu_core/cpus", "0\n");

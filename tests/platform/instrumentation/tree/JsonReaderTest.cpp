@@ -46,6 +46,15 @@ TEST(JsonReader, ReadsAWholeTree) {
                       .build());
 }
 
+TEST(JsonReader, KeepsTextsAsTheFileStatesThem) {
+  const Tree tree = readJson(
+      processor(R"("description": " a\u001b\tb ", "properties": {"ProcessorName": "\u0001\n", "Stepping": ""})"), "x");
+
+  EXPECT_EQ(tree.node(0).description, " a\x1B\tb ");
+  EXPECT_EQ(*tree.text(tree.node(0), PropProcessorName), "\001\n");
+  EXPECT_EQ(*tree.text(tree.node(0), PropStepping), "");
+}
+
 TEST(JsonReader, ReadsWhatCouldNotBeRead) {
   const Tree tree = readJson(R"({"format": "corvane-inventory", "version": 1, "nodes": [],
                                  "unread": [{"file": "f", "reason": "r", "remedy": "m"}]})",
