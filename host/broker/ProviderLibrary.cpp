@@ -31,17 +31,18 @@ ProviderLibrary::ProviderLibrary(const std::string& file, LoadScope scope) : fil
 }
 
 ProviderLibrary::~ProviderLibrary() {
-  if (handle_ != nullptr) {
+  if (handle_ != nullptr && !staysLoaded_) {
     dlclose(handle_);
   }
 }
 
 ProviderLibrary::ProviderLibrary(ProviderLibrary&& other) noexcept
-    : file_(std::move(other.file_)), handle_(std::exchange(other.handle_, nullptr)) {}
+    : file_(std::move(other.file_)), handle_(std::exchange(other.handle_, nullptr)), staysLoaded_(other.staysLoaded_) {}
 
 ProviderLibrary& ProviderLibrary::operator=(ProviderLibrary&& other) noexcept {
   std::swap(file_, other.file_);
   std::swap(handle_, other.handle_);
+  std::swap(staysLoaded_, other.staysLoaded_);
   return *this;
 }
 

@@ -39,6 +39,10 @@ class ProviderLibrary {
   [[nodiscard]] CMPIInstanceMI* instanceMI(Broker& broker, std::string_view provider) const;
   [[nodiscard]] CMPIAssociationMI* associationMI(Broker& broker, std::string_view provider) const;
 
+  // The library stays in memory when this object goes, until the process ends. A broker that it was
+  // given has to stay as well.
+  void keepLoaded() { staysLoaded_ = true; }
+
   // The address of an exported name; nullptr if there is none.
   [[nodiscard]] void* find(const std::string& symbol) const;
 
@@ -48,6 +52,7 @@ class ProviderLibrary {
 
   std::string file_;
   void* handle_ = nullptr;
+  bool staysLoaded_ = false;
 };
 
 }  // namespace Corvcim

@@ -12,8 +12,10 @@ namespace Corvcim {
 namespace {
 
 Response enumerate(const std::string& file, const ClassDefinition& definition, Operation operation) {
-  Broker broker;
-  const ProviderLibrary library(file);
+  // The process ends after this: unloading would only cost time. Until then the library may use its broker.
+  static Broker broker;
+  ProviderLibrary library(file);
+  library.keepLoaded();
   CMPIInstanceMI* mi = library.instanceMI(broker, definition.provider);
   operation.path.className = definition.name;
   return broker.perform(mi, operation);

@@ -15,8 +15,8 @@ namespace Corvcim {
 /// calls nobody, so a process of its own would only cost time. nullptr for any other operation.
 const ClassDefinition* directClass(const Operation& operation);
 
-/// Enumerates in this process. Nothing where the libraries do not have the class. A provider that
-/// crashes ends this program with exit status 1, after one line that says so on standard error.
+/// Enumerates in this process, in which the library stays loaded. Nothing where the libraries do not have the class. A
+/// provider that crashes ends this program with exit status 1, after one line that says so on standard error.
 std::optional<Response> enumerateDirectly(const LibraryFiles& files, const ClassDefinition& definition,
                                           const Operation& operation);
 

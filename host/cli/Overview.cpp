@@ -207,6 +207,9 @@ Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace) {
       return {"", {*error}};
     }
   }
+  if (!data.processorsAreKnown) {
+    return outcome;
+  }
   outcome.output = writeOverview(data, Tarn::Inventory::processTree()->unread());
   return outcome;
 }

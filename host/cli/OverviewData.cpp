@@ -1,6 +1,7 @@
 #include "host/cli/OverviewData.h"
 
 #include <map>
+#include <optional>
 #include <string_view>
 #include <utility>
 
@@ -20,13 +21,18 @@ class Gathering {
  public:
   Gathering(Dispatcher& dispatcher, const std::string& nameSpace) : dispatcher_(dispatcher), nameSpace_(nameSpace) {}
 
-  std::vector<Instance> instancesOf(std::string_view className) {
+  /// Nothing where the class could not be asked; then there is a failure that says so.
+  std::optional<std::vector<Instance>> ask(std::string_view className) {
     Answer answer = dispatcher_.enumerateInstances({{}, nameSpace_, std::string(className), {}});
     if (!answer.response.ok()) {
       failures_.push_back(std::string(className) + ": " + describeStatus(answer.response.rc, answer.response.message));
-      return {};
+      return std::nullopt;
     }
     return std::move(answer.response.instances);
+  }
+
+  std::vector<Instance> instancesOf(std::string_view className) {
+    return ask(className).value_or(std::vector<Instance>());
   }
 
   std::vector<std::string> takeFailures() { return std::move(failures_); }
@@ -108,15 +114,16 @@ OverviewData gatherOverview(Dispatcher& dispatcher, const std::string& nameSpace
   if (!systems.empty()) {
     data.system = std::move(systems.front());
   }
-  const std::vector<Instance> processors = gathering.instancesOf(processorClass);
-  if (!processors.empty()) {
+  const std::optional<std::vector<Instance>> processors = gathering.ask(processorClass);
+  data.processorsAreKnown = processors.has_value();
+  if (processors && !processors->empty()) {
     const std::vector<Instance> capabilityLinks = gathering.instancesOf(capabilitiesAssociation);
     const std::vector<Instance> capabilities = gathering.instancesOf(capabilitiesClass);
     const Index capabilityIndex(capabilities, "InstanceID");
     const std::vector<Instance> cacheLinks = gathering.instancesOf(cacheAssociation);
     const std::vector<Instance> caches = gathering.instancesOf(cacheClass);
     const Index cacheIndex(caches, "DeviceID");
-    for (const Instance& instance : processors) {
+    for (const Instance& instance : *processors) {
       OverviewProcessor processor;
       processor.processor = instance;
       addCapabilities(processor, capabilityLinks, capabilityIndex);

@@ -25,6 +25,7 @@ struct OverviewProcessor {
 struct OverviewData {
   Instance system;
   std::vector<OverviewProcessor> processors;
+  bool processorsAreKnown = true;     ///< false: their class could not be asked
   std::vector<std::string> failures;  ///< one line for each class that could not be asked
 };
 

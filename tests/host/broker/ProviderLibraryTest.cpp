@@ -2,7 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <fstream>
+#include <optional>
 #include <string>
 #include <utility>
 
@@ -55,6 +57,20 @@ TEST(ProviderLibrary, IsGoneFromMemoryAfterUnloading) {
     }
     EXPECT_FALSE(isMapped(TEST_PROVIDER));
   }
+}
+
+TEST(ProviderLibrary, StaysInMemoryWhereItIsKept) {
+  // A copy: the other tests expect to find the library unloaded.
+  const std::string copy = testing::TempDir() + "kept-provider.so";
+  std::filesystem::copy_file(TEST_PROVIDER, copy, std::filesystem::copy_options::overwrite_existing);
+
+  ProviderLibrary first(copy);
+  first.keepLoaded();
+  std::optional<ProviderLibrary> second(std::move(first));
+  second.reset();
+
+  EXPECT_TRUE(isMapped(copy));
+  std::filesystem::remove(copy);
 }
 
 TEST(ProviderLibrary, MovesWithoutUnloading) {

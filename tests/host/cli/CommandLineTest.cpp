@@ -299,6 +299,21 @@ TEST(Corvcim, AnInventoryThatCanNotBeReadIsSaidOnceForEveryClass) {
             failed("ei CIM_ManagedElement: " + whyNowhere));
 }
 
+TEST(Corvcim, TheOverviewWithoutALibraryIsItsErrorAlone) {
+  EXPECT_EQ(
+      corvcimOn(twoCoreMachine(), {"-l", "/nowhere/provider.so"}),
+      failed("HALDA_CPUProcessor: CIM_ERR_FAILED: cannot load provider library: /nowhere/provider.so: cannot open "
+             "shared object file: No such file or directory"));
+}
+
+TEST(Corvcim, TheOverviewDoesWithoutTheCompanion) {
+  const Finished run = corvcimOn(twoCoreMachine(), {"--companion", "/nowhere/companion.so"});
+
+  EXPECT_EQ(run.status, 1);
+  EXPECT_TRUE(run.output.starts_with("This machine\n\nProcessor P0\n")) << run;
+  EXPECT_EQ(std::ranges::count(run.errors, '\n'), 1) << run;
+}
+
 TEST(Corvcim, AnInventoryThatCanNotBeReadHidesNoOtherMistake) {
   const Finished unknownClass = corvcim({"-i", "root:/nowhere", "ei", "HALDA_Disk"});
   const Finished noLibrary = corvcim({"-i", "root:/nowhere", "-l", "/nowhere/provider.so", "ei", "HALDA_CPUMemory"});
