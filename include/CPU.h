@@ -76,8 +76,8 @@ class Processor {
   /// Always "not applicable": the inventory cannot be asked to change a state.
   unsigned short getRequestedState() const { return requestedState_; }
   bool setRequestedState(unsigned int status);
-  /// The setter writes the one element that is there; statuses without a meaning leave it as it is.
-  std::vector<unsigned short> getOperationalStatus() const { return operationalStatus_; }
+  /// One element, always; statuses without a meaning leave it as it is.
+  std::vector<unsigned short> getOperationalStatus() const { return {operationalStatus_}; }
   bool setOperationalStatus(unsigned int status);
   /// Sets the status text as well.
   unsigned short getHealthState() const { return healthState_; }
@@ -103,7 +103,7 @@ class Processor {
   std::string name_;
   unsigned short requestedState_ = 0;
   unsigned short healthState_ = 0;
-  std::vector<unsigned short> operationalStatus_ = {0};
+  unsigned short operationalStatus_ = 0;
   unsigned short dataWidth_ = 0;
   unsigned short addressWidth_ = 0;
   std::string stepping_;
@@ -136,7 +136,7 @@ class ProcessorCore {
   unsigned short getHealthState() const { return healthState_; }
   bool setHealthState(unsigned int status);
   std::string getHealthString() const { return healthString_; }
-  std::vector<unsigned short> getOperationalStatus() const { return operationalStatus_; }
+  std::vector<unsigned short> getOperationalStatus() const { return {operationalStatus_}; }
   bool setOperationalStatus(unsigned int status);
 
  private:
@@ -147,7 +147,7 @@ class ProcessorCore {
   unsigned short requestedState_ = 0;
   unsigned short healthState_ = 0;
   std::string healthString_ = "Unknown";
-  std::vector<unsigned short> operationalStatus_ = {0};
+  unsigned short operationalStatus_ = 0;
 };
 
 /// One processor cache.
@@ -176,7 +176,7 @@ class Memory {
   unsigned short getHealthState() const { return healthState_; }
   bool setHealthState(unsigned int status);
   std::string getHealthString() const { return healthString_; }
-  std::vector<unsigned short> getOperationalStatus() const { return operationalStatus_; }
+  std::vector<unsigned short> getOperationalStatus() const { return {operationalStatus_}; }
   bool setOperationalStatus(unsigned int status);
 
   /// CIM level code; setting level 0 returns false.
@@ -199,7 +199,7 @@ class Memory {
   std::string elementName_;
   unsigned short requestedState_ = 0;
   unsigned short healthState_ = 0;
-  std::vector<unsigned short> operationalStatus_ = {0};
+  unsigned short operationalStatus_ = 0;
   std::string cacheName_;
   unsigned short cacheLevel_ = 0;
   unsigned short cacheWritePolicy_ = 0;

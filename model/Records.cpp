@@ -123,8 +123,7 @@ bool Processor::setRequestedState(unsigned int /*status*/) {
 }
 
 bool Processor::setOperationalStatus(unsigned int status) {
-  unsigned short& current = operationalStatus_.front();
-  return store(current, translate(operationalStatuses, status, current));
+  return store(operationalStatus_, translate(operationalStatuses, status, operationalStatus_));
 }
 
 bool Processor::setHealthState(unsigned int status) {
@@ -183,8 +182,7 @@ bool ProcessorCore::setHealthState(unsigned int status) {
 }
 
 bool ProcessorCore::setOperationalStatus(unsigned int status) {
-  unsigned short& current = operationalStatus_.front();
-  return store(current, translate(operationalStatuses, status, current));
+  return store(operationalStatus_, translate(operationalStatuses, status, operationalStatus_));
 }
 
 std::string Memory::getMemoryDeviceID() const {
@@ -229,8 +227,7 @@ bool Memory::setHealthState(unsigned int status) {
 }
 
 bool Memory::setOperationalStatus(unsigned int status) {
-  unsigned short& current = operationalStatus_.front();
-  return store(current, translate(operationalStatuses, status, current));
+  return store(operationalStatus_, translate(operationalStatuses, status, operationalStatus_));
 }
 
 bool Memory::setCacheLevel(unsigned int level) {
