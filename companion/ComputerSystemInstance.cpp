@@ -35,7 +35,7 @@ void setNumber(const Target& target, const char* name, CMPIUint16 value) {
 void setList(const Target& target, const char* name, CMPIUint16 value) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
   CMPIArray* array = CMNewArray(target.broker, 1, CMPI_uint16, &status);
-  if (array == nullptr || status.rc != CMPI_RC_OK) {
+  if (isNull(array) || status.rc != CMPI_RC_OK) {
     return;
   }
   CMSetArrayElementAt(array, 0, &value, CMPI_uint16);
@@ -81,8 +81,9 @@ bool isSelected(const char* const* selection, const char* name) {
 }
 
 /// Whether the broker made nothing. A refusal without a code of its own becomes FAILED.
-bool isRefused(const void* object, CMPIStatus* status) {
-  if (object == nullptr && status->rc == CMPI_RC_OK) {
+template <class Object>
+bool isRefused(const Object* object, CMPIStatus* status) {
+  if (isNull(object) && status->rc == CMPI_RC_OK) {
     status->rc = CMPI_RC_ERR_FAILED;
   }
   return status->rc != CMPI_RC_OK;
@@ -93,8 +94,8 @@ bool isRefused(const void* object, CMPIStatus* status) {
 CMPIObjectPath* makePath(const CMPIBroker* broker, const CMPIObjectPath* request, const ComputerSystem& system,
                          CMPIStatus* status) {
   const CMPIString* nameSpace = CMGetNameSpace(request, nullptr);
-  const char* nameSpaceText = nameSpace == nullptr ? nullptr : CMGetCharPtr(nameSpace);
-  CMPIObjectPath* path = CMNewObjectPath(broker, nameSpaceText, className, status);
+  const char* nameSpaceText = isNull(nameSpace) ? nullptr : CMGetCharPtr(nameSpace);
+  CMPIObjectPath* path = CMNewObjectPath(broker, nameSpaceText == nullptr ? "" : nameSpaceText, className, status);
   if (isRefused(path, status)) {
     return nullptr;
   }

@@ -1,13 +1,19 @@
 #ifndef COMPANION_COMPUTERSYSTEMINSTANCE_H
 #define COMPANION_COMPUTERSYSTEMINSTANCE_H
 
-#include <cmpidt.h>
+#include <cmpift.h>
 
 #include "companion/ComputerSystem.h"
 
 namespace Tarn::ComputerSystemProvider {
 
 inline constexpr const char* className = "HALDA_ComputerSystem";
+
+/// Brokers also say "no object" with one that has no handle.
+template <class Object>
+bool isNull(const Object* object) {
+  return object == nullptr || object->hdl == nullptr;
+}
 
 /// The object path of the system in the namespace and of the host of `request`, or NULL when the
 /// broker refuses; `status` then says why. The path belongs to the request.

@@ -3,6 +3,7 @@
 
 #include <cmpift.h>
 #include <cmpimacs.h>
+#include <cxxabi.h>
 #include <strings.h>
 
 #include <atomic>
@@ -28,6 +29,8 @@ template <class Operation>
 CMPIStatus answer(Operation operation) {
   try {
     return operation(registeredBroker.load());
+  } catch (const abi::__forced_unwind&) {
+    throw;  // a cancelled thread has to unwind to its end, or the whole process aborts
   } catch (const std::exception& error) {
     return statusOf(CMPI_RC_ERR_FAILED, error.what());
   } catch (...) {
@@ -39,7 +42,7 @@ CMPIStatus answer(Operation operation) {
 const char* keyText(const CMPIObjectPath* path, const char* name) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
   const CMPIData key = CMGetKey(path, name, &status);
-  if (status.rc != CMPI_RC_OK || key.type != CMPI_string || key.value.string == nullptr) {
+  if (status.rc != CMPI_RC_OK || key.type != CMPI_string || isNull(key.value.string)) {
     return nullptr;
   }
   return CMGetCharPtr(key.value.string);

@@ -2,10 +2,12 @@
 
 #include <dlfcn.h>
 #include <gtest/gtest.h>
+#include <pthread.h>
 
 #include <tarn/Common.h>
 #include <cstdlib>
 #include <string>
+#include <thread>
 
 #include "host/broker/Broker.h"
 #include "host/broker/ProviderLibrary.h"
@@ -171,13 +173,90 @@ TEST_F(Companion, ABrokerThatRefusesGivesAFailureAndNothingElse) {
   }
 }
 
+// Some brokers say that they made nothing with an object that has no handle, and no other word.
+const Failure silentRefusals[] = {
+    {.result = FailureResult::Null, .rc = CMPI_RC_OK, .message = ""},
+    {.result = FailureResult::HandleLess, .rc = CMPI_RC_OK, .message = ""},
+};
+
+TEST_F(Companion, ABrokerThatRefusesSilentlyGivesAFailureAndNothingElse) {
+  broker_.services().record(true);
+  for (const Failure& refusal : silentRefusals) {
+    for (const char* service : {"newObjectPath", "newInstance"}) {
+      broker_.failNth(service, 1, refusal);
+      static_cast<void>(broker_.services().takeRecord());
+
+      const Response response = broker_.enumerateInstances(mi(), classPath());
+
+      EXPECT_EQ(response.rc, CMPI_RC_ERR_FAILED) << service;
+      EXPECT_TRUE(response.instances.empty()) << service;
+      EXPECT_EQ(broker_.services().takeRecord().back().service, service);
+    }
+  }
+}
+
 TEST_F(Companion, AnArrayThatCanNotBeMadeLeavesItsPropertyOut) {
-  broker_.failNth("newArray", 1);
+  for (const Failure& refusal : {silentRefusals[0], silentRefusals[1], Failure()}) {
+    broker_.failNth("newArray", 1, refusal);
+    broker_.services().resetCounts();
 
-  const Response response = broker_.enumerateInstances(mi(), classPath());
+    const Response response = broker_.enumerateInstances(mi(), classPath());
 
-  ASSERT_EQ(response.instances.size(), 1U);
-  EXPECT_EQ(response.instances[0].property("OperationalStatus"), nullptr);
+    ASSERT_EQ(response.instances.size(), 1U);
+    EXPECT_EQ(response.instances[0].property("OperationalStatus"), nullptr);
+    EXPECT_EQ(broker_.callCount("setElementAt"), 0U);
+  }
+}
+
+TEST_F(Companion, ARequestWithoutNamespaceIsAnswered) {
+  for (const Failure& refusal : silentRefusals) {
+    broker_.failNth("getNameSpace", 1, refusal);
+
+    const Response response = broker_.enumerateInstances(mi(), classPath());
+
+    ASSERT_EQ(response.instances.size(), 1U);
+    EXPECT_EQ(response.instances[0].path.nameSpace, "");
+  }
+}
+
+TEST_F(Companion, AKeyWithoutAStringIsMissing) {
+  for (const Failure& refusal : silentRefusals) {
+    for (const unsigned int key : {1U, 2U}) {
+      broker_.failNth("getKey", key, refusal);
+
+      const Response response = broker_.getInstance(mi(), systemPath(Tarn::getSystemName()));
+
+      EXPECT_EQ(response.rc, CMPI_RC_ERR_INVALID_PARAMETER);
+    }
+  }
+}
+
+/// A broker whose threads may end while they make an instance.
+CMPIInstance* endThread(const CMPIBroker* /*broker*/, const CMPIObjectPath* /*path*/, CMPIStatus* /*status*/) {
+  pthread_exit(nullptr);
+}
+
+// Brokers that end a worker by cancelling it unwind through the library.
+TEST_F(Companion, AThreadThatEndsInsideLeavesTheLibraryUsable) {
+#if defined(__SANITIZE_THREAD__) || defined(__SANITIZE_ADDRESS__)
+  GTEST_SKIP() << "sanitizers do not follow a forced unwinding";
+#endif
+  CMPIBroker record = *broker_.handle();
+  CMPIBrokerEncFT services = *record.eft;
+  services.newInstance = endThread;
+  record.eft = &services;
+  const auto create = reinterpret_cast<CMPIInstanceMI* (*)(const CMPIBroker*, const CMPIContext*, CMPIStatus*)>(
+      library_->find(std::string(provider) + "_Create_InstanceMI"));
+  CMPIInstanceMI* instances = create(&record, nullptr, nullptr);
+  bool returned = false;
+  std::thread cancelled([&] {
+    broker_.enumerateInstances(instances, classPath());
+    returned = true;
+  });
+  cancelled.join();
+
+  EXPECT_FALSE(returned);
+  EXPECT_EQ(broker_.enumerateInstances(mi(), classPath()).instances.size(), 1U);
 }
 
 TEST_F(Companion, RefusesEveryChange) {
