@@ -156,7 +156,7 @@ FileSink::FileSink(const std::string& path, Rotation rotation, Clock::duration r
 }
 
 void FileSink::write(const Message& message) {
-  const std::string line = formatLine(message) + '\n';
+  std::string line = formatLine(message) + '\n';
   if (isFollowed_) {
     followName(line.size());
   }
@@ -164,7 +164,29 @@ void FileSink::write(const Message& message) {
   if (mayBeTooLarge_) {
     held.emplace(SIGXFSZ);
   }
-  writeLine(file_.number(), line);
+  const End before = end_.load(std::memory_order_relaxed);
+  if (before != End::kOfLine && isTorn(before)) {
+    line.insert(line.begin(), '\n');
+  }
+  const std::size_t written = writeLine(file_.number(), line);
+  if (written != line.size()) {
+    end_.store(written == 0 ? End::kUnknown : End::kTorn, std::memory_order_relaxed);
+  } else if (before != End::kOfLine) {
+    end_.store(End::kOfLine, std::memory_order_relaxed);
+  }
+}
+
+bool FileSink::isTorn(End known) const {
+  if (isFollowed_) {
+    const FileDescriptor file(open(path_.c_str(), O_RDONLY | O_CLOEXEC | O_NOCTTY | O_NONBLOCK));
+    const std::optional<struct stat> status = statusOf(file.number());
+    char last = '\n';
+    if (status && identity_.isThatOf(*status) &&
+        (status->st_size == 0 || pread(file.number(), &last, 1, status->st_size - 1) == 1)) {
+      return last != '\n';
+    }
+  }
+  return known == End::kTorn;
 }
 
 void FileSink::followName(std::size_t lineSize) {

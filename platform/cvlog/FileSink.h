@@ -24,6 +24,9 @@ namespace CVLog {
 /// rotation makes way for a new one first; a lock on the file sees to it that one of the processes does so. Nobody
 /// waits for that: who finds the lock taken, or cannot rename or open, writes on to the file that is open. The system
 /// log hears once why a file could not be replaced, and the attempt is repeated `retryAfter` later at the earliest.
+///
+/// A full disk may take a part of a line. The next line that this sink, or one that found the disk full as well, or one
+/// that opens the file later, writes there is preceded by a line end, so that it stands alone.
 class FileSink final : public Sink {
  public:
   using Clock = std::chrono::steady_clock;
@@ -49,6 +52,14 @@ class FileSink final : public Sink {
     std::atomic<ino_t> number_{0};
   };
 
+  /// What is known of how the file ends.
+  enum class End {
+    kUnknown,  ///< it was just opened, or the disk was full, for other processes as well
+    kOfLine,
+    kTorn,  ///< in a part of a line
+  };
+  [[nodiscard]] bool isTorn(End known) const;
+
   void followName(std::size_t lineSize);
   /// False where another process has the lock.
   bool rotate(std::size_t lineSize);
@@ -64,6 +75,7 @@ class FileSink final : public Sink {
   const bool isFollowed_;     // a regular file under a name of its own
   const bool mayBeTooLarge_;  // for the limit that was set when it was opened
   Identity identity_;
+  std::atomic<End> end_{End::kUnknown};
   std::atomic_flag isBeingReplaced_;
   std::atomic<Clock::rep> retryAt_{0};  // 0: the last replacement did not fail
 };

@@ -9,8 +9,10 @@
 
 #include <csignal>
 #include <filesystem>
+#include <optional>
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 #include "tests/platform/cvlog/LogDirectory.h"
 #include "tests/platform/cvlog/RecordedSystemLog.h"
@@ -89,6 +91,72 @@ TEST_F(LogFile, DoesNotKillAProcessThatMayNotWriteMore) {
   waitpid(child, &status, 0);
   EXPECT_EQ(status, 0);
   EXPECT_EQ(content("log"), line("a"));
+}
+
+/// Lets no file of this process grow beyond a size, as a full disk does.
+class FullDisk {
+ public:
+  explicit FullDisk(std::size_t size) {
+    getrlimit(RLIMIT_FSIZE, &before_);
+    const rlimit limit{size, before_.rlim_max};
+    setrlimit(RLIMIT_FSIZE, &limit);
+  }
+  FullDisk(const FullDisk&) = delete;
+  FullDisk& operator=(const FullDisk&) = delete;
+  ~FullDisk() { setrlimit(RLIMIT_FSIZE, &before_); }
+
+ private:
+  rlimit before_{};
+};
+
+class TornLogFile : public LogDirectory {
+ protected:
+  static constexpr std::size_t kPart = 7;
+
+  static std::string part(std::string_view text) { return line(text).substr(0, kPart); }
+
+  /// Writes "a", and of "torn" as much as there is room for.
+  void tear(FileSink& sink) const {
+    sink.write(message("a"));
+    sink.write(message("torn"));
+    ASSERT_EQ(content("log"), line("a") + part("torn"));
+  }
+  static std::size_t room() { return line("a").size() + kPart; }
+};
+
+TEST_F(TornLogFile, GoesOnWithALineOfItsOwn) {
+  std::optional<FullDisk> disk(std::in_place, room());
+  FileSink sink(path("log"));
+  tear(sink);
+  disk.reset();
+  sink.write(message("b"));
+  sink.write(message("c"));
+  EXPECT_EQ(content("log"), line("a") + part("torn") + '\n' + line("b") + line("c"));
+}
+
+TEST_F(TornLogFile, GoesOnWithALineOfItsOwnAfterARestart) {
+  {
+    const FullDisk disk(room());
+    FileSink sink(path("log"));
+    tear(sink);
+  }
+  FileSink sink(path("log"));
+  sink.write(message("b"));
+  sink.write(message("c"));
+  EXPECT_EQ(content("log"), line("a") + part("torn") + '\n' + line("b") + line("c"));
+}
+
+TEST_F(TornLogFile, IsMendedOnceByThoseThatShareIt) {
+  std::optional<FullDisk> disk(std::in_place, room());
+  FileSink sink(path("log"));
+  FileSink other(path("log"));
+  tear(sink);
+  other.write(message("lost"));
+  disk.reset();
+  other.write(message("b"));
+  sink.write(message("c"));
+  other.write(message("d"));
+  EXPECT_EQ(content("log"), line("a") + part("torn") + '\n' + line("b") + line("c") + line("d"));
 }
 
 TEST_F(LogFile, ThatWasMovedAwayIsMadeAnewWithItsMode) {
