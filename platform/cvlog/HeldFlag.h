@@ -5,7 +5,8 @@
 
 namespace CVLog {
 
-/// Holds a flag that was free; whoever finds it taken goes on without it.
+/// Holds a flag that was free; whoever finds it taken goes on without it. In a process that was forked while another
+/// thread held it, it stays taken.
 class HeldFlag {
  public:
   explicit HeldFlag(std::atomic_flag& flag) : flag_(flag), isHeld_(!flag.test_and_set(std::memory_order_acquire)) {}

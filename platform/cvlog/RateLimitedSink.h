@@ -32,7 +32,9 @@ class RateLimitedSink final : public Sink {
   const std::unique_ptr<Sink> target_;
   const unsigned perMinute_;
 
-  std::mutex mutex_;  // guards what follows, never held while writing
+  // Guards what follows, never held while writing. A process that was forked while another thread had it, and logs,
+  // waits for ever, as it would for the lock in syslog(3).
+  std::mutex mutex_;
   std::chrono::system_clock::time_point minuteStart_;
   unsigned passed_ = 0;
   unsigned dropped_ = 0;

@@ -8,9 +8,10 @@
 
 namespace CVLog {
 
-/// A value that many threads use while one puts another in its place. Users never wait, and have no lock that a forked
-/// process could inherit taken. What was replaced lives until nobody uses any value, which is looked for when
-/// `discardUnused` is called; at the latest it goes with this object.
+/// A value that many threads use while one puts another in its place. Users never wait here, in a forked process
+/// neither; what `use` does may have locks of its own. What was replaced lives until nobody uses any value, which is
+/// looked for when `discardUnused` is called; at the latest it goes with this object. In a process that was forked
+/// while another thread used a value that user never ends, so there all that is replaced lives so long.
 template <class T>
 class Replaceable {
  public:
