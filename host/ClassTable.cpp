@@ -57,7 +57,7 @@ constexpr PropertyDefinition processorProperties[] = {
     {"DataWidth", CMPI_uint16, false, {}},
     {"AddressWidth", CMPI_uint16, false, {}},
     {"Stepping", CMPI_string, false, {}},
-    {"UniqueId", CMPI_string, false, {}},
+    {"UniqueId", CMPI_string, false, {}, "UniqueID"},
     {"UpgradeMethod", CMPI_uint16, false, {}},
     {"NumberOfEnabledCores", CMPI_uint16, false, {}},
 };
@@ -156,6 +156,12 @@ constexpr ClassDefinition classes[] = {
 
 constexpr std::size_t endsOfAnAssociation = 2;
 
+void addOnce(std::vector<std::string>& names, std::string_view name) {
+  if (!name.empty() && std::ranges::find(names, name) == names.end()) {
+    names.emplace_back(name);
+  }
+}
+
 }  // namespace
 
 std::span<const ClassDefinition> classDefinitions() {
@@ -172,6 +178,24 @@ const PropertyDefinition* findProperty(const ClassDefinition& definition, std::s
   const auto found = std::ranges::find_if(definition.properties,
                                           [&](const PropertyDefinition& each) { return sameName(each.name, name); });
   return found == definition.properties.end() ? nullptr : &*found;
+}
+
+std::vector<std::string> asProvidersSpell(const std::vector<std::string>& propertyNames) {
+  std::vector<std::string> result;
+  for (const std::string& name : propertyNames) {
+    bool isKnown = false;
+    for (const ClassDefinition& each : classes) {
+      if (const PropertyDefinition* property = findProperty(each, name)) {
+        addOnce(result, property->name);
+        addOnce(result, property->selection);
+        isKnown = true;
+      }
+    }
+    if (!isKnown) {
+      addOnce(result, name);
+    }
+  }
+  return result;
 }
 
 std::string_view parentOf(std::string_view name) {

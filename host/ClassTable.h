@@ -4,6 +4,7 @@
 #include <cmpidt.h>
 
 #include <span>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -18,6 +19,7 @@ struct PropertyDefinition {
   CMPIType type;                    // exact CMPI type; texts are CMPI_string, references CMPI_ref
   bool key = false;                 // part of the object path
   std::string_view referenceClass;  // class at the far side of a reference; empty for anything else
+  std::string_view selection = {};  // by which name the provider selects it in property lists; empty: by its own
 };
 
 struct ClassDefinition {
@@ -39,6 +41,10 @@ struct ClassDefinition {
 
 // The property or reference of this name; nullptr if the class has none.
 [[nodiscard]] const PropertyDefinition* findProperty(const ClassDefinition& definition, std::string_view name);
+
+// The names of a property list as the providers compare them, letter by letter: every spelling that a class
+// has for it, its own name and the one by which it is selected. A name that no class has stays as it is.
+[[nodiscard]] std::vector<std::string> asProvidersSpell(const std::vector<std::string>& propertyNames);
 
 // The name of the DMTF or table class that `name` is derived from; empty at the top and for unknown names.
 [[nodiscard]] std::string_view parentOf(std::string_view name);

@@ -4,6 +4,7 @@
 #include <utility>
 #include <vector>
 
+#include "host/ClassTable.h"
 #include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
 #include "host/cli/DirectEnumeration.h"
@@ -75,7 +76,7 @@ Operation operationOf(const Options& options) {
                              " takes the path of an instance; ein lists the paths of a class");
   }
   if (options.hasPropertyList) {
-    operation.properties = options.properties;
+    operation.properties = asProvidersSpell(options.properties);
   }
   operation.filter = filterOf(operation.kind, options.association);
   return operation;

@@ -172,4 +172,13 @@ TEST(ClassTable, ProvidersAreNamedAfterTheirClassesButForOne) {
   EXPECT_EQ(findClass("HALDA_CPUProcessorCapabilities")->provider, "CPUProcessorCapProvider");
 }
 
+TEST(ClassTable, SpellsPropertyListsAsProvidersCompareThem) {
+  using Names = std::vector<std::string>;
+
+  EXPECT_EQ(asProvidersSpell({"caption", "HEALTHSTATE", "Caption"}), (Names{"Caption", "HealthState"}));
+  EXPECT_EQ(asProvidersSpell({"uniqueid"}), (Names{"UniqueId", "UniqueID"}));
+  EXPECT_EQ(asProvidersSpell({"UniqueID", "colour"}), (Names{"UniqueId", "UniqueID", "colour"}));
+  EXPECT_EQ(asProvidersSpell({}), Names());
+}
+
 }  // namespace Corvcim

@@ -4,6 +4,7 @@
 
 #include <tarn/Common.h>
 #include <algorithm>
+#include <cctype>
 #include <iterator>
 #include <map>
 #include <nlohmann/json.hpp>
@@ -450,6 +451,37 @@ TEST(Corvcim, ListsTheClasses) {
   EXPECT_EQ(classes.size(), 10U);
   EXPECT_EQ(classes[5]["properties"][0].dump(),
             R"({"key":true,"name":"GroupComponent","referenceClass":"HALDA_ComputerSystem","type":"ref"})");
+}
+
+TEST(Corvcim, PropertiesAreSelectedInAnySpelling) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", corePath("P0.C0"), "elementNAME"}),
+            success(corePath("P0.C0") + "\n  InstanceID   P0.C0\n  ElementName  Core 0\n"));
+  for (const std::string spelling : {"UniqueId", "UniqueID", "uniqueid"}) {
+    const Finished run = corvcimOn(twoCoreMachine(), {"-o", "json", "ei", "CIM_Processor", spelling});
+    EXPECT_EQ(nlohmann::json::parse(run.output)[0]["properties"]["UniqueId"], "0FA9") << spelling;
+  }
+  const Finished related = corvcimOn(
+      twoCoreMachine(), {"-o", "json", "ai", "-ac", "HALDA_CPUConcreteComponent", corePath("P0.C0"), "NAME,family"});
+  const nlohmann::json properties = nlohmann::json::parse(related.output)[0]["properties"];
+  EXPECT_EQ(properties["Name"], "Desk CPU 2");
+  EXPECT_EQ(properties["Family"], 179);
+}
+
+TEST(Corvcim, JsonHasTheSameValuesForOnePropertyAsForAll) {
+  for (const auto& definition : nlohmann::json::parse(corvcim({"classes", "-o", "json"}).output)) {
+    const std::string name = definition["class"];
+    const nlohmann::json all = nlohmann::json::parse(corvcimOn(twoCoreMachine(), {"-o", "json", "ei", name}).output);
+    for (const auto& property : definition["properties"]) {
+      const std::string ownName = property["name"];
+      std::string lowered = ownName;
+      std::ranges::transform(lowered, lowered.begin(), [](unsigned char c) { return std::tolower(c); });
+
+      const Finished run = corvcimOn(twoCoreMachine(), {"-o", "json", "ei", name, lowered});
+
+      const nlohmann::json one = nlohmann::json::parse(run.output);
+      EXPECT_EQ(one[0]["properties"].at(ownName), all[0]["properties"].at(ownName)) << name;
+    }
+  }
 }
 
 TEST(Corvcim, LanguageIsForPeopleAlone) {
