@@ -12,7 +12,7 @@ tracked() {
     git -c safe.directory='*' ls-files -- "$@" | while read -r file; do [[ ! -e $file ]] || echo "$file"; done
   else
     local pattern names=(-false)
-    for pattern in "${@:-*}"; do names+=(-o -name "$pattern"); done
+    for pattern in "${@:-*}"; do names+=(-o -path "./$pattern"); done
     find . -path ./build -prune -o -type f \( "${names[@]}" \) -printf '%P\n'
   fi
 }
