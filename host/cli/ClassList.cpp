@@ -72,10 +72,42 @@ std::string classesAsJson() {
   return json.take();
 }
 
+std::string declarationOf(const PropertyDefinition& property) {
+  std::string type = property.referenceClass.empty() ? typeName(property.type) : std::string(property.referenceClass);
+  std::string name(property.name);
+  if (!property.referenceClass.empty()) {
+    type += " REF";
+  } else if (type.ends_with("[]")) {
+    type.resize(type.size() - 2);  // MOF has them after the name
+    name += "[]";
+  }
+  return "  " + std::string(property.key ? "[Key] " : "") + type + ' ' + name + ";\n";
+}
+
+std::string classesAsMof() {
+  std::string mof;
+  for (const ClassDefinition& definition : classDefinitions()) {
+    mof.append(mof.empty() ? "" : "\n").append(definition.association ? "[Association]\n" : "");
+    mof.append("class ").append(definition.name).append(" : ").append(definition.parent).append(" {\n");
+    for (const PropertyDefinition& property : definition.properties) {
+      mof += declarationOf(property);
+    }
+    mof += "};\n";
+  }
+  return mof;
+}
+
 }  // namespace
 
 std::string writeClassList(Format format) {
-  return format == Format::Json ? classesAsJson() : classesAsText();
+  switch (format) {
+    case Format::Mof:
+      return classesAsMof();
+    case Format::Json:
+      return classesAsJson();
+    default:
+      return classesAsText();
+  }
 }
 
 }  // namespace Corvcim

@@ -56,7 +56,7 @@ constexpr std::string_view snapshotDetails =
 constexpr VerbSyntax overview = {"", Verb::Overview, "", 0, 0, "one screen about the processors", textOnly, false, ""};
 
 constexpr VerbSyntax syntaxes[] = {
-    {"classes", Verb::Classes, "", 0, 0, "the classes that can be asked, with their keys", plainFormats, false, ""},
+    {"classes", Verb::Classes, "", 0, 0, "the classes that can be asked, with their keys", dataFormats, false, ""},
     {"ei", Verb::EnumerateInstances, "CLASS [PROPERTY,...]", 1, 2, "every instance of a class", dataFormats, false,
      classDetails},
     {"ein", Verb::EnumerateInstanceNames, "CLASS", 1, 1, "the paths of every instance", dataFormats, false,

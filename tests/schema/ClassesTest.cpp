@@ -3,6 +3,8 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <filesystem>
+#include <fstream>
 #include <set>
 #include <string>
 
@@ -10,6 +12,7 @@
 #include "host/DmtfClasses.h"
 #include "host/broker/Names.h"
 #include "host/broker/Value.h"
+#include "host/cli/ClassList.h"
 #include "host/cli/results/ValueNames.h"
 #include "tests/schema/Mof.h"
 
@@ -94,6 +97,23 @@ TEST(Classes, MofAndTableHaveTheSamePropertiesKeysAndTypes) {
     EXPECT_EQ(Mof::find(each.qualifiers, "Association") != nullptr, definition->association) << each.name;
     EXPECT_EQ(fromMof(each), fromTable(*definition)) << each.name;
     EXPECT_EQ(each.properties.size(), definition->properties.size()) << each.name;
+  }
+}
+
+TEST(Classes, TheHostDeclaresThoseOfTheTable) {
+  const std::string file = testing::TempDir() + "class-list.mof";
+  std::ofstream(file) << writeClassList(Format::Mof);
+
+  const std::vector<Mof::Class> declared = Mof::readClasses(file);
+
+  std::filesystem::remove(file);
+  ASSERT_EQ(declared.size(), classDefinitions().size());
+  for (std::size_t i = 0; i < declared.size(); ++i) {
+    const ClassDefinition& definition = classDefinitions()[i];
+    EXPECT_EQ(declared[i].name, definition.name);
+    EXPECT_EQ(declared[i].parent, definition.parent);
+    EXPECT_EQ(Mof::find(declared[i].qualifiers, "Association") != nullptr, definition.association) << definition.name;
+    EXPECT_EQ(fromMof(declared[i]), fromTable(definition)) << definition.name;
   }
 }
 

@@ -453,6 +453,25 @@ TEST(Corvcim, ListsTheClasses) {
             R"({"key":true,"name":"GroupComponent","referenceClass":"HALDA_ComputerSystem","type":"ref"})");
 }
 
+TEST(Corvcim, DeclaresTheClassesAsMof) {
+  const Finished run = corvcim({"classes", "-o", "mof"});
+
+  EXPECT_TRUE(
+      run.output.starts_with("class HALDA_ComputerSystem : CIM_ComputerSystem {\n"
+                             "  [Key] string CreationClassName;\n"
+                             "  [Key] string Name;\n"
+                             "  string Caption;\n"))
+      << run;
+  EXPECT_TRUE(
+      run.output.ends_with("\n"
+                           "[Association]\n"
+                           "class HALDA_CPUElementCapabilities : CIM_ElementCapabilities {\n"
+                           "  [Key] HALDA_CPUProcessor REF ManagedElement;\n"
+                           "  [Key] HALDA_CPUProcessorCapabilities REF Capabilities;\n"
+                           "};\n"))
+      << run;
+}
+
 TEST(Corvcim, PropertiesAreSelectedInAnySpelling) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", corePath("P0.C0"), "elementNAME"}),
             success(corePath("P0.C0") + "\n  InstanceID   P0.C0\n  ElementName  Core 0\n"));
