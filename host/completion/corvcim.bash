@@ -38,6 +38,13 @@ _corvcim_description() {
   fi
 }
 
+# The formats that the verb has, as its help lists them; without a verb all.
+_corvcim_formats() {
+  local formats
+  formats=$("${COMP_WORDS[0]}" "$verb" --help 2>/dev/null | sed -n '/^Output: /{s///;s/\.$//;s/,//g;s/ or / /;p;}')
+  _corvcim_offer "${formats:-text mof json svg dot}"
+}
+
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
   local verbs="classes ei ein gi ai ain ri rin inventory explain snapshot diff tree"
@@ -51,14 +58,7 @@ _corvcim() {
 
   case $previous in
     -i | --inventory) _corvcim_inventory && return ;;
-    -o | --output)
-      case $verb in
-        tree) _corvcim_offer "text svg dot" ;;
-        classes | inventory | explain | diff) _corvcim_offer "text json" ;;
-        *) _corvcim_offer "text mof json svg dot" ;;
-      esac
-      return
-      ;;
+    -o | --output) _corvcim_formats && return ;;
     -l | --library | --companion) _corvcim_files "$current" && return ;;
     -n | --namespace) _corvcim_offer "root/cimv2" && return ;;
     --language) _corvcim_offer "de en es fr ja zh_CN" && return ;;
