@@ -20,7 +20,7 @@ tracked() {
 check_hygiene() {
   local status=0 check
   cd "$root" || return
-  for check in check_texts check_versions check_documented_messages check_undocumented_messages; do
+  for check in check_texts check_versions check_keys check_documented_messages check_undocumented_messages; do
     $check || status=1
   done
   return $status
@@ -62,6 +62,18 @@ check_versions() {
   same_version "$version" packaging/rpm/corvane-cpu.spec "s/^Version: *$number$/\1/p" || status=1
   same_version "$version" packaging/rpm/corvane-cpu.spec "/^\* /{s/.* - $number-[0-9]+$/\1/p;q}" || status=1
   return $status
+}
+
+# The keys of the configuration: those that the library reads, those of the file, those that are described.
+check_keys() {
+  local keys
+  keys=$(sed -n '/eys = {/,/};/p' platform/common/Configuration.cpp | grep -o '"[a-z.]*"' | tr -d '"' | sort)
+  diff <(echo "$keys") <(sed -n 's/^#\([a-z.]*\) = .*/\1/p' packaging/corvane.conf | sort) ||
+    { echo "packaging/corvane.conf has other keys than platform/common/Configuration.cpp" && return 1; }
+  # shellcheck disable=SC2016
+  diff <(echo "$keys") <(sed -n '/^## The configuration file/,/^## /s/^| \(`[^|]*`\) |.*/\1/p' docs/logging.md |
+    tr -d '`,' | xargs -n 1 | sort) ||
+    { echo "docs/logging.md describes other keys than platform/common/Configuration.cpp" && return 1; }
 }
 
 check_format() {
