@@ -80,6 +80,15 @@ CMPIInstanceMI* LoadedLibrary::instanceMI(const std::string& className) {
   return library_.instanceMI(broker_, providerOf(className));
 }
 
+void LoadedLibrary::createInterfaces() {
+  for (const std::string& name : servedClasses()) {
+    instanceMI(name);
+  }
+  for (const std::string& name : associationClasses()) {
+    static_cast<void>(library_.associationMI(broker_, providerOf(name)));
+  }
+}
+
 Response LoadedLibrary::enumerateInstances(const std::string& className) {
   return broker_.enumerateInstances(instanceMI(className), {"", nameSpace, className, {}});
 }

@@ -41,6 +41,9 @@ class LoadedLibrary {
  public:
   explicit LoadedLibrary(Corvcim::LoadScope scope = Corvcim::LoadScope::Global);
 
+  /// What a broker does before the first request: calls every factory function.
+  void createInterfaces();
+
   Corvcim::Response enumerateInstances(const std::string& className);
   Corvcim::Response enumerateInstanceNames(const std::string& className);
   Corvcim::Response getInstance(const Corvcim::ObjectPath& path);

@@ -3,10 +3,17 @@
 #include <dlfcn.h>
 #include <gtest/gtest.h>
 #include <malloc.h>
+#include <sys/inotify.h>
+#include <sys/ioctl.h>
+#include <unistd.h>
 
+#include <cerrno>
+#include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <set>
 #include <string>
+#include <vector>
 
 #include "tests/library/LoadedLibrary.h"
 
@@ -89,13 +96,72 @@ TEST_P(Unload, OfTheLiveInventoryLeavesNothingBehind) {
   }
 }
 
-// Loading does no work: no inventory, no configuration, no message.
-TEST_P(Unload, WithoutARequestNothingIsRead) {
-  const Environment environment(Library::quietly("json:/no/such/file"));
-  const LoadedLibrary library(GetParam());
-  for (const std::string& name : Library::servedClasses()) {
-    EXPECT_GT(Library::mappings(), 0U) << name;
+/// A directory with all that the library may open: an inventory, a configuration, and the place for its
+/// trace. Tells what was opened, read or made there.
+class WatchedDirectory {
+ public:
+  WatchedDirectory() : path_(::testing::TempDir() + "watched-" + std::to_string(getpid())), watch_(inotify_init1(0)) {
+    std::filesystem::create_directories(path_);
+    std::filesystem::copy_file(Library::fixture("virtual-machine").substr(std::string("json:").size()),
+                               path_ + "/tree.json");
+    std::ofstream(path_ + "/corvane.conf") << "log.level = debug\n";
+    EXPECT_GE(inotify_add_watch(watch_, path_.c_str(), IN_ALL_EVENTS), 0) << std::strerror(errno);
   }
+  ~WatchedDirectory() {
+    close(watch_);
+    std::filesystem::remove_all(path_);
+  }
+  WatchedDirectory(const WatchedDirectory&) = delete;
+  WatchedDirectory& operator=(const WatchedDirectory&) = delete;
+
+  /// Everything that the library says goes to standard error and into the trace.
+  [[nodiscard]] Environment::Variables variables() const {
+    Environment::Variables variables = Library::quietly("json:" + path_ + "/tree.json");
+    variables["CORVANE_CONFIG"] = path_ + "/corvane.conf";
+    variables["CORVANE_LOG"] = "0:stderr";
+    variables["CORVANE_TRACE"] = "0:file:" + path_ + "/trace";
+    return variables;
+  }
+
+  /// The names of the files that something happened to since this was last asked.
+  std::set<std::string> takeTouched() {
+    std::set<std::string> names;
+    int waiting = 0;
+    while (ioctl(watch_, FIONREAD, &waiting) == 0 && waiting > 0) {
+      std::vector<char> events(static_cast<std::size_t>(waiting));
+      const ssize_t length = read(watch_, events.data(), events.size());
+      for (std::size_t at = 0; length > 0 && at < static_cast<std::size_t>(length);) {
+        inotify_event event{};
+        std::memcpy(&event, &events[at], sizeof event);
+        names.insert(event.len > 0 ? &events[at + sizeof event] : "");
+        at += sizeof event + event.len;
+      }
+    }
+    return names;
+  }
+
+ private:
+  std::string path_;
+  int watch_;
+};
+
+using Names = std::set<std::string>;
+
+// Loading and registering do no work: no inventory, no configuration, no message.
+TEST_P(Unload, WithoutARequestNothingIsRead) {
+  WatchedDirectory directory;
+  const Environment environment(directory.variables());
+  ::testing::internal::CaptureStderr();
+  LoadedLibrary library(GetParam());
+  library.createInterfaces();
+  EXPECT_EQ(directory.takeTouched(), Names());
+  EXPECT_EQ(::testing::internal::GetCapturedStderr(), "");
+
+  // All of this would have been seen.
+  ::testing::internal::CaptureStderr();
+  library.enumerateInstances("HALDA_CPUProcessor");
+  EXPECT_EQ(directory.takeTouched(), (Names{"tree.json", "corvane.conf", "trace"}));
+  EXPECT_NE(::testing::internal::GetCapturedStderr(), "");
 }
 
 TEST(Reload, SeesTheMachineAnew) {
