@@ -94,18 +94,27 @@ TEST_P(Frame, CleanupSucceedsAndReleasesNothing) {
   inventory().processor("cpu0").core("core0").cache("cache0");
   enumerateInstances(provider().className);
   const auto again = enumerateInstances(provider().className);
+  CMPIAssociationMI* association =
+      provider().createAssociationMI != nullptr ? associationMI(provider().className) : nullptr;
   forgetTraces();
 
   for (const CMPIBoolean terminating : {CMPIBoolean{0}, CMPIBoolean{1}}) {
     const Request request(broker);
-    const CMPIStatus status = mi()->ft->cleanup(mi(), request.context(), terminating);
-    EXPECT_EQ(status.rc, CMPI_RC_OK);
-    EXPECT_EQ(status.msg, nullptr);
-    expectNothingHappened(request, status);
+    std::vector<CMPIStatus> statuses = {mi()->ft->cleanup(mi(), request.context(), terminating)};
+    if (association != nullptr) {
+      statuses.push_back(association->ft->cleanup(association, request.context(), terminating));
+    }
+    for (const CMPIStatus& status : statuses) {
+      EXPECT_EQ(status.rc, CMPI_RC_OK);
+      EXPECT_EQ(status.msg, nullptr);
+      expectNothingHappened(request, status);
+    }
   }
 
+  // The other associations ask the inventory anew for what belongs together.
   inventory().reset();
-  if (provider().createAssociationMI == nullptr) {
+  if (association == nullptr || provider().className == "HALDA_CPUElementCapabilities") {
+    EXPECT_EQ(again.instances.size(), 1U);
     EXPECT_EQ(enumerateInstances(provider().className), again);
     EXPECT_EQ(inventory().calls(), std::vector<std::string>());
   }
