@@ -7,6 +7,7 @@
 #include <utility>
 #include <vector>
 
+#include "model/StateCodes.h"
 #include "tests/model/CodeTables.h"
 
 using CodeTables::codesToTry;
@@ -68,6 +69,16 @@ TEST(ProcessorCore, ReadsEnabledWhateverWasStored) {
     EXPECT_EQ(core.getEnabledState(), 2) << code;
     EXPECT_EQ(core.getCoreEnabledState(), 2) << code;
     EXPECT_EQ(core.getEnabledState(), 2) << code;
+  }
+}
+
+// Since cores read enabled, no getter shows what was stored: only the table does.
+TEST(ProcessorCore, CoreEnabledStateByNodeStatus) {
+  using namespace Tarn::CPUProvider;
+  const CodeTables::Table expected = {{0, 0}, {1, 2}, {2, 4}, {3, 5}};
+  for (const unsigned int code : codesToTry()) {
+    EXPECT_EQ(translate(coreEnabledStates, code, coreEnabledStateUnknown), CodeTables::find(expected, code).value_or(0))
+        << code;
   }
 }
 
