@@ -57,8 +57,7 @@ class Teller {
         say(change, {Verbal::None, " came online" + withParts, each});
         return;
       case Event::SocketEmptied:
-        say(change, {Verbal::None,
-                     ": the socket is empty now" + (parts.empty() ? "" : "; " + parts + " went with the processor")});
+        say(change, {Verbal::None, ": the socket is empty now" + (parts.empty() ? "" : withParts + " gone"), each});
         // That the processor's properties went with it says no more.
         tellFields(change, [](const FieldChange& field) { return field.name != "status" && field.after; });
         return;

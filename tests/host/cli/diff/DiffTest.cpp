@@ -85,8 +85,24 @@ TEST(Diff, ASocketWasEmptiedAndFilled) {
                         .build();
   const Tree emptied = TreeBuilder().processor("P0").processor("P1").status(Status::emptySocket).build();
 
-  EXPECT_EQ(told(full, emptied), "P1: the socket is empty now; 2 cores and 1 cache went with the processor\n");
+  EXPECT_EQ(told(full, emptied), "P1: the socket is empty now, with 2 cores and 1 cache gone\n");
   EXPECT_EQ(told(emptied, full), "P1: the socket has a processor now: Some CPU, with 2 cores and 1 cache\n");
+}
+
+TEST(Diff, TheSocketsThatWereEmptiedAlikeShareASentence) {
+  const auto machine = [](bool isFull) {
+    TreeBuilder builder;
+    for (const std::string processor : {"P0", "P1"}) {
+      builder.processor(processor).status(isFull ? Status::inUse : Status::emptySocket);
+      if (isFull) {
+        builder.core(processor + ".C0").core(processor + ".C1").cache(processor + ".L3.0");
+      }
+    }
+    return builder.build();
+  };
+
+  EXPECT_EQ(told(machine(true), machine(false)),
+            "P0 and P1: the socket is empty now, with 2 cores and 1 cache gone each\n");
 }
 
 TEST(Diff, WhatAnEmptySocketStillHasIsTold) {
