@@ -4,6 +4,8 @@
 #include <optional>
 #include <string_view>
 
+#include "platform/instrumentation/Source.h"
+
 namespace Corvcim {
 namespace {
 
@@ -83,10 +85,23 @@ std::vector<std::string> splitAtCommas(std::string_view list) {
   return names;
 }
 
+/// What the user typed is at fault here, so nothing is said of the configuration that names a source as well.
+void checkSource(std::string_view said, std::string_view source) {
+  if (!Tarn::Inventory::namesSource(source)) {
+    fail(std::string(said) + ": " + quoted(source) + " names no source of an inventory: it can be " +
+         std::string(Tarn::Inventory::sourceForms));
+  }
+}
+
+void setInventory(Options& options, const std::string& source) {
+  checkSource("--inventory", source);
+  options.inventory = source;
+}
+
 constexpr Option optionTable[] = {
     {"--library", "-l", true, everyVerb, [](Options& o, const std::string& value) { o.library = value; }},
     {"--companion", "", true, everyVerb, [](Options& o, const std::string& value) { o.companion = value; }},
-    {"--inventory", "-i", true, oneInventory, [](Options& o, const std::string& value) { o.inventory = value; }},
+    {"--inventory", "-i", true, oneInventory, setInventory},
     {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
     {"--namespace", "-n", true, everyVerb, setNameSpace},
     {"--output", "-o", true, everyVerb, setFormat},
@@ -167,8 +182,10 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
   if (count >= 1) {
     options.target = operands[1];
   }
-  if (count >= 2 && verb->verb == Verb::Diff) {
+  if (verb->verb == Verb::Diff) {
     options.secondTarget = operands[2];
+    checkSource("diff", options.target);
+    checkSource("diff", options.secondTarget);
   } else if (count >= 2) {
     options.hasPropertyList = true;
     options.properties = splitAtCommas(operands[2]);

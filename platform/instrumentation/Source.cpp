@@ -100,8 +100,7 @@ Choice choose(std::string_view specification) {
   if (!choice) {
     throw InventoryError("cannot read the inventory", '"' + std::string(specification) + '"',
                          "it names no source of an inventory",
-                         "set CORVANE_INVENTORY, or inventory in the configuration, to live, root:DIRECTORY, "
-                         "snapshot:FILE, json:FILE or smbios:FILE");
+                         "set CORVANE_INVENTORY, or inventory in the configuration, to " + std::string(sourceForms));
   }
   return *choice;
 }
@@ -142,6 +141,10 @@ Tree loadSmbios(const std::string& location, Detail detail) {
 }
 
 }  // namespace
+
+bool namesSource(std::string_view specification) {
+  return find(specification).has_value();
+}
 
 Tree loadInventory(std::string_view specification, Detail detail) {
   const auto [scheme, location] = choose(specification);

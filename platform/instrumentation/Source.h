@@ -9,6 +9,12 @@
 
 namespace Tarn::Inventory {
 
+/// What names a source, for messages.
+inline constexpr std::string_view sourceForms = "live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE";
+
+/// Whether the text names a source, be its file there or not.
+bool namesSource(std::string_view specification);
+
 /// Reads the inventory that the text names:
 ///
 ///     live          this machine

@@ -152,6 +152,17 @@ TEST(Options, DiffNamesWhatIsMissing) {
   EXPECT_EQ(complaint({"diff", "live"}), "diff: B is missing; usage: corvcim [OPTION...] diff A B");
 }
 
+TEST(Options, ASourceThatThereIsNotIsNamed) {
+  const std::string forms =
+      " names no source of an inventory: it can be live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE; see "
+      "'corvcim --help'";
+
+  EXPECT_EQ(complaint({"-i", "machine.json", "tree"}), "--inventory: 'machine.json'" + forms);
+  EXPECT_EQ(complaint({"--inventory=", "tree"}), "--inventory: ''" + forms);
+  EXPECT_EQ(complaint({"diff", "live", "json:"}), "diff: 'json:'" + forms);
+  EXPECT_EQ(complaint({"diff", "machine.json", "live"}), "diff: 'machine.json'" + forms);
+}
+
 TEST(Options, SnapshotMayNameAFileAndKeepIdentifiers) {
   const Options toOutput = parse({"snapshot"});
   const Options toFile = parse({"snapshot", "--unmasked", "machine.txt"});

@@ -80,6 +80,13 @@ TEST(Source, RefusesWhatNamesNoSource) {
     EXPECT_EQ(refusalOf(text), "cannot read the inventory: \"" + std::string(text) +
                                    "\": it names no source of an inventory; set CORVANE_INVENTORY, or inventory in the "
                                    "configuration, to live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE");
+    EXPECT_FALSE(namesSource(text)) << text;
+  }
+}
+
+TEST(Source, IsNamedWhetherItIsThereOrNot) {
+  for (const char* text : {"live", "root:/nowhere", "snapshot:x", "json:a:b", "smbios:x", "smbios:x+live"}) {
+    EXPECT_TRUE(namesSource(text)) << text;
   }
 }
 
