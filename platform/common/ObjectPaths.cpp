@@ -9,6 +9,8 @@
 
 #include "platform/common/Ascii.h"
 #include "platform/common/KeyValue.h"
+#include "platform/common/Report.h"
+#include "platform/cvlog/Level.h"
 
 namespace Tarn {
 namespace {
@@ -22,8 +24,6 @@ using Common::textOf;
 
 // Associations of associations nest two or three deep. A path that refers to itself must end somewhere.
 constexpr int kDeepestReference = 8;
-
-constexpr int kLevelInfo = 4000;
 
 struct Key {
   std::string_view name;
@@ -158,15 +158,6 @@ class Comparison {
   std::string difference_;
 };
 
-void logDifference(const std::string& difference) {
-  static const std::string component = "Corvane.Common";
-  static const char* const function = "isObjPathsEqualWithLog";
-  static const char* const file = "ObjectPaths.cpp";
-  const std::string text = "Object paths differ: " + difference;
-  CVLog::CVLogger::logLevelMessage(function, file, __LINE__, component, kLevelInfo, nullptr, 0, 0, text);
-  CVLog::CVLogger::traceLevelMessage(function, file, __LINE__, component, kLevelInfo, nullptr, 0, 0, text);
-}
-
 }  // namespace
 
 bool isObjPathsEqual(const CMPIObjectPath* left, const CMPIObjectPath* right, bool flag) {
@@ -175,11 +166,12 @@ bool isObjPathsEqual(const CMPIObjectPath* left, const CMPIObjectPath* right, bo
 
 bool isObjPathsEqualWithLog(const CMPIBroker* /*broker*/, const CMPIObjectPath* left, const CMPIObjectPath* right,
                             bool flag) {
-  const bool explains = CVLog::CVLogger::logTakes(kLevelInfo) || CVLog::CVLogger::traceTakes(kLevelInfo);
+  constexpr int level = CVLog::kLevelInfo;
+  const bool explains = CVLog::CVLogger::logTakes(level) || CVLog::CVLogger::traceTakes(level);
   Comparison comparison(flag, explains);
   const bool areEqual = comparison.equal(left, right);
   if (!areEqual && explains) {
-    logDifference(comparison.difference());
+    Common::report({"Corvane.Common", "ObjectPaths.cpp"}, level, "Object paths differ: " + comparison.difference());
   }
   return areEqual;
 }

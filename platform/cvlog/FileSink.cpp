@@ -280,13 +280,7 @@ void FileSink::adopt(const FileDescriptor& next) {
 void FileSink::report(std::string_view why) const {
   const std::string text =
       "log file " + path_ + ' ' + std::string(why) + "; messages go to the file that is open, however large";
-  SystemLogSink().write({.time = std::chrono::system_clock::now(),
-                         .level = kLevelWarning,
-                         .component = "Corvane.Logger",
-                         .function = __func__,
-                         .file = "FileSink.cpp",
-                         .line = __LINE__,
-                         .text = text});
+  SystemLogSink().write(ownMessage(kLevelWarning, "FileSink.cpp", text));
 }
 
 }  // namespace CVLog

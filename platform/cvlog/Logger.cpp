@@ -44,7 +44,6 @@ std::unique_ptr<Sink> openSink(const SinkSettings& settings) {
   return sink;
 }
 
-constexpr std::string_view kComponent = "Corvane.Logger";
 constexpr std::string_view kThisFile = "Logger.cpp";
 
 }  // namespace
@@ -123,25 +122,13 @@ void Logger::report(const std::vector<ConfigurationProblem>& problems) {
   const std::unique_ptr<Sink> sink = openSink(defaultLog());
   for (const ConfigurationProblem& problem : problems) {
     const std::string text = "Configuration: " + problem.where + ": " + problem.why;
-    sink->write({.time = std::chrono::system_clock::now(),
-                 .level = kLevelError,
-                 .component = kComponent,
-                 .function = __func__,
-                 .file = kThisFile,
-                 .line = __LINE__,
-                 .text = text});
+    sink->write(ownMessage(kLevelError, kThisFile, text));
   }
 }
 
 void Logger::noteThatFileWasRead() {
   const std::string text = "Configuration: " + file_.path() + " was read again";
-  const Message message = {.time = std::chrono::system_clock::now(),
-                           .level = kLevelInfo,
-                           .component = kComponent,
-                           .function = __func__,
-                           .file = kThisFile,
-                           .line = __LINE__,
-                           .text = text};
+  const Message message = ownMessage(kLevelInfo, kThisFile, text);
   log(message);
   trace(message);
 }

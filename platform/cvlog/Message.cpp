@@ -97,6 +97,17 @@ std::string roomFor(const Message& message) {
 
 }  // namespace
 
+Message ownMessage(int level, std::string_view file, std::string_view text, system_clock::time_point time,
+                   std::string_view function, int line) {
+  return {.time = time,
+          .level = level,
+          .component = "Corvane.Logger",
+          .function = function,
+          .file = file,
+          .line = line,
+          .text = text};
+}
+
 std::string formatLine(const Message& message) {
   std::string line = roomFor(message);
   appendTime(line, message.time);

@@ -18,6 +18,11 @@ struct Message {
   std::string_view text{};
 };
 
+/// A message of the logger itself, told as one of the calling function and line. `file` is the base name of its source.
+Message ownMessage(int level, std::string_view file, std::string_view text,
+                   std::chrono::system_clock::time_point time = std::chrono::system_clock::now(),
+                   std::string_view function = __builtin_FUNCTION(), int line = __builtin_LINE());
+
 /// The message as one line without its end:
 /// `2026-03-01T09:30:00.125Z error Corvane.CPUProvider getFactoryInstance CPUObjFactory.cpp:2044 the text`.
 /// The time is UTC. Only the text has blanks of its own. A byte that would break the line or act on a terminal is

@@ -1,7 +1,5 @@
 #include "platform/instrumentation/ProcessTree.h"
 
-#include <cvlog/CVLogger.h>
-
 #include <exception>
 #include <mutex>
 #include <string>
@@ -9,6 +7,8 @@
 
 #include "platform/common/Configuration.h"
 #include "platform/common/Environment.h"
+#include "platform/common/Report.h"
+#include "platform/cvlog/Level.h"
 #include "platform/instrumentation/Source.h"
 
 namespace Tarn::Inventory {
@@ -21,23 +21,18 @@ constinit std::shared_ptr<const Tree> current;
 
 // Whoever asks for the tree may say no more than that it failed. Every request asks again, so what is
 // known is not said twice.
-void report(const std::string& text) {
+void reportOnce(const std::string& text) {
   static std::string reported;
-  if (std::exchange(reported, text) == text) {
-    return;
+  if (std::exchange(reported, text) != text) {
+    Common::report({"Corvane.Inventory", "ProcessTree.cpp"}, CVLog::kLevelError, text);
   }
-  constexpr int levelError = 6000;
-  constexpr const char* file = "ProcessTree.cpp";
-  const std::string component = "Corvane.Inventory";
-  CVLog::CVLogger::logLevelMessage(__func__, file, __LINE__, component, levelError, nullptr, 0, 0, text);
-  CVLog::CVLogger::traceLevelMessage(__func__, file, __LINE__, component, levelError, nullptr, 0, 0, text);
 }
 
 Tree loadChosen() {
   try {
     return loadInventory(chosenSource());
   } catch (const std::exception& error) {
-    report(error.what());
+    reportOnce(error.what());
     throw;
   }
 }

@@ -1,4 +1,3 @@
-#include <cvlog/CVLogger.h>
 #include <tarn/Locale.h>
 
 #include <array>
@@ -9,6 +8,8 @@
 
 #include "platform/common/Configuration.h"
 #include "platform/common/Environment.h"
+#include "platform/common/Report.h"
+#include "platform/cvlog/Level.h"
 #include "platform/locale/LanguageId.h"
 #include "platform/locale/ResourceLibrary.h"
 
@@ -19,7 +20,6 @@ using Common::Setting;
 
 // The language where no other is asked for.
 constexpr std::string_view kDefaultLanguage = "en";
-constexpr int kLevelError = 6000;
 
 std::optional<Setting> wantedLanguage() {
   constexpr const char* kOverride = "CORVANE_LANGUAGE";
@@ -33,12 +33,9 @@ std::optional<Setting> wantedLanguage() {
 }
 
 void reportUnknown(const Setting& setting) {
-  const std::string text = "Configuration: " + setting.where + ": \"" + setting.value +
-                           "\" does not count: expected a language id such as de or de_AT";
-  CVLog::CVLogger::logLevelMessage(__func__, "Locale.cpp", __LINE__, "Corvane.Locale", kLevelError, nullptr, 0, 0,
-                                   text);
-  CVLog::CVLogger::traceLevelMessage(__func__, "Locale.cpp", __LINE__, "Corvane.Locale", kLevelError, nullptr, 0, 0,
-                                     text);
+  Common::report({"Corvane.Locale", "Locale.cpp"}, CVLog::kLevelError,
+                 "Configuration: " + setting.where + ": \"" + setting.value +
+                     "\" does not count: expected a language id such as de or de_AT");
 }
 
 std::string languageOfThisProcess() {
