@@ -2,12 +2,11 @@
 
 #include <algorithm>
 
+#include "platform/common/Hex.h"
 #include "platform/instrumentation/tree/Utf8.h"
 
 namespace Corvcim {
 namespace {
-
-constexpr char hexDigits[] = "0123456789ABCDEF";
 
 unsigned byteAt(std::string_view text, std::size_t index) {
   return static_cast<unsigned char>(text[index]);
@@ -36,8 +35,7 @@ void appendEscape(std::string& text, unsigned byte) {
       return;
     default:
       text += "\\x";
-      text += hexDigits[byte >> 4U];
-      text += hexDigits[byte & 0xFU];
+      Tarn::Common::appendHex(text, static_cast<unsigned char>(byte), Tarn::Common::hexCapitals);
   }
 }
 

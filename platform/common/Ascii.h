@@ -39,13 +39,14 @@ constexpr bool lessIgnoringCase(std::string_view left, std::string_view right) {
                                       [](char a, char b) { return lower(a) < lower(b); });
 }
 
-/// The text without blanks, tabs and carriage returns at both ends: what surrounds a word in a text file.
-constexpr std::string_view trimmed(std::string_view text) {
-  const std::size_t first = text.find_first_not_of(" \t\r");
+/// The text without these characters at both ends; by default blanks, tabs and carriage returns, which surround a word
+/// in a text file.
+constexpr std::string_view trimmed(std::string_view text, std::string_view white = " \t\r") {
+  const std::size_t first = text.find_first_not_of(white);
   if (first == std::string_view::npos) {
     return {};
   }
-  return text.substr(first, text.find_last_not_of(" \t\r") - first + 1);
+  return text.substr(first, text.find_last_not_of(white) - first + 1);
 }
 
 }  // namespace Tarn::Common

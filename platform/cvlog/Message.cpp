@@ -3,6 +3,7 @@
 #include <array>
 #include <cstdio>
 
+#include "platform/common/Hex.h"
 #include "platform/cvlog/Level.h"
 
 namespace CVLog {
@@ -14,8 +15,6 @@ using std::chrono::hh_mm_ss;
 using std::chrono::milliseconds;
 using std::chrono::system_clock;
 using std::chrono::year_month_day;
-
-constexpr std::string_view kHexDigits = "0123456789abcdef";
 
 bool mustEscape(char c) {
   const auto byte = static_cast<unsigned char>(c);
@@ -37,10 +36,8 @@ void appendEscapedByte(std::string& line, char c) {
       line += "\\t";
       return;
     default:
-      const auto byte = static_cast<unsigned char>(c);
       line += "\\x";
-      line += kHexDigits[byte >> 4];
-      line += kHexDigits[byte & 0xf];
+      Tarn::Common::appendHex(line, static_cast<unsigned char>(c));
   }
 }
 

@@ -15,12 +15,6 @@ using Tarn::Inventory::Tree;
 using namespace Tarn::NodeLexicon;
 namespace Status = Tarn::Inventory::Status;
 
-bool isAll(const CpuSet& part, const CpuSet& whole) {
-  CpuSet rest = part;
-  rest.remove(whole);
-  return rest.empty();
-}
-
 bool isPart(const Node& node) {
   return node.type == NodeProcessorCore || node.type == NodeCacheMemory;
 }
@@ -77,7 +71,7 @@ bool DiffCauses::isHidden(const NodeChange& change) const {
     return false;
   }
   const NodeIndex processor = without.find(with.node(core.parent).internalPath);
-  if (processor == noNode || !isAll(core.cpus, without.node(processor).cpus)) {
+  if (processor == noNode || !core.cpus.isSubsetOf(without.node(processor).cpus)) {
     return false;
   }
   bool hasCores = false;

@@ -73,15 +73,6 @@ CacheNode readCache(const Tree& tree, const Node& node) {
   return cache;
 }
 
-bool isWithin(const CpuSet& inner, const CpuSet& outer) {
-  if (!outer.contains(inner.first())) {
-    return inner.empty();
-  }
-  CpuSet rest = inner;
-  rest.remove(outer);
-  return rest.empty();
-}
-
 /// Shared caches from the outside in, those of the same cores as one row.
 struct CacheRow {
   std::vector<CacheUnit> caches;
@@ -112,13 +103,13 @@ class Nesting {
   std::vector<TopologyPart> partsWithin(std::size_t firstRow, const CpuSet* bounds) {
     std::vector<TopologyPart> parts;
     for (std::size_t i = firstRow; i < rows_.size(); ++i) {
-      if (rows_[i].caches.empty() || (bounds != nullptr && !isWithin(rows_[i].cpus, *bounds))) {
+      if (rows_[i].caches.empty() || (bounds != nullptr && !rows_[i].cpus.isSubsetOf(*bounds))) {
         continue;
       }
       addSharedCaches(parts, i);
     }
     for (std::size_t i = 0; i < cores_.size(); ++i) {
-      if (!isPlaced_[i] && (bounds == nullptr || (!cores_[i].cpus.empty() && isWithin(cores_[i].cpus, *bounds)))) {
+      if (!isPlaced_[i] && (bounds == nullptr || (!cores_[i].cpus.empty() && cores_[i].cpus.isSubsetOf(*bounds)))) {
         isPlaced_[i] = true;
         parts.push_back(std::move(cores_[i]));
       }
@@ -169,7 +160,7 @@ void addToRows(std::vector<CacheRow>& rows, const CacheNode& cache) {
 
 TopologyPart* onlyUser(std::vector<TopologyPart>& cores, const CpuSet& cpus) {
   for (TopologyPart& core : cores) {
-    if (isWithin(cpus, core.cpus)) {
+    if (cpus.isSubsetOf(core.cpus)) {
       return &core;
     }
   }

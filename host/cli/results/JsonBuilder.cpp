@@ -4,11 +4,10 @@
 #include <cmath>
 
 #include "host/cli/Text.h"
+#include "platform/common/Hex.h"
 
 namespace Corvcim {
 namespace {
-
-constexpr char hexDigits[] = "0123456789abcdef";
 
 template <class Number>
 void append(std::string& text, Number value) {
@@ -134,8 +133,7 @@ void JsonBuilder::appendText(std::string_view value) {
       json_ += "\\t";
     } else if (byte < 0x20U || byte == 0x7FU) {
       json_ += "\\u00";
-      json_ += hexDigits[byte >> 4U];
-      json_ += hexDigits[byte & 0xFU];
+      Tarn::Common::appendHex(json_, byte);
     } else {
       json_ += c;
     }

@@ -5,6 +5,7 @@
 #include <set>
 #include <utility>
 
+#include "platform/common/Hex.h"
 #include "platform/instrumentation/files/ErrorNames.h"
 #include "platform/instrumentation/tree/Error.h"
 #include "platform/instrumentation/tree/Utf8.h"
@@ -25,7 +26,6 @@ FileError errorOfReading(const Listing& listing) {
 }
 
 constexpr std::size_t bytesInLine = 32;
-constexpr std::string_view hexDigits = "0123456789abcdef";
 
 class ArchiveReader {
  public:
@@ -122,8 +122,8 @@ class ArchiveReader {
 
   void moreBytes(std::string_view text) {
     for (std::size_t i = 0; i < text.size(); i += 2) {
-      const std::size_t high = hexDigits.find(text[i]);
-      const std::size_t low = i + 1 < text.size() ? hexDigits.find(text[i + 1]) : std::string_view::npos;
+      const std::size_t high = Common::hexDigits.find(text[i]);
+      const std::size_t low = i + 1 < text.size() ? Common::hexDigits.find(text[i + 1]) : std::string_view::npos;
       if (high == std::string_view::npos || low == std::string_view::npos) {
         refuse("bytes that are not pairs of the digits 0 to 9 and a to f", "write two digits for each byte");
       }
@@ -178,9 +178,7 @@ void writeBytes(std::string& text, std::string_view contents) {
   for (; !contents.empty(); contents.remove_prefix(std::min(bytesInLine, contents.size()))) {
     text += text.back() == '\n' ? "\t" : "";
     for (const char c : contents.substr(0, bytesInLine)) {
-      const auto byte = static_cast<unsigned char>(c);
-      text += hexDigits[byte >> 4U];
-      text += hexDigits[byte & 0xFU];
+      Common::appendHex(text, static_cast<unsigned char>(c));
     }
     text += '\n';
   }

@@ -5,6 +5,7 @@
 #include <utility>
 #include <variant>
 
+#include "platform/common/Hex.h"
 #include "platform/instrumentation/kernel/SystemModel.h"
 #include "platform/instrumentation/tree/PlainText.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
@@ -83,14 +84,16 @@ Origin originInTables(const Smbios::Structure& structure, const Smbios::Field<st
 }
 
 std::string byteText(Smbios::Bytes bytes) {
-  constexpr std::string_view digits = "0123456789ABCDEF";
   std::string text;
   for (const std::byte byte : bytes) {
     text += text.empty() ? "" : " ";
-    text += digits[std::to_integer<std::size_t>(byte >> 4)];
-    text += digits[std::to_integer<std::size_t>(byte & std::byte{0xF})];
+    Common::appendHex(text, std::to_integer<unsigned char>(byte), Common::hexCapitals);
   }
   return text;
+}
+
+std::string handleText(const Smbios::Structure& structure) {
+  return Common::hexText(structure.handle, 4, Common::hexCapitals);
 }
 
 std::string firmwareText(const Smbios::Field<std::string>& field) {

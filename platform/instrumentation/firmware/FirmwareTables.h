@@ -49,6 +49,9 @@ Origin originInTables(const Smbios::Structure& structure, const Smbios::Field<Va
 /// The bytes as they stand, each with two digits: "57 06 05 00".
 std::string byteText(Smbios::Bytes bytes);
 
+/// The structure's handle with its four digits: "0043".
+std::string handleText(const Smbios::Structure& structure);
+
 /// A text that the firmware gives, as plainText has it; empty where nobody filled it in.
 std::string firmwareText(const Smbios::Field<std::string>& field);
 

@@ -59,15 +59,6 @@ bool isCentral(const Smbios::Processor& processor) {
   return !processor.type || std::ranges::find(otherTypes, *processor.type) == otherTypes.end();
 }
 
-std::string handleText(const Smbios::Processor& processor) {
-  constexpr std::string_view digits = "0123456789ABCDEF";
-  std::string text;
-  for (unsigned int shift = 16; shift > 0; shift -= 4) {
-    text += digits[(processor.structure.handle >> (shift - 4)) & 0xFU];
-  }
-  return text;
-}
-
 // The label as a part of a path; empty where it will not do.
 std::string labelForPath(const Smbios::Processor& processor) {
   std::string label = firmwareText(processor.socket);
@@ -220,7 +211,8 @@ Origin Socket::labelOrigin() const {
   if (structure->socket) {
     return originInTables(structure->structure, structure->socket, "the label of the socket");
   }
-  return {Smbios::placeOf(structure->structure), handleText(*structure), "the socket has no label: its handle"};
+  return {Smbios::placeOf(structure->structure), handleText(structure->structure),
+          "the socket has no label: its handle"};
 }
 
 std::vector<Socket> readSockets(const Smbios::Tables& tables) {
@@ -231,7 +223,7 @@ std::vector<Socket> readSockets(const Smbios::Tables& tables) {
       const std::string label = firmwareText(processor.socket);
       sockets.push_back({.structure = &processor,
                          .path = {},
-                         .label = label.empty() ? "0x" + handleText(processor) : label,
+                         .label = label.empty() ? "0x" + handleText(processor.structure) : label,
                          .status = statusRow(processor).status,
                          .mark = markOf(processor)});
       labels.push_back(labelForPath(processor));
@@ -240,7 +232,7 @@ std::vector<Socket> readSockets(const Smbios::Tables& tables) {
   const std::map<std::string, unsigned int> counts = counted(labels);
   for (std::size_t i = 0; i < sockets.size(); ++i) {
     const bool usable = !labels[i].empty() && counts.at(labels[i]) == 1;
-    sockets[i].path = usable ? "S:" + labels[i] : "S#" + handleText(*sockets[i].structure);
+    sockets[i].path = usable ? "S:" + labels[i] : "S#" + handleText(sockets[i].structure->structure);
   }
   separateEqualHandles(sockets);
   std::ranges::stable_sort(sockets, {}, [](const Socket& socket) { return socket.structure->structure.handle; });

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "platform/common/Ascii.h"
+
 namespace Tarn::Inventory {
 
 // Both leave room for the terminating zero; a path that did not fit names no file.
@@ -20,12 +22,12 @@ std::optional<std::string_view> Attributes::read(const char* path) {
   if (error_ != 0) {
     return std::nullopt;
   }
+  return valueOf(contents_);
+}
+
+std::string_view Attributes::valueOf(std::string_view contents) {
   // The device tree ends its texts with a zero.
-  constexpr std::string_view white(" \t\n\0", 4);
-  const std::string_view value = contents_;
-  const std::size_t first = value.find_first_not_of(white);
-  return first == std::string_view::npos ? std::string_view()
-                                         : value.substr(first, value.find_last_not_of(white) - first + 1);
+  return Common::trimmed(contents, std::string_view(" \t\n\0", 4));
 }
 
 std::optional<unsigned int> Attributes::toNumber(std::string_view text) {

@@ -47,6 +47,9 @@ class Attributes {
 
   FileSystem& files() const { return files_; }
 
+  /// A file's contents without the white space around them.
+  static std::string_view valueOf(std::string_view contents);
+
   static std::optional<unsigned int> toNumber(std::string_view text);
 
  private:

@@ -57,7 +57,7 @@ class CacheReader {
       : machine_(machine), cpus_(machine.cpus()), present_(present), online_(online) {}
 
   std::vector<Cache> read() {
-    for (unsigned int cpu = present_.first(); cpu != CpuSet::limit; cpu = present_.next(cpu)) {
+    for (const unsigned int cpu : present_) {
       unsigned int index = 0;
       while (readCache(cpu, index)) {
         ++index;

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <string_view>
 
+#include "platform/common/Hex.h"
 #include "platform/instrumentation/tree/PlainText.h"
 
 namespace Tarn::Inventory {
@@ -61,13 +62,10 @@ class Fields {
 
 // The register's bytes from the lowest on, in hexadecimal, as SMBIOS tables are printed.
 std::string registerText(unsigned int value) {
-  constexpr std::string_view digits = "0123456789ABCDEF";
   std::string text;
   for (unsigned int shift = 0; shift < 32; shift += 8) {
-    const unsigned int byte = (value >> shift) & 0xFFU;
     text += text.empty() ? "" : " ";
-    text += digits[byte >> 4U];
-    text += digits[byte & 0xFU];
+    Common::appendHex(text, static_cast<unsigned char>((value >> shift) & 0xFFU), Common::hexCapitals);
   }
   return text;
 }

@@ -5,6 +5,8 @@
 #include <string>
 #include <string_view>
 
+#include "platform/common/Hex.h"
+
 namespace Tarn::Inventory {
 
 namespace {
@@ -60,13 +62,7 @@ constexpr std::array accounts = {
 };
 
 std::string hex(unsigned int number) {
-  constexpr std::string_view digits = "0123456789abcdef";
-  std::string text;
-  do {
-    text.insert(text.begin(), digits[number % 16]);
-    number /= 16;
-  } while (number != 0);
-  return "0x" + text;
+  return "0x" + Common::hexText(number);
 }
 
 std::string armRow(const ArmPart& part) {

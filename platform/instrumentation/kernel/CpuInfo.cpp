@@ -2,6 +2,9 @@
 
 #include <algorithm>
 #include <charconv>
+#include <optional>
+
+#include "platform/common/Ascii.h"
 
 namespace Tarn::Inventory {
 
@@ -19,9 +22,7 @@ std::optional<std::string_view> valueOf(std::string_view line, std::string_view 
   if (colon == std::string_view::npos || line[colon] != ':') {
     return std::nullopt;
   }
-  const std::size_t first = line.find_first_not_of(white, colon + 1);
-  return first == std::string_view::npos ? std::string_view()
-                                         : line.substr(first, line.find_last_not_of(white) - first + 1);
+  return Common::trimmed(line.substr(colon + 1), white);
 }
 
 // Calls action(line, its offset) for each line until the action returns false.

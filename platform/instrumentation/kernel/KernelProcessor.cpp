@@ -79,11 +79,10 @@ class Reader {
   }
 
   unsigned int firstOnline(const CpuSet& kind) const {
-    unsigned int cpu = package_.cpus.first();
-    while (cpu != CpuSet::limit && !(kernel_.topology.online.contains(cpu) && kind.contains(cpu))) {
-      cpu = package_.cpus.next(cpu);
-    }
-    return cpu;
+    CpuSet cpus = package_.cpus;
+    cpus.keepOnly(kernel_.topology.online);
+    cpus.keepOnly(kind);
+    return cpus.first();
   }
 
   void addIdentity() {

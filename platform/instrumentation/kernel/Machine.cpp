@@ -23,13 +23,6 @@ std::string attributeOf(unsigned int cpu, std::string_view suffix) {
   return std::string(cpuDirectoryPath) + "/cpu" + std::to_string(cpu) + '/' + std::string(suffix);
 }
 
-std::string trimmed(std::string_view text) {
-  constexpr std::string_view white(" \t\n\0", 4);
-  const std::size_t first = text.find_first_not_of(white);
-  return first == std::string_view::npos ? std::string()
-                                         : std::string(text.substr(first, text.find_last_not_of(white) - first + 1));
-}
-
 // "name: value", or of a field's words "name: word" or "name: without word".
 std::string fieldText(const CpuInfo& info, unsigned int cpu, std::string_view field) {
   const std::size_t slash = field.find('/');
@@ -83,7 +76,7 @@ Origin Machine::originOfCpus(const CpuSet& cpus, std::span<const std::string_vie
                              std::string rule) const {
   const auto hasField = [&](unsigned int cpu) { return !cpuInfo_.field(cpu, field).empty(); };
   for (const std::string_view suffix : suffixes) {
-    for (unsigned int cpu = cpus.first(); cpu != CpuSet::limit; cpu = cpus.next(cpu)) {
+    for (const unsigned int cpu : cpus) {
       if (!rawOf(attributeOf(cpu, suffix)).empty()) {
         return originOfCpu(cpu, suffix, std::move(rule));
       }
@@ -103,7 +96,7 @@ Origin Machine::originInCpuInfo(unsigned int cpu, std::span<const std::string_vi
 
 std::string Machine::rawOf(const std::string& file) const {
   const auto found = record_.files.find(file);
-  return found == record_.files.end() ? std::string() : trimmed(found->second.contents);
+  return found == record_.files.end() ? std::string() : std::string(Attributes::valueOf(found->second.contents));
 }
 
 }  // namespace Tarn::Inventory

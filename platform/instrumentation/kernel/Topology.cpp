@@ -32,7 +32,7 @@ class TopologyReader {
 
   Topology read() {
     readCpuLists();
-    for (unsigned int cpu = topology_.present.first(); cpu != CpuSet::limit; cpu = topology_.present.next(cpu)) {
+    for (const unsigned int cpu : topology_.present) {
       if (!placed_.contains(cpu)) {
         place(cpu);
       }
@@ -184,7 +184,7 @@ class TopologyReader {
   // While a CPU is offline most kernels hide its topology; of its core nothing is known then. The memory
   // node that it is attached to may still tell the package.
   void placeHidden() {
-    for (unsigned int cpu = hidden_.first(); cpu != CpuSet::limit; cpu = hidden_.next(cpu)) {
+    for (const unsigned int cpu : hidden_) {
       machine_.noteUnreadOfCpu(cpu, "topology", "the CPU is offline and the kernel hides its place",
                                "write 1 to the file online in its directory, as root");
       if (Package* package = packageByMemoryNode(cpu)) {
@@ -214,9 +214,7 @@ class TopologyReader {
     if (found == topology_.packages.end()) {
       return nullptr;
     }
-    CpuSet elsewhere = cpus;
-    elsewhere.remove(found->cpus);
-    return elsewhere.empty() ? &*found : nullptr;
+    return cpus.isSubsetOf(found->cpus) ? &*found : nullptr;
   }
 
   void sort() {

@@ -61,13 +61,6 @@ std::string label(const FirmwareCache& cache) {
   return "L" + std::to_string(cache.level) + std::string(contents) + " cache";
 }
 
-std::string hex4(std::uint16_t handle) {
-  const std::array bytes = {static_cast<std::byte>(handle >> 8U), static_cast<std::byte>(handle & 0xFFU)};
-  std::string text = byteText(bytes);
-  std::erase(text, ' ');
-  return text;
-}
-
 /// One cache's node, each value with its field.
 class CacheNode {
  public:
@@ -242,7 +235,7 @@ void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& cach
   for (const FirmwareCache& cache : caches) {
     std::string path = processor + '.' + nameOf(cache);
     if (std::ranges::find(taken, path) != taken.end()) {
-      path += '#' + hex4(cache.structure->structure.handle);
+      path += '#' + handleText(cache.structure->structure);
     }
     CacheNode(tree, cache).add(path, offline);
     taken.push_back(std::move(path));

@@ -127,9 +127,7 @@ class LiveReader {
     }
     addCaches(tree_, kernel_, package, path, told);
     // The kernel hides the caches of CPUs that are offline.
-    CpuSet offline = package.cpus;
-    offline.remove(kernel_.topology.online);
-    if (offline.empty()) {
+    if (package.cpus.isSubsetOf(kernel_.topology.online)) {
       compareCaches(told, kernel, machine_.cpus().files(), path, disagreements_);
     }
   }

@@ -4,6 +4,8 @@
 #include <bit>
 #include <charconv>
 
+#include "platform/common/Ascii.h"
+
 namespace Tarn::Inventory {
 
 namespace {
@@ -26,13 +28,6 @@ bool take(std::string_view& text, char c) {
   return true;
 }
 
-std::string_view trimmed(std::string_view text) {
-  const std::string_view white = " \t\n";
-  const std::size_t first = text.find_first_not_of(white);
-  return first == std::string_view::npos ? std::string_view()
-                                         : text.substr(first, text.find_last_not_of(white) - first + 1);
-}
-
 }  // namespace
 
 CpuSet::CpuSet(std::initializer_list<unsigned int> numbers) {
@@ -43,7 +38,7 @@ CpuSet::CpuSet(std::initializer_list<unsigned int> numbers) {
 
 std::optional<CpuSet> CpuSet::fromList(std::string_view list) {
   CpuSet set;
-  std::string_view rest = trimmed(list);
+  std::string_view rest = Common::trimmed(list, " \t\n");
   if (rest.empty()) {
     return set;
   }
@@ -121,6 +116,18 @@ bool CpuSet::intersects(const CpuSet& other) const {
     }
   }
   return false;
+}
+
+bool CpuSet::isSubsetOf(const CpuSet& other) const {
+  if (words_.size() > other.words_.size()) {
+    return false;
+  }
+  for (std::size_t i = 0; i < words_.size(); ++i) {
+    if ((words_[i] & ~other.words_[i]) != 0) {
+      return false;
+    }
+  }
+  return true;
 }
 
 unsigned int CpuSet::count() const {

@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_TREE_CPUSET_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_TREE_CPUSET_H
 
+#include <cstddef>
 #include <cstdint>
 #include <initializer_list>
 #include <optional>
@@ -34,11 +35,41 @@ class CpuSet {
   bool empty() const { return words_.empty(); }
   bool contains(unsigned int number) const;
   bool intersects(const CpuSet& other) const;
+  bool isSubsetOf(const CpuSet& other) const;
   unsigned int count() const;
 
   /// The lowest number, and the lowest one after `number`; `limit` where there is none.
   unsigned int first() const { return from(0); }
   unsigned int next(unsigned int number) const { return from(number + 1); }
+
+  /// Walks the numbers, ascending: for (const unsigned int cpu : set).
+  class Iterator {
+   public:
+    using difference_type = std::ptrdiff_t;
+    using value_type = unsigned int;
+
+    Iterator() = default;
+    unsigned int operator*() const { return number_; }
+    Iterator& operator++() {
+      number_ = set_->next(number_);
+      return *this;
+    }
+    Iterator operator++(int) {
+      const Iterator before = *this;
+      ++*this;
+      return before;
+    }
+    bool operator==(const Iterator& other) const = default;
+
+   private:
+    friend class CpuSet;
+    Iterator(const CpuSet& set, unsigned int number) : set_(&set), number_(number) {}
+
+    const CpuSet* set_ = nullptr;
+    unsigned int number_ = limit;
+  };
+  Iterator begin() const { return {*this, first()}; }
+  Iterator end() const { return {*this, limit}; }
 
   bool operator==(const CpuSet& other) const = default;
 

@@ -33,6 +33,9 @@ TEST(CpuSet, WalksItsNumbersInOrder) {
   EXPECT_EQ(set.next(64), 200U);
   EXPECT_EQ(set.next(200), CpuSet::limit);
   EXPECT_EQ(CpuSet().first(), CpuSet::limit);
+  EXPECT_EQ(std::vector<unsigned int>(set.begin(), set.end()), (std::vector<unsigned int>{3, 63, 64, 200}));
+  const CpuSet nothing;
+  EXPECT_TRUE(nothing.begin() == nothing.end());
 }
 
 TEST(CpuSet, TellsItsMembers) {
@@ -71,6 +74,15 @@ TEST(CpuSet, IntersectsWhereANumberIsCommon) {
   EXPECT_TRUE((CpuSet{1, 100}.intersects(CpuSet{100})));
   EXPECT_FALSE((CpuSet{1, 100}.intersects(CpuSet{2})));
   EXPECT_FALSE(CpuSet().intersects(CpuSet{0}));
+}
+
+TEST(CpuSet, IsASubsetOfWhatHasAllItsNumbers) {
+  EXPECT_TRUE((CpuSet{1, 100}.isSubsetOf(CpuSet{1, 2, 100, 500})));
+  EXPECT_TRUE((CpuSet{1, 100}.isSubsetOf(CpuSet{1, 100})));
+  EXPECT_FALSE((CpuSet{1, 100}.isSubsetOf(CpuSet{1, 101})));
+  EXPECT_FALSE((CpuSet{1, 100}.isSubsetOf(CpuSet{1})));
+  EXPECT_TRUE(CpuSet().isSubsetOf(CpuSet()));
+  EXPECT_FALSE(CpuSet{0}.isSubsetOf(CpuSet()));
 }
 
 TEST(CpuSet, IgnoresNumbersFromTheLimitOn) {
