@@ -1,4 +1,9 @@
 #include <exception>
+#include <optional>
+#include <string>
+#include <type_traits>
+#include <utility>
+#include <vector>
 
 #include "host/broker/BrokerTables.h"
 #include "host/broker/Call.h"
@@ -53,9 +58,7 @@ CMPIEnumeration* enumerate(const Call& call, const CMPIObjectPath* path, Operati
     return call.refuse(status, CMPI_RC_ERR_INVALID_PARAMETER,
                        std::string(operationName(operation.kind)) + ": the path is NULL");
   }
-  const bool paths = operation.kind == OperationKind::EnumerateInstanceNames ||
-                     operation.kind == OperationKind::AssociatorNames ||
-                     operation.kind == OperationKind::ReferenceNames;
+  const bool paths = givesPaths(operation.kind);
   operation.path = object->path;
   UpcallReply reply = answerOf(call.broker(), operation);
   if (!reply.response.ok() && !reply.enumerationDespiteFailure) {
@@ -76,12 +79,11 @@ const char* classOf(const CMPIObjectPath* path) {
 
 // Every slot begins alike: a broker that is not ours cannot even give a message.
 template <class Function>
-auto withBroker(const CMPIBroker* handle, CMPIStatus* status, Function function)
-    -> decltype(function(*Broker::of(handle))) {
+std::invoke_result_t<Function, Broker&> withBroker(const CMPIBroker* handle, CMPIStatus* status, Function function) {
   Broker* broker = Broker::of(handle);
   if (broker == nullptr) {
     store(status, invalidHandle());
-    return {};
+    return std::invoke_result_t<Function, Broker&>();
   }
   return function(*broker);
 }
@@ -197,7 +199,6 @@ CMPIStatus refusal(const CMPIBroker* handle, Service service) {
     status =
         Call(broker, service)
             .refuse(CMPI_RC_ERR_NOT_SUPPORTED, "this broker does not support " + std::string(serviceName(service)));
-    return 0;
   });
   return status;
 }
@@ -268,7 +269,6 @@ CMPIContext* prepareAttachThread(const CMPIBroker* handle, const CMPIContext* co
     if (const ContextObject* object = ContextObject::of(context)) {
       result = call.object<ContextObject>(nullptr, *object);
     }
-    return 0;
   });
   return result;
 }
@@ -283,7 +283,6 @@ CMPIStatus attachThread(const CMPIBroker* handle, const CMPIContext* context) {
       status =
           call.refuse(CMPI_RC_ERR_INVALID_PARAMETER, "attachThread: no context, or the thread is attached already");
     }
-    return 0;
   });
   return status;
 }
@@ -293,7 +292,6 @@ CMPIStatus detachThread(const CMPIBroker* handle, const CMPIContext* /*context*/
   withBroker(handle, &status, [&](Broker& broker) {
     status = Call(broker, Service::DetachThread).status();
     Request::detach();
-    return 0;
   });
   return status;
 }

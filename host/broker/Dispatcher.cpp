@@ -94,8 +94,7 @@ Ends endsFrom(const ClassDefinition& association, const ClassDefinition& source)
 }
 
 bool isWanted(const ClassDefinition& association, const ClassDefinition& source, const Operation& operation) {
-  const bool references =
-      operation.kind == OperationKind::References || operation.kind == OperationKind::ReferenceNames;
+  const bool references = isReferenceOperation(operation.kind);
   const AssociationFilter& filter = operation.filter;
   const std::optional<std::string>& associationClass = references ? filter.resultClass : filter.assocClass;
   const Ends ends = endsFrom(association, source);
@@ -116,8 +115,7 @@ bool isWanted(const ClassDefinition& association, const ClassDefinition& source,
 Operation operationFor(const ClassDefinition& association, const ClassDefinition& source, const Operation& operation) {
   Operation result = operation;
   result.path = withClass(operation.path, source);
-  const bool references =
-      operation.kind == OperationKind::References || operation.kind == OperationKind::ReferenceNames;
+  const bool references = isReferenceOperation(operation.kind);
   if (!references) {
     result.filter.assocClass = association.name;
   } else if (result.filter.resultClass) {
@@ -223,8 +221,7 @@ Answer Dispatcher::performOnClasses(const Operation& operation) {
 }
 
 Answer Dispatcher::performOnAssociations(const Operation& operation) {
-  const bool references =
-      operation.kind == OperationKind::References || operation.kind == OperationKind::ReferenceNames;
+  const bool references = isReferenceOperation(operation.kind);
   const auto& named = references ? operation.filter.resultClass : operation.filter.assocClass;
   if (named && std::ranges::none_of(classesServing(*named), &ClassDefinition::association)) {
     return answerOf(unknownAssociation(*named));

@@ -58,6 +58,15 @@ bool isAssociationOperation(OperationKind kind) {
   return kind >= OperationKind::Associators;
 }
 
+bool isReferenceOperation(OperationKind kind) {
+  return kind == OperationKind::References || kind == OperationKind::ReferenceNames;
+}
+
+bool givesPaths(OperationKind kind) {
+  return kind == OperationKind::EnumerateInstanceNames || kind == OperationKind::AssociatorNames ||
+         kind == OperationKind::ReferenceNames;
+}
+
 Response failure(CMPIrc rc, std::string_view message) {
   return {rc, std::string(message), {}, {}, 0};
 }

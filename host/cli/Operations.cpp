@@ -41,16 +41,11 @@ bool isEnumeration(OperationKind kind) {
   return kind == OperationKind::EnumerateInstances || kind == OperationKind::EnumerateInstanceNames;
 }
 
-bool givesPaths(OperationKind kind) {
-  return kind == OperationKind::EnumerateInstanceNames || kind == OperationKind::AssociatorNames ||
-         kind == OperationKind::ReferenceNames;
-}
-
 /// A reference's result class is the association; wbemcli's users give it by either option.
 AssociationFilter filterOf(OperationKind kind, const AssociationOptions& options) {
   AssociationFilter filter;
   filter.role = unlessEmpty(options.role);
-  if (kind == OperationKind::References || kind == OperationKind::ReferenceNames) {
+  if (isReferenceOperation(kind)) {
     filter.resultClass = unlessEmpty(options.associationClass);
     return filter;
   }
