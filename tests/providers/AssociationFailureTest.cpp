@@ -264,7 +264,7 @@ TEST_P(AssociationFailure, NoFailureOfAServiceIsFatal) {
     }
   };
   afterwards(requests);
-  for (const std::string_view service : Corvcim::serviceNames) {
+  for (const auto& [number, service] : Corvcim::namedServices) {
     forgetTraces();
     requests();
     const unsigned int calls = broker.callCount(service);
