@@ -11,7 +11,7 @@ namespace Corvcim {
 class Arena;
 class Broker;
 
-// Anything whose life a request or the broker decides.
+/// Anything whose life a request or the broker decides.
 class Object {
  public:
   Object() = default;
@@ -22,7 +22,7 @@ class Object {
   [[nodiscard]] Broker& broker() const;
 
  protected:
-  // A copy is in no arena yet.
+  /// A copy is in no arena yet.
   Object(const Object& /*other*/) {}
 
  private:
@@ -33,8 +33,8 @@ class Object {
   Object* next_ = nullptr;
 };
 
-// Owns objects and frees them together, the youngest first, or one by one before that. Objects may be
-// made and freed from several threads at once.
+/// Owns objects and frees them together, the youngest first, or one by one before that. Objects may be
+/// made and freed from several threads at once.
 class Arena {
  public:
   explicit Arena(Broker& broker) : broker_(broker) {}
@@ -53,7 +53,7 @@ class Arena {
 
   void free(Object* object);
 
-  // Frees the object and everything made after it.
+  /// Frees the object and everything made after it.
   void freeFrom(Object* object);
 
  private:

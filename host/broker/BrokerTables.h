@@ -5,11 +5,11 @@
 
 namespace Corvcim {
 
-// The four tables of every broker of this host. All slots are filled.
-extern const CMPIBrokerFT brokerOperations;   // up-calls into other providers
-extern const CMPIBrokerEncFT objectServices;  // making objects
-extern const CMPIBrokerExtFT threadServices;  // threads, mutexes, conditions
-extern const CMPIBrokerMemFT memoryServices;  // memory that lives as long as the request
+/// The four tables of every broker of this host. All slots are filled.
+extern const CMPIBrokerFT brokerOperations;   ///< up-calls into other providers
+extern const CMPIBrokerEncFT objectServices;  ///< making objects
+extern const CMPIBrokerExtFT threadServices;  ///< threads, mutexes, conditions
+extern const CMPIBrokerMemFT memoryServices;  ///< memory that lives as long as the request
 
 }  // namespace Corvcim
 

@@ -12,13 +12,13 @@
 
 namespace Corvcim {
 
-// One end of a connected pair of sockets. Either end may ask; while it waits for its answer it serves
-// what the other end asks in the meantime, so that up-calls nest as deeply as they like.
+/// One end of a connected pair of sockets. Either end may ask; while it waits for its answer it serves
+/// what the other end asks in the meantime, so that up-calls nest as deeply as they like.
 class Channel {
  public:
   using Server = std::function<Response(const WireRequest&)>;
 
-  static std::pair<Channel, Channel> makePair();  // throws std::system_error
+  static std::pair<Channel, Channel> makePair();  ///< throws std::system_error
 
   explicit Channel(int descriptor) : descriptor_(descriptor) {}
   ~Channel();
@@ -27,13 +27,13 @@ class Channel {
   Channel(Channel&& other) noexcept : descriptor_(std::exchange(other.descriptor_, -1)) {}
   Channel& operator=(Channel&& other) noexcept;
 
-  // The other end's answer; nothing if the other end is gone.
+  /// The other end's answer; nothing if the other end is gone.
   std::optional<Response> ask(const WireRequest& request, const Server& serveMeanwhile);
 
-  // Answers requests until the other end is gone.
+  /// Answers requests until the other end is gone.
   void serve(const Server& server);
 
-  // Ends the connection for both, even if other processes hold the descriptor.
+  /// Ends the connection for both, even if other processes hold the descriptor.
   void shutDown();
 
  private:

@@ -14,10 +14,10 @@ namespace Corvcim {
 
 class ProviderProcess;
 
-// Files of provider libraries by base name ("corvcpuprofileprovider").
+/// Files of provider libraries by base name ("corvcpuprofileprovider").
 using LibraryFiles = std::map<std::string, std::string, std::less<>>;
 
-// A class whose provider did not answer an operation that went to several.
+/// A class whose provider did not answer an operation that went to several.
 struct ClassFailure {
   std::string className;
   CMPIrc rc = CMPI_RC_ERR_FAILED;
@@ -26,42 +26,42 @@ struct ClassFailure {
   friend bool operator==(const ClassFailure&, const ClassFailure&) = default;
 };
 
-// What all classes asked said together. The response holds everything that succeeded and is OK if
-// anything did; `failures` tells the rest. When nothing succeeded, the response is the first failure.
+/// What all classes asked said together. The response holds everything that succeeded and is OK if
+/// anything did; `failures` tells the rest. When nothing succeeded, the response is the first failure.
 struct Answer {
   Response response;
   std::vector<ClassFailure> failures;
 };
 
-// The host's operations by class name.
-//
-// The class table says which library and provider serve a class. Each process group of the table
-// runs in a child process of its own, started on its first request and kept until the dispatcher
-// ends, as production brokers do: a group sees only its own state, and a provider that crashes ends
-// one operation with one clear error. Up-calls of providers come back here and are dispatched like
-// any request.
-//
-// One thread at a time. Children inherit the environment at the time of their first request, so
-// selections that a library reads from there are made before.
+/// The host's operations by class name.
+///
+/// The class table says which library and provider serve a class. Each process group of the table
+/// runs in a child process of its own, started on its first request and kept until the dispatcher
+/// ends, as production brokers do: a group sees only its own state, and a provider that crashes ends
+/// one operation with one clear error. Up-calls of providers come back here and are dispatched like
+/// any request.
+///
+/// One thread at a time. Children inherit the environment at the time of their first request, so
+/// selections that a library reads from there are made before.
 class Dispatcher {
  public:
-  // A class whose library has no file here is answered with CMPI_RC_ERR_FAILED and a message that says so.
+  /// A class whose library has no file here is answered with CMPI_RC_ERR_FAILED and a message that says so.
   explicit Dispatcher(LibraryFiles libraryFiles);
   ~Dispatcher();
   Dispatcher(const Dispatcher&) = delete;
   Dispatcher& operator=(const Dispatcher&) = delete;
 
-  // Instances of the class and of every class derived from it: "CIM_Processor" works as well.
+  /// Instances of the class and of every class derived from it: "CIM_Processor" works as well.
   Answer enumerateInstances(const ObjectPath& classPath, const PropertyList& properties = {});
   Answer enumerateInstanceNames(const ObjectPath& classPath);
 
-  // Exactly one instance, else a failing status (CMPI_RC_ERR_NOT_FOUND for none).
+  /// Exactly one instance, else a failing status (CMPI_RC_ERR_NOT_FOUND for none).
   Answer getInstance(const ObjectPath& path, const PropertyList& properties = {});
 
-  // Without an association class (for references: result class) every association that the source's
-  // class takes part in is asked, else those that are the class named or derived from it. Providers
-  // get the exact name of their own class. Roles and result classes are tested here, by the class
-  // table, whatever providers do with them.
+  /// Without an association class (for references: result class) every association that the source's
+  /// class takes part in is asked, else those that are the class named or derived from it. Providers
+  /// get the exact name of their own class. Roles and result classes are tested here, by the class
+  /// table, whatever providers do with them.
   Answer associators(const ObjectPath& source, const AssociationFilter& filter = {},
                      const PropertyList& properties = {});
   Answer associatorNames(const ObjectPath& source, const AssociationFilter& filter = {});
@@ -78,8 +78,8 @@ class Dispatcher {
   Response upcall(const Operation& operation);
 
   LibraryFiles libraryFiles_;
-  std::map<std::string_view, std::unique_ptr<ProviderProcess>> processes_;  // by group
-  unsigned depth_ = 0;  // of operations in progress: an up-call nests
+  std::map<std::string_view, std::unique_ptr<ProviderProcess>> processes_;  ///< by group
+  unsigned depth_ = 0;  ///< of operations in progress: an up-call nests
 };
 
 }  // namespace Corvcim

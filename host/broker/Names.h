@@ -7,7 +7,7 @@
 
 namespace Corvcim {
 
-// CIM names compare without regard to case; only ASCII letters have one here, whatever the locale.
+/// CIM names compare without regard to case; only ASCII letters have one here, whatever the locale.
 
 constexpr char toLowerAscii(char letter) {
   return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter;
@@ -17,7 +17,7 @@ constexpr bool sameName(std::string_view left, std::string_view right) {
   return std::ranges::equal(left, right, {}, toLowerAscii, toLowerAscii);
 }
 
-// Orders names so that spellings of one name are equal; for maps.
+/// Orders names so that spellings of one name are equal; for maps.
 struct NameLess {
   using is_transparent = void;
   bool operator()(std::string_view left, std::string_view right) const {

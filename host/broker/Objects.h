@@ -28,8 +28,8 @@ extern const CMPIArgsFT argsOperations;
 extern const CMPIResultFT resultOperations;
 extern const CMPIDateTimeFT dateTimeOperations;
 
-// What stands behind the { hdl, ft } record that a provider sees. The handle holds the address of this
-// part of a Derived.
+/// What stands behind the { hdl, ft } record that a provider sees. The handle holds the address of this
+/// part of a Derived.
 template <class RecordType, class Derived>
 class Encapsulated : public Object {
  public:
@@ -38,7 +38,7 @@ class Encapsulated : public Object {
   ~Encapsulated() override = default;
   Encapsulated& operator=(const Encapsulated&) = delete;
 
-  // NULL for a NULL record and for one without a handle.
+  /// NULL for a NULL record and for one without a handle.
   static Derived* of(const Record* record) {
     auto* const part = record == nullptr ? nullptr : static_cast<Encapsulated*>(const_cast<void*>(record->hdl));
     return static_cast<Derived*>(part);
@@ -50,7 +50,7 @@ class Encapsulated : public Object {
   template <class Table>
   explicit Encapsulated(const Table& table) : record_{this, &table} {}
 
-  // A copy has a handle of its own.
+  /// A copy has a handle of its own.
   Encapsulated(const Encapsulated& other) : Object(other), record_{this, other.record_.ft} {}
 
  private:
@@ -84,17 +84,17 @@ class InstanceObject : public Encapsulated<CMPIInstance, InstanceObject> {
  public:
   explicit InstanceObject(Instance contents) : Encapsulated(instanceOperations), value(std::move(contents)) {}
 
-  // The instance with the path that follows from its properties.
+  /// The instance with the path that follows from its properties.
   [[nodiscard]] Instance complete() const { return {instancePath(value.path, value.properties), value.properties}; }
 
-  Instance value;                       // its path is the one given to newInstance or setObjectPath
-  PropertyList filter;                  // none: everything may be set
-  std::vector<std::string> filterKeys;  // may always be set
+  Instance value;                       ///< its path is the one given to newInstance or setObjectPath
+  PropertyList filter;                  ///< none: everything may be set
+  std::vector<std::string> filterKeys;  ///< may always be set
 };
 
 class EnumerationObject : public Encapsulated<CMPIEnumeration, EnumerationObject> {
  public:
-  // Elements are all instances or all references, by `type`.
+  /// Elements are all instances or all references, by `type`.
   EnumerationObject(CMPIType type, std::vector<Value> values)
       : Encapsulated(enumerationOperations), elementType(type), elements(std::move(values)) {}
 
@@ -108,7 +108,7 @@ class ContextObject : public Encapsulated<CMPIContext, ContextObject> {
   ContextObject(Request* owner, std::vector<NamedValue> values)
       : Encapsulated(contextOperations), request(owner), entries(std::move(values)) {}
 
-  Request* const request;  // whose context it is; a thread that attaches with it works for that request
+  Request* const request;  ///< whose context it is; a thread that attaches with it works for that request
   std::vector<NamedValue> entries;
 };
 
@@ -123,7 +123,7 @@ class ResultObject : public Encapsulated<CMPIResult, ResultObject> {
  public:
   ResultObject() : Encapsulated(resultOperations) {}
 
-  Response response;  // its status is not used
+  Response response;  ///< its status is not used
 };
 
 class DateTimeObject : public Encapsulated<CMPIDateTime, DateTimeObject> {
