@@ -3,7 +3,7 @@
 #include <algorithm>
 
 #include "platform/instrumentation/ProcessTree.h"
-#include "platform/instrumentation/tree/Paths.h"
+#include "platform/instrumentation/tree/PathForms.h"
 #include "platform/instrumentation/tree/Tree.h"
 
 namespace Tarn {

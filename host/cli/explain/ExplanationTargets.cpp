@@ -5,7 +5,7 @@
 #include "host/ClassTable.h"
 #include "host/broker/Names.h"
 #include "host/cli/explain/Explanation.h"
-#include "platform/instrumentation/tree/Paths.h"
+#include "platform/instrumentation/tree/PathForms.h"
 
 namespace Corvcim {
 namespace {

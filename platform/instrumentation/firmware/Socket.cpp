@@ -73,17 +73,17 @@ bool holdsSocId(const Smbios::Processor& processor) {
   return processor.characteristics && (*processor.characteristics & Smbios::ProcessorCharacteristic::armSocId) != 0;
 }
 
-ProcessorMark markOf(const Smbios::Processor& processor) {
-  ProcessorMark mark;
+ProcessorIdentity identityOf(const Smbios::Processor& processor) {
+  ProcessorIdentity identity;
   if (processor.id && !holdsSocId(processor)) {
     const Smbios::Bytes signature = processor.id.raw.first(signatureLength);
     const bool isZero = std::ranges::all_of(signature, [](std::byte byte) { return byte == std::byte{0}; });
-    mark.signature = isZero ? std::string() : byteText(signature);
+    identity.signature = isZero ? std::string() : byteText(signature);
   }
-  mark.name = comparableName(firmwareText(processor.version));
-  mark.cores = processor.cores.value;
-  mark.threads = processor.threads.value;
-  return mark;
+  identity.name = comparableName(firmwareText(processor.version));
+  identity.cores = processor.cores.value;
+  identity.threads = processor.threads.value;
+  return identity;
 }
 
 // Who makes x86 processors, as firmware writes it. On these the identification register has the stepping.
@@ -225,7 +225,7 @@ std::vector<Socket> readSockets(const Smbios::Tables& tables) {
                          .path = {},
                          .label = label.empty() ? "0x" + handleText(processor.structure) : label,
                          .status = statusRow(processor).status,
-                         .mark = markOf(processor)});
+                         .identity = identityOf(processor)});
       labels.push_back(labelForPath(processor));
     }
   }

@@ -17,7 +17,7 @@ struct Socket {
   std::string path;   ///< what its node is called where the kernel does not see a processor in it
   std::string label;  ///< "CPU 1"; where the firmware gives none "0x0043", its handle
   unsigned int status = 0;
-  ProcessorMark mark;
+  ProcessorIdentity identity;
 
   bool isPopulated() const { return structure->populated && *structure->populated; }
 

@@ -14,10 +14,10 @@ namespace Tarn::Inventory {
 
 namespace {
 
-/// One of the marks by which processors are told apart; its value as a text, empty where it is not known.
+/// One of the traits by which processors are told apart; its value as a text, empty where it is not known.
 struct Criterion {
   std::string_view name;
-  std::string (*value)(const ProcessorMark& mark);
+  std::string (*value)(const ProcessorIdentity& identity);
 };
 
 std::string countText(std::optional<unsigned int> count) {
@@ -25,10 +25,10 @@ std::string countText(std::optional<unsigned int> count) {
 }
 
 constexpr std::array criteria = {
-    Criterion{"signature", [](const ProcessorMark& mark) { return mark.signature; }},
-    Criterion{"name", [](const ProcessorMark& mark) { return mark.name; }},
-    Criterion{"number of cores", [](const ProcessorMark& mark) { return countText(mark.cores); }},
-    Criterion{"number of threads", [](const ProcessorMark& mark) { return countText(mark.threads); }},
+    Criterion{"signature", [](const ProcessorIdentity& identity) { return identity.signature; }},
+    Criterion{"name", [](const ProcessorIdentity& identity) { return identity.name; }},
+    Criterion{"number of cores", [](const ProcessorIdentity& identity) { return countText(identity.cores); }},
+    Criterion{"number of threads", [](const ProcessorIdentity& identity) { return countText(identity.threads); }},
 };
 
 using Indexes = std::vector<std::size_t>;
@@ -39,18 +39,18 @@ struct Group {
   Indexes packages;
 };
 
-bool agree(const Criterion& criterion, const ProcessorMark& one, const ProcessorMark& other) {
+bool agree(const Criterion& criterion, const ProcessorIdentity& one, const ProcessorIdentity& other) {
   const std::string value = criterion.value(one);
   return !value.empty() && value == criterion.value(other);
 }
 
-bool contradict(const ProcessorMark& socket, const ProcessorMark& package) {
+bool contradict(const ProcessorIdentity& socket, const ProcessorIdentity& package) {
   return !socket.signature.empty() && !package.signature.empty() && socket.signature != package.signature;
 }
 
 class Matcher {
  public:
-  Matcher(std::span<const ProcessorMark> sockets, std::span<const ProcessorMark> packages)
+  Matcher(std::span<const ProcessorIdentity> sockets, std::span<const ProcessorIdentity> packages)
       : sockets_(sockets), packages_(packages) {
     result_.packages.resize(packages.size());
   }
@@ -134,8 +134,8 @@ class Matcher {
   }
 
   std::string ruleOf(const Group& group, std::size_t place) const {
-    const ProcessorMark& socket = sockets_[group.sockets[place]];
-    const ProcessorMark& package = packages_[group.packages[place]];
+    const ProcessorIdentity& socket = sockets_[group.sockets[place]];
+    const ProcessorIdentity& package = packages_[group.packages[place]];
     std::string same;
     for (const Criterion& criterion : criteria) {
       if (agree(criterion, socket, package)) {
@@ -149,8 +149,8 @@ class Matcher {
            " are alike, so by order: ascending handle to ascending package number";
   }
 
-  std::span<const ProcessorMark> sockets_;
-  std::span<const ProcessorMark> packages_;
+  std::span<const ProcessorIdentity> sockets_;
+  std::span<const ProcessorIdentity> packages_;
   SocketMatching result_;
 };
 
@@ -177,7 +177,7 @@ std::string comparableName(std::string_view name) {
   return plain;
 }
 
-SocketMatching matchSockets(std::span<const ProcessorMark> sockets, std::span<const ProcessorMark> packages) {
+SocketMatching matchSockets(std::span<const ProcessorIdentity> sockets, std::span<const ProcessorIdentity> packages) {
   return Matcher(sockets, packages).match();
 }
 

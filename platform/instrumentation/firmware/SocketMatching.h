@@ -11,7 +11,7 @@ namespace Tarn::Inventory {
 
 /// What tells one processor from another, as far as both the kernel and the firmware know it. A text is
 /// empty, a count absent, where it is not known.
-struct ProcessorMark {
+struct ProcessorIdentity {
   std::string signature = {};  ///< the first four bytes of the identification register: "57 06 05 00"
   std::string name = {};       ///< as comparableName gives it
   std::optional<unsigned int> cores = {};
@@ -47,7 +47,7 @@ struct SocketMatching {
 /// Matches by identity: sockets and packages that agree in their signature, name, number of cores or
 /// threads, as long as equally many agree. Those that are alike in all of it go together in their order.
 /// Nothing is matched where the counts do not fit, or where signatures differ.
-SocketMatching matchSockets(std::span<const ProcessorMark> sockets, std::span<const ProcessorMark> packages);
+SocketMatching matchSockets(std::span<const ProcessorIdentity> sockets, std::span<const ProcessorIdentity> packages);
 
 }  // namespace Tarn::Inventory
 

@@ -117,7 +117,7 @@ class CacheReader {
       return;
     }
     cache.level = *level;
-    cache.toldBy = cpu;
+    cache.sourceCpu = cpu;
     cache.index = index;
     cache.contents = meaning(contentsWords, cpus_.text("cpu", cpu, "/cache/index", index, "/type"));
     // The same cache may stand at another place for another kind of core.

@@ -18,7 +18,7 @@ struct Cache {
   std::optional<CacheContents> contents;
   std::optional<unsigned int> id;        ///< unique for its level and contents
   CpuSet cpus;                           ///< the CPUs that share it
-  unsigned int toldBy = 0;               ///< the CPU in whose directory it was read,
+  unsigned int sourceCpu = 0;            ///< the CPU in whose directory it was read,
   unsigned int index = 0;                ///< and its number there
   std::optional<unsigned int> size;      ///< KiB
   std::optional<unsigned int> lineSize;  ///< bytes

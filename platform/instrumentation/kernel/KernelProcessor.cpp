@@ -120,8 +120,8 @@ class Reader {
     const auto enabled = static_cast<unsigned int>(
         std::ranges::count_if(package_.cores, [this](const Core& core) { return kernel_.isOnline(core.cpus); }));
     result_.facts.number(PropEnabledCores, enabled, [this_ = parts(), enabled] {
-      return this_.kernel->machine.originIn("sys/devices/system/cpu/online",
-                                            "cores with a CPU online: " + std::to_string(enabled));
+      return this_.kernel->machine.originInCpuDirectory("online",
+                                                        "cores with a CPU online: " + std::to_string(enabled));
     });
   }
 
@@ -135,8 +135,8 @@ class Reader {
   Facts::Explain told(Properties id) const {
     if (cpus_.empty()) {
       return [this_ = parts()] {
-        return this_.kernel->machine.originIn("sys/devices/system/cpu/online",
-                                              "no CPU of the processor is online to tell it: unknown");
+        return this_.kernel->machine.originInCpuDirectory("online",
+                                                          "no CPU of the processor is online to tell it: unknown");
       };
     }
     return [kernel = &kernel_, cpu = cpus_.front(), id] {
@@ -197,8 +197,8 @@ Origin originOfPackage(const KernelView& kernel, const Package& package, std::st
   }
   Origin origin = machine.originOfCpus(package.cpus, byList, {}, rule);
   if (origin.raw.empty()) {
-    origin = machine.originIn("sys/devices/system/cpu/present",
-                              "nothing tells of packages, so all CPUs are one; " + std::move(rule));
+    origin =
+        machine.originInCpuDirectory("present", "nothing tells of packages, so all CPUs are one; " + std::move(rule));
   }
   return origin;
 }

@@ -26,9 +26,8 @@ unsigned int KernelView::statusOf(const CpuSet& cpus) const {
 
 Origin KernelView::statusOrigin(const CpuSet& cpus) const {
   const std::string part = "CPUs " + cpus.toList() + " make up the part: ";
-  return machine.originIn(
-      "sys/devices/system/cpu/online",
-      part + (isOnline(cpus) ? "one at least is online, so it is in use" : "none is online, so it is offline"));
+  return machine.originInCpuDirectory("online", part + (isOnline(cpus) ? "one at least is online, so it is in use"
+                                                                       : "none is online, so it is offline"));
 }
 
 std::string describeByPath(const std::string& label, std::string_view path) {

@@ -9,7 +9,6 @@ namespace Tarn::Inventory {
 namespace {
 
 constexpr const char* cpuInfoFile = "proc/cpuinfo";
-constexpr const char* cpuDirectoryPath = "sys/devices/system/cpu";
 
 std::string reasonOf(FileError error) {
   return error == 0 ? "it holds no usable value" : describeError(error);
@@ -20,7 +19,7 @@ std::string remedyOf(FileError error, const std::string& otherwise) {
 }
 
 std::string attributeOf(unsigned int cpu, std::string_view suffix) {
-  return std::string(cpuDirectoryPath) + "/cpu" + std::to_string(cpu) + '/' + std::string(suffix);
+  return std::string(kernelCpuDirectory) + "/cpu" + std::to_string(cpu) + '/' + std::string(suffix);
 }
 
 // "name: value", or of a field's words "name: word" or "name: without word".
@@ -41,7 +40,7 @@ std::string fieldText(const CpuInfo& info, unsigned int cpu, std::string_view fi
 Machine::Machine(FileSystem& root, Detail detail)
     : detail_(detail),
       recorder_(detail == Detail::WithOrigins ? std::make_unique<RecordingFileSystem>(root, record_) : nullptr),
-      cpuDirectory_((recorder_ ? *recorder_ : root).below(cpuDirectoryPath)),
+      cpuDirectory_((recorder_ ? *recorder_ : root).below(kernelCpuDirectory)),
       root_(recorder_ ? *recorder_ : root),
       cpus_(*cpuDirectory_) {
   std::string text;
@@ -66,6 +65,10 @@ void Machine::noteUnreadOfCpu(unsigned int cpu, const std::string& suffix, const
 
 Origin Machine::originIn(const std::string& file, std::string rule) const {
   return {root_.files().nameOf(file), rawOf(file), std::move(rule)};
+}
+
+Origin Machine::originInCpuDirectory(std::string_view file, std::string rule) const {
+  return originIn(std::string(kernelCpuDirectory) + '/' + std::string(file), std::move(rule));
 }
 
 Origin Machine::originOfCpu(unsigned int cpu, std::string_view suffix, std::string rule) const {

@@ -15,6 +15,9 @@
 
 namespace Tarn::Inventory {
 
+/// Where the kernel describes its CPUs, a path from the root on.
+inline constexpr const char* kernelCpuDirectory = "sys/devices/system/cpu";
+
 /// A machine as the live source reads it: its files, its /proc/cpuinfo, and the account of what could
 /// not be read.
 class Machine {
@@ -30,7 +33,7 @@ class Machine {
   Detail detail() const { return detail_; }
 
   Attributes& root() { return root_; }  ///< paths from the root on
-  Attributes& cpus() { return cpus_; }  ///< paths below sys/devices/system/cpu
+  Attributes& cpus() { return cpus_; }  ///< paths below kernelCpuDirectory
   const CpuInfo& cpuInfo() const { return cpuInfo_; }
   UnreadLog& unread() { return unread_; }
 
@@ -47,6 +50,9 @@ class Machine {
 
   /// The origin of a value that came from this file, a path from the root on.
   Origin originIn(const std::string& file, std::string rule) const;
+
+  /// The same for a file of all CPUs, such as "online".
+  Origin originInCpuDirectory(std::string_view file, std::string rule) const;
 
   /// The same for cpuN/`suffix`.
   Origin originOfCpu(unsigned int cpu, std::string_view suffix, std::string rule) const;

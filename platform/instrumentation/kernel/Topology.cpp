@@ -69,7 +69,7 @@ class TopologyReader {
     machine_.noteUnread(cpus_.fileName(), cpus_.error(), mountSys);
     CpuSet present = machine_.cpuInfo().cpus();
     std::vector<std::string> names;
-    machine_.root().files().list("sys/devices/system/cpu", names);
+    machine_.root().files().list(kernelCpuDirectory, names);
     for (const std::string& name : names) {
       if (const std::optional<unsigned int> cpu = numberBehind("cpu", name)) {
         present.add(*cpu);

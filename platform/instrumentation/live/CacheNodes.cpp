@@ -95,7 +95,7 @@ class CacheNode {
   }
 
   Origin attribute(std::string_view file, const char* rule) const {
-    return kernel_.machine.originOfCpu(cache_.toldBy,
+    return kernel_.machine.originOfCpu(cache_.sourceCpu,
                                        "cache/index" + std::to_string(cache_.index) + '/' + std::string(file), rule);
   }
 

@@ -168,7 +168,7 @@ class Comparison {
 
   std::string kernelSource(const FileSystem& cpuFiles, const Cache& usual, const char* attribute) const {
     const Cache& cache = kernel_.empty() ? usual : *kernel_.front();
-    const std::string directory = "cpu" + std::to_string(cache.toldBy) + "/cache";
+    const std::string directory = "cpu" + std::to_string(cache.sourceCpu) + "/cache";
     return cpuFiles.nameOf(kernel_.empty() ? directory
                                            : directory + "/index" + std::to_string(cache.index) + '/' + attribute);
   }

@@ -52,7 +52,7 @@ class LiveReader {
     for (std::size_t i = 0; i < processors.size(); ++i) {
       addPackage(kernel_.topology.packages[i], processors[i], assignment.packages[i]);
     }
-    for (const Socket* socket : assignment.alone) {
+    for (const Socket* socket : assignment.standalone) {
       addSocket(*socket);
     }
     for (const Unread& entry : machine_.unread().entries()) {
@@ -89,7 +89,8 @@ class LiveReader {
     return processors;
   }
 
-  void addPackage(const Package& package, const KernelProcessor& processor, const SocketAssignment::Place& place) {
+  void addPackage(const Package& package, const KernelProcessor& processor,
+                  const SocketAssignment::PackageSocket& assigned) {
     const std::string path = processorPath(package);
     tree_.processor(path).cpus(package.cpus);
     tree_.status(kernel_.statusOf(package.cpus)).from([&] { return kernel_.statusOrigin(package.cpus); });
@@ -98,14 +99,14 @@ class LiveReader {
           kernel_, package,
           path.find('@') == std::string::npos ? "the kernel's number of the package" : "the lowest CPU of the package");
     });
-    if (place.socket == nullptr) {
+    if (assigned.socket == nullptr) {
       processor.facts.addTo(tree_);
     } else {
-      compareStatus(package, *place.socket, path);
-      reconcile(processor.facts, socketFacts(*place.socket, place.rule), path, disagreements_).addTo(tree_);
+      compareStatus(package, *assigned.socket, path);
+      reconcile(processor.facts, socketFacts(*assigned.socket, assigned.rule), path, disagreements_).addTo(tree_);
     }
     addCores(tree_, kernel_, package, path);
-    addCachesOf(package, place.socket, path);
+    addCachesOf(package, assigned.socket, path);
   }
 
   // The processor runs, whatever the firmware says of it.
@@ -138,7 +139,7 @@ class LiveReader {
       return {};
     }
     return [this] {
-      return machine_.originIn("sys/devices/system/cpu/online", "none of the processor's CPUs is online: offline, 12");
+      return machine_.originInCpuDirectory("online", "none of the processor's CPUs is online: offline, 12");
     };
   }
 
@@ -170,7 +171,7 @@ Tree readLiveInventory(FileSystem& root, Detail detail) {
   LiveReader reader(root, detail);
   reader.readFirmware();
   if (!reader.knowsProcessors()) {
-    throw InventoryError("cannot read the inventory", root.nameOf("sys/devices/system/cpu"),
+    throw InventoryError("cannot read the inventory", root.nameOf(kernelCpuDirectory),
                          "neither this directory nor /proc/cpuinfo tells of a processor",
                          "mount sysfs on /sys and proc on /proc");
   }

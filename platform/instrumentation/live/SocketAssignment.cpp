@@ -17,7 +17,7 @@ std::optional<unsigned int> valueOf(const unsigned int* number) {
   return number == nullptr ? std::nullopt : std::optional(*number);
 }
 
-ProcessorMark markOf(const KernelProcessor& processor) {
+ProcessorIdentity identityOf(const KernelProcessor& processor) {
   return {.signature = processor.identity.processorId,
           .name = comparableName(processor.identity.name),
           .cores = valueOf(processor.facts.number(PropProcessorCores)),
@@ -34,11 +34,11 @@ class Assigner {
   SocketAssignment assign() {
     if (processors_.empty()) {
       for (const Socket& socket : sockets_) {
-        result_.alone.push_back(&socket);
+        result_.standalone.push_back(&socket);
       }
     } else if (!sockets_.empty()) {
       match();
-      addAlone();
+      addStandalone();
     }
     return std::move(result_);
   }
@@ -59,15 +59,15 @@ class Assigner {
       }
     }
     enabled_ = enabled.size();
-    std::vector<ProcessorMark> packages;
+    std::vector<ProcessorIdentity> packages;
     packages.reserve(processors_.size());
     for (const KernelProcessor& processor : processors_) {
-      packages.push_back(markOf(processor));
+      packages.push_back(identityOf(processor));
     }
     const bool areAll = enabled.size() != packages.size() && populated.size() == packages.size();
-    const SocketMatching matching = matchSockets(marksOf(areAll ? populated : enabled), packages);
+    const SocketMatching matching = matchSockets(identitiesOf(areAll ? populated : enabled), packages);
     if (!areAll && enabled.size() < populated.size() && isRefused(matching)) {
-      const SocketMatching ofAll = matchSockets(marksOf(populated), packages);
+      const SocketMatching ofAll = matchSockets(identitiesOf(populated), packages);
       if (ofAll.contradictions.empty()) {
         take(std::move(populated), ofAll, packages);
         return;
@@ -76,13 +76,13 @@ class Assigner {
     take(areAll ? std::move(populated) : std::move(enabled), matching, packages);
   }
 
-  static std::vector<ProcessorMark> marksOf(const std::vector<const Socket*>& sockets) {
-    std::vector<ProcessorMark> marks;
-    marks.reserve(sockets.size());
+  static std::vector<ProcessorIdentity> identitiesOf(const std::vector<const Socket*>& sockets) {
+    std::vector<ProcessorIdentity> identities;
+    identities.reserve(sockets.size());
     for (const Socket* socket : sockets) {
-      marks.push_back(socket->mark);
+      identities.push_back(socket->identity);
     }
-    return marks;
+    return identities;
   }
 
   // Whether there are as many sockets as packages and it is the signatures that do not fit.
@@ -93,7 +93,7 @@ class Assigner {
   }
 
   void take(std::vector<const Socket*> candidates, const SocketMatching& matching,
-            const std::vector<ProcessorMark>& packages) {
+            const std::vector<ProcessorIdentity>& packages) {
     candidates_ = std::move(candidates);
     for (std::size_t i = 0; i < packages.size(); ++i) {
       const SocketMatching::Match& match = matching.packages[i];
@@ -110,15 +110,15 @@ class Assigner {
   }
 
   void addContradiction(const SocketMatching::Contradiction& contradiction,
-                        const std::vector<ProcessorMark>& packages) {
+                        const std::vector<ProcessorIdentity>& packages) {
     if (contradiction.sockets.size() == 1 && contradiction.packages.size() == 1) {
       const std::size_t package = contradiction.packages.front();
       const Socket& socket = *candidates_[contradiction.sockets.front()];
       const Facts::Fact* told = processors_[package].facts.find(PropProcessorId);
-      result_.disagreements.push_back({processorPath(kernel_.topology.packages[package]), "ProcessorId",
-                                       packages[package].signature,
-                                       told == nullptr ? kernelSource() : told->explain().source, socket.mark.signature,
-                                       Smbios::placeOf(socket.structure->structure, socket.structure->id)});
+      result_.disagreements.push_back(
+          {processorPath(kernel_.topology.packages[package]), "ProcessorId", packages[package].signature,
+           told == nullptr ? kernelSource() : told->explain().source, socket.identity.signature,
+           Smbios::placeOf(socket.structure->structure, socket.structure->id)});
       return;
     }
     std::string paths;
@@ -136,14 +136,14 @@ class Assigner {
                                      places.empty() ? "SMBIOS" : places});
   }
 
-  void addAlone() {
+  void addStandalone() {
     for (const Socket& socket : sockets_) {
       const bool isCandidate = std::ranges::binary_search(candidates_, &socket);
       const bool isUnseen = std::ranges::binary_search(unseen_, &socket);
       // Where the kernel has more packages than there are enabled sockets, it may well see a disabled one.
       const bool isDisabled = socket.isPopulated() && !isCandidate && processors_.size() <= enabled_;
       if (!socket.isPopulated() || isUnseen || isDisabled) {
-        result_.alone.push_back(&socket);
+        result_.standalone.push_back(&socket);
       }
       if (isUnseen && socket.isEnabled()) {
         result_.disagreements.push_back({socket.path, "status", std::to_string(socket.status),
@@ -152,7 +152,7 @@ class Assigner {
     }
   }
 
-  std::string kernelSource() const { return kernel_.machine.root().files().nameOf("sys/devices/system/cpu"); }
+  std::string kernelSource() const { return kernel_.machine.root().files().nameOf(kernelCpuDirectory); }
 
   const std::vector<Socket>& sockets_;
   const KernelView& kernel_;

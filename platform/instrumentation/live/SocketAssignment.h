@@ -14,16 +14,16 @@ namespace Tarn::Inventory {
 /// Which of the firmware's sockets belongs to which of the kernel's packages, and which stand for
 /// themselves.
 struct SocketAssignment {
-  struct Place {
+  struct PackageSocket {
     const Socket* socket = nullptr;  ///< none where the firmware tells of no socket that is the package's
     std::string rule;                ///< by what it was found, for people
   };
-  std::vector<Place> packages;  ///< in the kernel's order
+  std::vector<PackageSocket> packages;  ///< in the kernel's order
 
   /// The sockets that become processors of their own, by ascending handle: empty ones, and those with a
   /// processor that the kernel does not see. A socket whose package cannot be told is not among them: its
   /// processor would be there twice.
-  std::vector<const Socket*> alone;
+  std::vector<const Socket*> standalone;
 
   std::vector<Disagreement> disagreements;
 };

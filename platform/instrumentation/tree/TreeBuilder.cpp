@@ -4,7 +4,7 @@
 #include <stdexcept>
 #include <utility>
 
-#include "platform/instrumentation/tree/Paths.h"
+#include "platform/instrumentation/tree/PathForms.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 #include "platform/instrumentation/tree/Utf8.h"
 

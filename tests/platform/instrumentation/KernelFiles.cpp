@@ -4,7 +4,7 @@
 
 #include "platform/instrumentation/firmware/FirmwareTables.h"
 #include "platform/instrumentation/live/LiveSource.h"
-#include "platform/instrumentation/tree/Paths.h"
+#include "platform/instrumentation/tree/PathForms.h"
 
 namespace Tarn::Inventory {
 

@@ -5,7 +5,7 @@
 namespace Tarn::Inventory {
 namespace {
 
-using Marks = std::vector<ProcessorMark>;
+using Identities = std::vector<ProcessorIdentity>;
 
 constexpr std::size_t none = SocketMatching::none;
 
@@ -19,7 +19,7 @@ std::vector<std::size_t> socketsOf(const SocketMatching& matching) {
 }
 
 TEST(SocketMatching, OneSocketAndOnePackageAreOneProcessor) {
-  const SocketMatching matching = matchSockets(Marks{{}}, Marks{{}});
+  const SocketMatching matching = matchSockets(Identities{{}}, Identities{{}});
 
   EXPECT_EQ(socketsOf(matching), std::vector<std::size_t>{0});
   EXPECT_EQ(matching.packages[0].rule, "the only one that is left on both sides");
@@ -28,16 +28,16 @@ TEST(SocketMatching, OneSocketAndOnePackageAreOneProcessor) {
 }
 
 TEST(SocketMatching, SaysByWhatAProcessorWasFound) {
-  const ProcessorMark mark{.signature = "57 06 05 00", .name = "xeon", .cores = 8, .threads = 16};
+  const ProcessorIdentity identity{.signature = "57 06 05 00", .name = "xeon", .cores = 8, .threads = 16};
 
-  EXPECT_EQ(matchSockets(Marks{mark}, Marks{mark}).packages[0].rule,
+  EXPECT_EQ(matchSockets(Identities{identity}, Identities{identity}).packages[0].rule,
             "the same signature, name, number of cores, number of threads");
 }
 
 struct Row {
   const char* what;
-  Marks sockets;
-  Marks packages;
+  Identities sockets;
+  Identities packages;
   std::vector<std::size_t> expected;
 };
 
@@ -54,38 +54,41 @@ INSTANTIATE_TEST_SUITE_P(
     All, MatchingByIdentity,
     testing::Values(
         Row{"signatures",
-            Marks{{.signature = "B"}, {.signature = "A"}},
-            Marks{{.signature = "A"}, {.signature = "B"}},
+            Identities{{.signature = "B"}, {.signature = "A"}},
+            Identities{{.signature = "A"}, {.signature = "B"}},
             {1, 0}},
-        Row{"names", Marks{{.name = "b"}, {.name = "a"}}, Marks{{.name = "a"}, {.name = "b"}}, {1, 0}},
-        Row{"cores", Marks{{.cores = 16}, {.cores = 8}}, Marks{{.cores = 8}, {.cores = 16}}, {1, 0}},
-        Row{"threads", Marks{{.threads = 4}, {.threads = 2}}, Marks{{.threads = 2}, {.threads = 4}}, {1, 0}},
+        Row{"names", Identities{{.name = "b"}, {.name = "a"}}, Identities{{.name = "a"}, {.name = "b"}}, {1, 0}},
+        Row{"cores", Identities{{.cores = 16}, {.cores = 8}}, Identities{{.cores = 8}, {.cores = 16}}, {1, 0}},
+        Row{"threads", Identities{{.threads = 4}, {.threads = 2}}, Identities{{.threads = 2}, {.threads = 4}}, {1, 0}},
         Row{"names where signatures are alike",
-            Marks{{.signature = "A", .name = "b"}, {.signature = "A", .name = "a"}},
-            Marks{{.signature = "A", .name = "a"}, {.signature = "A", .name = "b"}},
+            Identities{{.signature = "A", .name = "b"}, {.signature = "A", .name = "a"}},
+            Identities{{.signature = "A", .name = "a"}, {.signature = "A", .name = "b"}},
             {1, 0}},
         Row{"what is left over by the others",
-            Marks{{.name = "generic"}, {.name = "a"}},
-            Marks{{.name = "a"}, {.name = "b"}},
+            Identities{{.name = "generic"}, {.name = "a"}},
+            Identities{{.name = "a"}, {.name = "b"}},
             {1, 0}},
-        Row{"a signature that is not known", Marks{{}, {.signature = "A"}}, Marks{{.signature = "A"}, {}}, {1, 0}}));
+        Row{"a signature that is not known",
+            Identities{{}, {.signature = "A"}},
+            Identities{{.signature = "A"}, {}},
+            {1, 0}}));
 
 TEST(SocketMatching, WhatIdentityDoesNotTellApartGoesByOrder) {
-  const ProcessorMark alike{.signature = "A", .name = "xeon"};
+  const ProcessorIdentity alike{.signature = "A", .name = "xeon"};
 
-  const SocketMatching matching = matchSockets(Marks{alike, alike, alike}, Marks{alike, alike, alike});
+  const SocketMatching matching = matchSockets(Identities{alike, alike, alike}, Identities{alike, alike, alike});
 
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 1, 2}));
   EXPECT_EQ(matching.packages[1].rule,
             "the same signature, name; 3 are alike, so by order: ascending handle to ascending package number");
-  EXPECT_EQ(matchSockets(Marks{{}, {}}, Marks{{}, {}}).packages[0].rule,
+  EXPECT_EQ(matchSockets(Identities{{}, {}}, Identities{{}, {}}).packages[0].rule,
             "2 are alike, so by order: ascending handle to ascending package number");
 }
 
 TEST(SocketMatching, MoreSocketsThanPackagesAreAContradiction) {
-  const ProcessorMark alike{.signature = "A"};
+  const ProcessorIdentity alike{.signature = "A"};
 
-  const SocketMatching matching = matchSockets(Marks{alike, alike}, Marks{alike});
+  const SocketMatching matching = matchSockets(Identities{alike, alike}, Identities{alike});
 
   EXPECT_EQ(socketsOf(matching), std::vector<std::size_t>{none});
   ASSERT_EQ(matching.contradictions.size(), 1U);
@@ -95,22 +98,22 @@ TEST(SocketMatching, MoreSocketsThanPackagesAreAContradiction) {
 }
 
 TEST(SocketMatching, MorePackagesThanSocketsAreAContradiction) {
-  const SocketMatching matching = matchSockets(Marks{{}}, Marks{{}, {}});
+  const SocketMatching matching = matchSockets(Identities{{}}, Identities{{}, {}});
 
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{none, none}));
   EXPECT_EQ(matching.contradictions.size(), 1U);
 }
 
 TEST(SocketMatching, NothingIsKnownAndMoreAreLeft) {
-  const SocketMatching matching = matchSockets(Marks{{.cores = 4}, {}}, Marks{{.cores = 6}, {.name = "x"}});
+  const SocketMatching matching = matchSockets(Identities{{.cores = 4}, {}}, Identities{{.cores = 6}, {.name = "x"}});
 
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 1}));
 }
 
 TEST(SocketMatching, ContradictionsAreInTheOrderOfThePackages) {
   const SocketMatching matching =
-      matchSockets(Marks{{.signature = "1", .name = "a"}, {.signature = "2", .name = "z"}, {.signature = "3"}},
-                   Marks{{.signature = "4", .name = "z"}, {.signature = "5", .name = "a"}, {.signature = "6"}});
+      matchSockets(Identities{{.signature = "1", .name = "a"}, {.signature = "2", .name = "z"}, {.signature = "3"}},
+                   Identities{{.signature = "4", .name = "z"}, {.signature = "5", .name = "a"}, {.signature = "6"}});
 
   ASSERT_EQ(matching.contradictions.size(), 3U);
   EXPECT_EQ(matching.contradictions[0].sockets, std::vector<std::size_t>{1});
@@ -119,8 +122,8 @@ TEST(SocketMatching, ContradictionsAreInTheOrderOfThePackages) {
 }
 
 TEST(SocketMatching, WhatIsLeftOverStaysInItsOrder) {
-  const SocketMatching matching = matchSockets(Marks{{.name = "z"}, {.name = "y"}, {.name = "m"}, {.name = "x"}},
-                                               Marks{{.name = "d"}, {.name = "m"}, {.name = "c"}, {.name = "b"}});
+  const SocketMatching matching = matchSockets(Identities{{.name = "z"}, {.name = "y"}, {.name = "m"}, {.name = "x"}},
+                                               Identities{{.name = "d"}, {.name = "m"}, {.name = "c"}, {.name = "b"}});
 
   EXPECT_EQ(socketsOf(matching), (std::vector<std::size_t>{0, 2, 1, 3}));
 }
@@ -128,8 +131,8 @@ TEST(SocketMatching, WhatIsLeftOverStaysInItsOrder) {
 // Comparing each with each would take very long.
 TEST(SocketMatching, VeryManyAreToldApart) {
   constexpr unsigned int count = 20000;
-  Marks sockets;
-  Marks packages;
+  Identities sockets;
+  Identities packages;
   std::vector<std::size_t> expected;
   for (unsigned int i = 0; i < count; ++i) {
     sockets.push_back({.signature = "A", .cores = i});
@@ -141,14 +144,14 @@ TEST(SocketMatching, VeryManyAreToldApart) {
 }
 
 TEST(SocketMatching, NoSocketAtAllIsAContradiction) {
-  const SocketMatching matching = matchSockets(Marks{}, Marks{{}});
+  const SocketMatching matching = matchSockets(Identities{}, Identities{{}});
 
   EXPECT_EQ(matching.contradictions.size(), 1U);
 }
 
 TEST(SocketMatching, AProcessorThatTheKernelDoesNotSeeIsKnownByItsIdentity) {
   const SocketMatching matching =
-      matchSockets(Marks{{.signature = "B"}, {.signature = "A"}}, Marks{{.signature = "A"}});
+      matchSockets(Identities{{.signature = "B"}, {.signature = "A"}}, Identities{{.signature = "A"}});
 
   EXPECT_EQ(socketsOf(matching), std::vector<std::size_t>{1});
   EXPECT_EQ(matching.unseen, std::vector<std::size_t>{0});
@@ -157,15 +160,15 @@ TEST(SocketMatching, AProcessorThatTheKernelDoesNotSeeIsKnownByItsIdentity) {
 
 TEST(SocketMatching, DifferentSignaturesAreNeverOneProcessor) {
   const SocketMatching matching =
-      matchSockets(Marks{{.signature = "A", .name = "x"}}, Marks{{.signature = "B", .name = "x"}});
+      matchSockets(Identities{{.signature = "A", .name = "x"}}, Identities{{.signature = "B", .name = "x"}});
 
   EXPECT_EQ(socketsOf(matching), std::vector<std::size_t>{none});
   EXPECT_EQ(matching.contradictions.size(), 1U);
 }
 
 TEST(SocketMatching, DifferentNamesAndCountsAlonePreventNothing) {
-  const SocketMatching matching = matchSockets(Marks{{.signature = "A", .name = "x", .cores = 8}},
-                                               Marks{{.signature = "A", .name = "y", .cores = 4}});
+  const SocketMatching matching = matchSockets(Identities{{.signature = "A", .name = "x", .cores = 8}},
+                                               Identities{{.signature = "A", .name = "y", .cores = 4}});
 
   EXPECT_EQ(socketsOf(matching), std::vector<std::size_t>{0});
 }
