@@ -8,9 +8,10 @@ using namespace Tarn::Common;
 
 TEST(Hex, HasTwoDigitsForAByte) {
   std::string text = "x";
-  for (const unsigned char byte : {0x00, 0x0A, 0xA0, 0xFF}) {
-    appendHex(text, byte);
-  }
+  appendHex(text, 0x00);
+  appendHex(text, 0x0A);
+  appendHex(text, 0xA0);
+  appendHex(text, 0xFF);
   appendHex(text, 0xBC, hexCapitals);
   EXPECT_EQ(text, "x000aa0ffBC");
 }
