@@ -18,7 +18,7 @@
 #include "host/cli/Overview.h"
 #include "host/cli/SnapshotCommand.h"
 #include "host/cli/diff/DiffCommand.h"
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 #include "host/cli/drawing/TreeDot.h"
 #include "host/cli/drawing/TreeSvg.h"
 #include "host/cli/drawing/TreeText.h"
@@ -59,14 +59,14 @@ std::string inventoryOutput(const Options& options) {
 }
 
 std::string treeOutput(Format format, std::size_t width) {
-  const Topology topology = readTopology(*Tarn::Inventory::processTree(), Tarn::getSystemName());
+  const Machine machine = readMachine(*Tarn::Inventory::processTree(), Tarn::getSystemName());
   switch (format) {
     case Format::Svg:
-      return drawTreeSvg(topology);
+      return drawTreeSvg(machine);
     case Format::Dot:
-      return drawTreeDot(topology);
+      return drawTreeDot(machine);
     default:
-      return drawTreeText(topology, width);
+      return drawTreeText(machine, width);
   }
 }
 

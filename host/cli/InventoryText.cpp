@@ -4,8 +4,8 @@
 #include <utility>
 #include <vector>
 
+#include "host/cli/StateNote.h"
 #include "host/cli/Text.h"
-#include "host/cli/drawing/Topology.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Corvcim {

@@ -4,8 +4,8 @@
 #include <array>
 
 #include "host/cli/Quantities.h"
+#include "host/cli/StateNote.h"
 #include "host/cli/Text.h"
-#include "host/cli/drawing/Topology.h"
 #include "host/cli/results/ValueNames.h"
 
 namespace Corvcim {

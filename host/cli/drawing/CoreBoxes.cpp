@@ -3,8 +3,11 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/cli/StateNote.h"
 #include "host/cli/Text.h"
 #include "host/cli/drawing/BoxGrid.h"
+#include "host/cli/drawing/PartLabels.h"
+#include "host/cli/drawing/PartShapes.h"
 
 namespace Corvcim {
 namespace {
@@ -23,7 +26,7 @@ bool isInUse(unsigned int status) {
   return status == Tarn::Inventory::Status::inUse;
 }
 
-std::string describe(const TopologyPart& core) {
+std::string describe(const MachinePart& core) {
   std::string text = "core " + core.corePath;
   for (const std::string& fact : {cpuListText(core.cpus), labelsOf(core.caches), stateNote(core.status)}) {
     text += fact.empty() ? "" : " · " + fact;
@@ -32,13 +35,13 @@ std::string describe(const TopologyPart& core) {
 }
 
 /// "CPUs 0-1", "CPU 3, offline".
-std::string noteOf(const TopologyPart& core) {
+std::string noteOf(const MachinePart& core) {
   const std::string cpus = cpuListText(core.cpus);
   const std::string state = stateNote(core.status);
   return cpus + (cpus.empty() || state.empty() ? "" : ", ") + state;
 }
 
-Box emptyCell(const TopologyPart& core, int width) {
+Box emptyCell(const MachinePart& core, int width) {
   Box box(Box::Style::Core);
   box.isInUse = isInUse(core.status);
   box.tooltip = describe(core);
@@ -46,7 +49,7 @@ Box emptyCell(const TopologyPart& core, int width) {
   return box;
 }
 
-Box smallCore(const TopologyPart& core, int width) {
+Box smallCore(const MachinePart& core, int width) {
   Box box = emptyCell(core, width);
   box.height = cellHeight;
   addCentredLine(box, TextStyle::Label, 15, core.corePath);
@@ -55,7 +58,7 @@ Box smallCore(const TopologyPart& core, int width) {
 }
 
 /// One cell that stands for all the cores.
-Box summaryCell(std::span<const TopologyPart> cores) {
+Box summaryCell(std::span<const MachinePart> cores) {
   Box box(Box::Style::Core);
   const std::string label = counted(cores.size(), "core");
   const std::string range = cores.front().corePath + " to " + cores.back().corePath;
@@ -67,14 +70,14 @@ Box summaryCell(std::span<const TopologyPart> cores) {
   return box;
 }
 
-int smallCellWidth(const TopologyPart& core) {
+int smallCellWidth(const MachinePart& core) {
   constexpr int narrowest = 40;
   constexpr int widest = 80;
   return std::max({narrowest, textWidth(TextStyle::Label, core.corePath) + 8,
                    std::min(textWidth(TextStyle::Note, core.cpus.toList()) + 8, widest)});
 }
 
-int fullCellWidth(const TopologyPart& core) {
+int fullCellWidth(const MachinePart& core) {
   constexpr int narrowest = 76;
   constexpr int widestNote = 130;
   int width = std::max({narrowest, textWidth(TextStyle::Label, "core " + core.corePath),
@@ -89,7 +92,7 @@ int levelOf(const CacheUnit& cache) {
   return cache.name.starts_with('L') && cache.name.size() > 1 ? cache.name[1] - '0' : 0;
 }
 
-std::string traitsOf(const TopologyPart& core) {
+std::string traitsOf(const MachinePart& core) {
   const std::string threads = core.cpus.empty() ? "" : counted(core.cpus.count(), "thread");
   const std::string caches = labelsOf(core.caches);
   return threads + (threads.empty() || caches.empty() ? "" : " · ") + caches;
@@ -103,12 +106,12 @@ void addLine(Box& box, TextStyle style, int x, int y, std::string text) {
   }
 }
 
-CorePlan planCores(const Topology& topology) {
+CorePlan planCores(const Machine& machine) {
   CorePlan plan;
-  const std::size_t count = topology.coreCount();
+  const std::size_t count = machine.coreCount();
   plan.detail = count <= fullUpTo ? Detail::Full : count <= cellsUpTo ? Detail::Cells : Detail::Summary;
-  for (const TopologyProcessor& processor : topology.processors) {
-    for (const TopologyPart* core : coresOf(processor.parts)) {
+  for (const MachineProcessor& processor : machine.processors) {
+    for (const MachinePart* core : coresOf(processor.parts)) {
       plan.cellWidth =
           std::max(plan.cellWidth, plan.detail == Detail::Full ? fullCellWidth(*core) : smallCellWidth(*core));
     }
@@ -125,7 +128,7 @@ Box cacheBar(std::span<const CacheUnit> caches, int width) {
   return bar;
 }
 
-Box fullCore(const TopologyPart& core, const CorePlan& plan) {
+Box fullCore(const MachinePart& core, const CorePlan& plan) {
   Box box = emptyCell(core, plan.cellWidth);
   int top = 0;
   for (const CacheUnit& cache : core.caches) {
@@ -141,13 +144,13 @@ Box fullCore(const TopologyPart& core, const CorePlan& plan) {
   return box;
 }
 
-Box coreGroup(std::span<const TopologyPart> cores, const CorePlan& plan, int maxWidth, const std::string& traits) {
+Box coreGroup(std::span<const MachinePart> cores, const CorePlan& plan, int maxWidth, const std::string& traits) {
   Box group(Box::Style::CoreGroup);
   std::vector<Box> cells;
   if (plan.detail == Detail::Summary && cores.size() > 1) {
     cells.push_back(summaryCell(cores));
   } else {
-    for (const TopologyPart& core : cores) {
+    for (const MachinePart& core : cores) {
       cells.push_back(smallCore(core, plan.cellWidth));
     }
   }
@@ -161,9 +164,9 @@ Box coreGroup(std::span<const TopologyPart> cores, const CorePlan& plan, int max
   return group;
 }
 
-std::string commonTraits(std::span<const TopologyPart* const> cores) {
+std::string commonTraits(std::span<const MachinePart* const> cores) {
   std::string common;
-  for (const TopologyPart* core : cores) {
+  for (const MachinePart* core : cores) {
     const std::string traits = traitsOf(*core);
     if (core != cores.front() && traits != common) {
       return "";

@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
+#include "host/cli/drawing/Machine.h"
 #include "host/cli/drawing/SvgLayout.h"
-#include "host/cli/drawing/Topology.h"
 
 namespace Corvcim {
 
@@ -25,20 +25,20 @@ struct CorePlan {
 
 inline constexpr int barHeight = 22;
 
-CorePlan planCores(const Topology& topology);
+CorePlan planCores(const Machine& machine);
 
 /// A bar in the colour of its cache level; without text.
 Box cacheBar(std::span<const CacheUnit> caches, int width);
 
 /// A core with its caches above it.
-Box fullCore(const TopologyPart& core, const CorePlan& plan);
+Box fullCore(const MachinePart& core, const CorePlan& plan);
 
 /// Cores as small cells, or as one cell for all of them, with a line below that says what they have
 /// in common.
-Box coreGroup(std::span<const TopologyPart> cores, const CorePlan& plan, int maxWidth, const std::string& traits);
+Box coreGroup(std::span<const MachinePart> cores, const CorePlan& plan, int maxWidth, const std::string& traits);
 
 /// What all the cores have: "2 threads · L2 512 KiB, L1d 32 KiB"; empty where they differ.
-std::string commonTraits(std::span<const TopologyPart* const> cores);
+std::string commonTraits(std::span<const MachinePart* const> cores);
 
 void addLine(Box& box, TextStyle style, int x, int y, std::string text);
 

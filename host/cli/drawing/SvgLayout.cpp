@@ -7,6 +7,8 @@
 #include "host/cli/Text.h"
 #include "host/cli/drawing/BoxGrid.h"
 #include "host/cli/drawing/CoreBoxes.h"
+#include "host/cli/drawing/PartLabels.h"
+#include "host/cli/drawing/PartShapes.h"
 
 namespace Corvcim {
 namespace {
@@ -20,10 +22,10 @@ struct Plan {
   bool saysTraits = true;  ///< whether each group of cores says what they have
 };
 
-std::vector<Box> partBoxes(std::span<const TopologyPart> parts, const Plan& plan, int maxWidth);
+std::vector<Box> partBoxes(std::span<const MachinePart> parts, const Plan& plan, int maxWidth);
 
 /// Caches that several cores share, around these cores. `count` groups like this one are meant.
-Box sharedCache(const TopologyPart& part, std::size_t count, const Plan& plan, int maxWidth) {
+Box sharedCache(const MachinePart& part, std::size_t count, const Plan& plan, int maxWidth) {
   Box box(Box::Style::SharedCache);
   const int room = maxWidth - 2 * boxPadding;
   const std::string label = (count == 1 ? "" : std::to_string(count) + " × ") + labelsOf(part.caches);
@@ -54,13 +56,13 @@ void addRun(std::vector<Box>& boxes, PartRun run, const Plan& plan, int maxWidth
     boxes.push_back(sharedCache(run.front(), run.size(), plan, maxWidth));
     return;
   }
-  for (const TopologyPart& part : run) {
+  for (const MachinePart& part : run) {
     boxes.push_back(part.isCore() ? fullCore(part, plan.cores) : sharedCache(part, 1, plan, maxWidth));
   }
 }
 
 /// Small cells show a core's state, so that cores need not be in the same state to stand in one group.
-std::vector<Box> partBoxes(std::span<const TopologyPart> parts, const Plan& plan, int maxWidth) {
+std::vector<Box> partBoxes(std::span<const MachinePart> parts, const Plan& plan, int maxWidth) {
   std::vector<Box> boxes;
   for (const PartRun run : runsOfShape(parts, plan.cores.detail == Detail::Cells ? States::Ignored : States::Count)) {
     addRun(boxes, run, plan, maxWidth);
@@ -87,7 +89,7 @@ struct HeadLine {
   std::string text;
 };
 
-std::vector<HeadLine> headLines(const TopologyProcessor& processor, const std::string& traits) {
+std::vector<HeadLine> headLines(const MachineProcessor& processor, const std::string& traits) {
   std::string facts;
   for (const std::string& fact : factsOf(processor)) {
     facts += (facts.empty() ? "" : " · ") + fact;
@@ -100,7 +102,7 @@ std::vector<HeadLine> headLines(const TopologyProcessor& processor, const std::s
   return lines;
 }
 
-Box processorBox(const TopologyProcessor& processor, const CorePlan& cores, int maxWidth) {
+Box processorBox(const MachineProcessor& processor, const CorePlan& cores, int maxWidth) {
   Box box(Box::Style::Processor);
   box.isInUse = processor.status == Tarn::Inventory::Status::inUse;
   const std::string traits = cores.detail == Detail::Full ? "" : commonTraits(coresOf(processor.parts));
@@ -121,22 +123,22 @@ Box processorBox(const TopologyProcessor& processor, const CorePlan& cores, int 
 
 }  // namespace
 
-Box layOut(const Topology& topology) {
-  const CorePlan cores = planCores(topology);
+Box layOut(const Machine& machine) {
+  const CorePlan cores = planCores(machine);
   const int room = pageWidth - 2 * boxPadding;
-  const int processorRoom = topology.processors.size() == 1 ? room : (room - boxGap) / 2;
+  const int processorRoom = machine.processors.size() == 1 ? room : (room - boxGap) / 2;
   std::vector<Box> processors;
-  for (const TopologyProcessor& processor : topology.processors) {
+  for (const MachineProcessor& processor : machine.processors) {
     processors.push_back(processorBox(processor, cores, processorRoom));
   }
-  const std::string summary = summaryOf(topology);
+  const std::string summary = summaryOf(machine);
   Box page(Box::Style::Page);
   page.width = std::min(
-      std::max(textWidth(TextStyle::Title, topology.systemName), textWidth(TextStyle::Label, summary)) + 2 * boxPadding,
+      std::max(textWidth(TextStyle::Title, machine.systemName), textWidth(TextStyle::Label, summary)) + 2 * boxPadding,
       pageWidth);
   arrange(page, std::move(processors), {boxPadding, 66}, room);
   const int textRoom = page.width - 2 * boxPadding;
-  addLine(page, TextStyle::Title, boxPadding, 32, fitText(TextStyle::Title, topology.systemName, textRoom));
+  addLine(page, TextStyle::Title, boxPadding, 32, fitText(TextStyle::Title, machine.systemName, textRoom));
   addLine(page, TextStyle::Label, boxPadding, 52, fitText(TextStyle::Label, summary, textRoom));
   stretch(page, page.width);
   return page;

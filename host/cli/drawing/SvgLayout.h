@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 namespace Corvcim {
 
@@ -41,7 +41,7 @@ struct Box {
 /// Places everything: processors beside or below each other, in each its shared caches around the
 /// cores that share them. Up to 32 cores each core shows its own caches; on larger machines cores
 /// are small cells, and what they have in common is said once for each group.
-Box layOut(const Topology& topology);
+Box layOut(const Machine& machine);
 
 }  // namespace Corvcim
 

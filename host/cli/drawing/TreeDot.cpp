@@ -76,8 +76,8 @@ class Graph {
 
 }  // namespace
 
-std::string drawTreeDot(const Topology& topology) {
-  return Graph().write(outlineOf(topology));
+std::string drawTreeDot(const Machine& machine) {
+  return Graph().write(outlineOf(machine));
 }
 
 }  // namespace Corvcim

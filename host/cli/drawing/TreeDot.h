@@ -3,12 +3,12 @@
 
 #include <string>
 
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 namespace Corvcim {
 
-/// The topology as a graph in the DOT language, for Graphviz.
-std::string drawTreeDot(const Topology& topology);
+/// The machine as a graph in the DOT language, for Graphviz.
+std::string drawTreeDot(const Machine& machine);
 
 }  // namespace Corvcim
 

@@ -3,7 +3,10 @@
 #include <utility>
 
 #include "host/cli/Quantities.h"
+#include "host/cli/StateNote.h"
 #include "host/cli/Text.h"
+#include "host/cli/drawing/PartLabels.h"
+#include "host/cli/drawing/PartShapes.h"
 
 namespace Corvcim {
 namespace {
@@ -25,7 +28,7 @@ void addState(OutlineItem& item, unsigned int status) {
   addDetail(item, stateNote(status));
 }
 
-OutlineItem coreItem(const TopologyPart& core) {
+OutlineItem coreItem(const MachinePart& core) {
   OutlineItem item = {Kind::Core, "core " + core.corePath, {}, true, {}};
   addDetail(item, cpuListText(core.cpus));
   addDetail(item, labelsOf(core.caches));
@@ -33,7 +36,7 @@ OutlineItem coreItem(const TopologyPart& core) {
   return item;
 }
 
-std::string eachHas(const TopologyPart& core) {
+std::string eachHas(const MachinePart& core) {
   const std::size_t threads = core.cpus.count();
   std::string text = threads == 0 ? "" : counted(threads, "thread");
   if (!core.caches.empty()) {
@@ -44,14 +47,14 @@ std::string eachHas(const TopologyPart& core) {
 
 CpuSet cpusOf(PartRun run) {
   CpuSet cpus;
-  for (const TopologyPart& part : run) {
+  for (const MachinePart& part : run) {
     cpus.add(part.cpus);
   }
   return cpus;
 }
 
 OutlineItem coreRunItem(PartRun run) {
-  const TopologyPart& first = run.front();
+  const MachinePart& first = run.front();
   const std::string label = counted(run.size(), "core") + ' ' + first.corePath + " to " + run.back().corePath;
   OutlineItem item = {Kind::Core, label, {}, true, {}};
   addDetail(item, cpuListText(cpusOf(run)));
@@ -60,9 +63,9 @@ OutlineItem coreRunItem(PartRun run) {
   return item;
 }
 
-std::vector<OutlineItem> partItems(std::span<const TopologyPart> parts, bool isCompact);
+std::vector<OutlineItem> partItems(std::span<const MachinePart> parts, bool isCompact);
 
-OutlineItem sharedItem(const TopologyPart& part, bool isCompact) {
+OutlineItem sharedItem(const MachinePart& part, bool isCompact) {
   return {Kind::Cache,
           labelsOf(part.caches),
           {"shared by " + counted(part.coreCount, "core")},
@@ -71,7 +74,7 @@ OutlineItem sharedItem(const TopologyPart& part, bool isCompact) {
 }
 
 OutlineItem sharedRunItem(PartRun run, bool isCompact) {
-  const TopologyPart& first = run.front();
+  const MachinePart& first = run.front();
   return {Kind::Cache,
           std::to_string(run.size()) + " × " + labelsOf(first.caches),
           {"each shared by " + counted(first.coreCount, "core"), "the first:"},
@@ -79,21 +82,21 @@ OutlineItem sharedRunItem(PartRun run, bool isCompact) {
           partItems(first.parts, isCompact)};
 }
 
-std::vector<OutlineItem> partItems(std::span<const TopologyPart> parts, bool isCompact) {
+std::vector<OutlineItem> partItems(std::span<const MachinePart> parts, bool isCompact) {
   std::vector<OutlineItem> items;
   for (const PartRun run : runsOfShape(parts)) {
     if (isCompact && run.size() > 1) {
       items.push_back(run.front().isCore() ? coreRunItem(run) : sharedRunItem(run, isCompact));
       continue;
     }
-    for (const TopologyPart& part : run) {
+    for (const MachinePart& part : run) {
       items.push_back(part.isCore() ? coreItem(part) : sharedItem(part, isCompact));
     }
   }
   return items;
 }
 
-OutlineItem processorItem(const TopologyProcessor& processor, bool isCompact) {
+OutlineItem processorItem(const MachineProcessor& processor, bool isCompact) {
   OutlineItem item = {Kind::Processor, "processor " + processor.path, {}, true, {}};
   addDetail(item, processor.name);
   for (std::string& detail : factsOf(processor)) {
@@ -109,11 +112,11 @@ OutlineItem processorItem(const TopologyProcessor& processor, bool isCompact) {
 
 }  // namespace
 
-OutlineItem outlineOf(const Topology& topology) {
-  const bool isCompact = topology.coreCount() > fewCores;
-  OutlineItem system = {Kind::System, topology.systemName, {}, true, {}};
-  addDetail(system, topology.model);
-  for (const TopologyProcessor& processor : topology.processors) {
+OutlineItem outlineOf(const Machine& machine) {
+  const bool isCompact = machine.coreCount() > fewCores;
+  OutlineItem system = {Kind::System, machine.systemName, {}, true, {}};
+  addDetail(system, machine.model);
+  for (const MachineProcessor& processor : machine.processors) {
     system.below.push_back(processorItem(processor, isCompact));
   }
   return system;

@@ -4,11 +4,11 @@
 #include <string>
 #include <vector>
 
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 namespace Corvcim {
 
-/// One item of the topology in words.
+/// One item of the machine in words.
 struct OutlineItem {
   enum class Kind { System, Processor, Cache, Core, Note };
 
@@ -19,9 +19,9 @@ struct OutlineItem {
   std::vector<OutlineItem> below;
 };
 
-/// The topology in words. On machines with many cores, neighbours of the same shape share one item,
+/// The machine in words. On machines with many cores, neighbours of the same shape share one item,
 /// and what is below the first of them stands for all.
-OutlineItem outlineOf(const Topology& topology);
+OutlineItem outlineOf(const Machine& machine);
 
 }  // namespace Corvcim
 

@@ -178,10 +178,10 @@ class Picture {
 
 }  // namespace
 
-std::string drawTreeSvg(const Topology& topology) {
-  const Box page = layOut(topology);
+std::string drawTreeSvg(const Machine& machine) {
+  const Box page = layOut(machine);
   Picture picture(page);
-  picture.describe("Processors of " + topology.systemName, drawTreeText(topology, 0));
+  picture.describe("Processors of " + machine.systemName, drawTreeText(machine, 0));
   picture.add(page, 0, 0);
   return picture.take();
 }

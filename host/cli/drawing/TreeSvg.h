@@ -3,13 +3,13 @@
 
 #include <string>
 
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 namespace Corvcim {
 
-/// The topology as a picture: SVG that needs nothing beside itself, on a light ground, with a title
+/// The machine as a picture: SVG that needs nothing beside itself, on a light ground, with a title
 /// and a description for people who cannot see it.
-std::string drawTreeSvg(const Topology& topology);
+std::string drawTreeSvg(const Machine& machine);
 
 }  // namespace Corvcim
 

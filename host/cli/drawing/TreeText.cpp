@@ -41,9 +41,9 @@ class Drawing {
 
 }  // namespace
 
-std::string drawTreeText(const Topology& topology, std::size_t width) {
+std::string drawTreeText(const Machine& machine, std::size_t width) {
   Drawing drawing(width);
-  drawing.add(outlineOf(topology), "", "");
+  drawing.add(outlineOf(machine), "", "");
   return drawing.take();
 }
 

@@ -4,13 +4,13 @@
 #include <cstddef>
 #include <string>
 
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 namespace Corvcim {
 
-/// The topology as a tree of lines. On machines with many cores, neighbours of the same shape share
+/// The machine as a tree of lines. On machines with many cores, neighbours of the same shape share
 /// one line. `width` is the terminal's, where longer lines are cut; 0 for no limit.
-std::string drawTreeText(const Topology& topology, std::size_t width);
+std::string drawTreeText(const Machine& machine, std::size_t width);
 
 }  // namespace Corvcim
 

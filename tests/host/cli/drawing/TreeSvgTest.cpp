@@ -16,7 +16,7 @@ namespace {
 using Tarn::Inventory::Tree;
 
 Box layoutOf(const Tree& tree) {
-  return layOut(readTopology(tree, "host"));
+  return layOut(readMachine(tree, "host"));
 }
 
 bool overlap(const Box& left, const Box& right) {
@@ -105,7 +105,7 @@ TEST(BoxGrid, TextsThatAreTooLongAreCut) {
 }
 
 TEST(TreeSvg, IsAWholePictureWithTitleAndDescription) {
-  const std::string svg = drawTreeSvg(readTopology(Testing::twoCoreMachine(), "host"));
+  const std::string svg = drawTreeSvg(readMachine(Testing::twoCoreMachine(), "host"));
 
   EXPECT_TRUE(
       svg.starts_with("<svg xmlns=\"http://www.w3.org/2000/svg\" role=\"img\" "
@@ -137,10 +137,10 @@ std::vector<std::string> unclosedTags(const std::string& xml) {
 }
 
 TEST(TreeSvg, IsWellFormedWhateverTheTextsHold) {
-  const std::string svg = drawTreeSvg(readTopology(Testing::strangeTexts(), "<host>"));
+  const std::string svg = drawTreeSvg(readMachine(Testing::strangeTexts(), "<host>"));
 
   EXPECT_EQ(unclosedTags(svg), none);
-  EXPECT_EQ(unclosedTags(drawTreeSvg(readTopology(Testing::dualSocketServer(), "host"))), none);
+  EXPECT_EQ(unclosedTags(drawTreeSvg(readMachine(Testing::dualSocketServer(), "host"))), none);
   EXPECT_NE(svg.find("A&lt;b&gt;&amp;&quot;c&quot;\\n\\x1B[31m"), std::string::npos);
   EXPECT_EQ(std::ranges::count_if(svg, [](char c) { return c != '\n' && static_cast<unsigned char>(c) < 0x20; }), 0);
 }

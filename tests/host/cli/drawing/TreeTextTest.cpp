@@ -9,7 +9,7 @@ namespace Corvcim {
 namespace {
 
 std::string drawn(const Tarn::Inventory::Tree& tree, std::size_t width = 0) {
-  return drawTreeText(readTopology(tree, "host"), width);
+  return drawTreeText(readMachine(tree, "host"), width);
 }
 
 TEST(TreeText, TwoCoreMachine) {
@@ -78,7 +78,7 @@ TEST(TreeText, TextsCanNotBreakTheDrawing) {
 
 TEST(TreeDot, EachItemIsANodeBelowItsOwner) {
   EXPECT_EQ(
-      drawTreeDot(readTopology(Testing::strangeTexts(), "host")),
+      drawTreeDot(readMachine(Testing::strangeTexts(), "host")),
       "digraph corvcim {\n"
       "  graph [rankdir=LR, ranksep=0.4, nodesep=0.12, bgcolor=white, fontname=\"Helvetica\"];\n"
       "  node [shape=box, style=\"filled,rounded\", fontname=\"Helvetica\", fontsize=11, color=\"#5b6770\", "

@@ -1,11 +1,10 @@
-#include "host/cli/drawing/Topology.h"
+#include "host/cli/drawing/Machine.h"
 
 #include <algorithm>
 #include <array>
 #include <string_view>
 #include <utility>
 
-#include "host/cli/Quantities.h"
 #include "host/cli/Text.h"
 
 namespace Corvcim {
@@ -80,18 +79,18 @@ struct CacheRow {
   CpuSet cpus;
 };
 
-void sortByCpu(std::vector<TopologyPart>& parts) {
-  std::ranges::stable_sort(parts, {}, [](const TopologyPart& part) { return part.cpus.first(); });
+void sortByCpu(std::vector<MachinePart>& parts) {
+  std::ranges::stable_sort(parts, {}, [](const MachinePart& part) { return part.cpus.first(); });
 }
 
 /// Nests rows and cores by who lies within whom. `rows` are sorted from the outside in.
 class Nesting {
  public:
-  Nesting(std::vector<CacheRow> rows, std::vector<TopologyPart> cores)
+  Nesting(std::vector<CacheRow> rows, std::vector<MachinePart> cores)
       : rows_(std::move(rows)), cores_(std::move(cores)), isPlaced_(cores_.size(), false) {}
 
-  std::vector<TopologyPart> build() {
-    std::vector<TopologyPart> parts = partsWithin(0, nullptr);
+  std::vector<MachinePart> build() {
+    std::vector<MachinePart> parts = partsWithin(0, nullptr);
     sortByCpu(parts);
     return parts;
   }
@@ -100,8 +99,8 @@ class Nesting {
   std::vector<CacheUnit> takeUnplaced() { return std::move(unplaced_); }
 
  private:
-  std::vector<TopologyPart> partsWithin(std::size_t firstRow, const CpuSet* bounds) {
-    std::vector<TopologyPart> parts;
+  std::vector<MachinePart> partsWithin(std::size_t firstRow, const CpuSet* bounds) {
+    std::vector<MachinePart> parts;
     for (std::size_t i = firstRow; i < rows_.size(); ++i) {
       if (rows_[i].caches.empty() || (bounds != nullptr && !rows_[i].cpus.isSubsetOf(*bounds))) {
         continue;
@@ -117,8 +116,8 @@ class Nesting {
     return parts;
   }
 
-  void addSharedCaches(std::vector<TopologyPart>& parts, std::size_t row) {
-    TopologyPart part;
+  void addSharedCaches(std::vector<MachinePart>& parts, std::size_t row) {
+    MachinePart part;
     part.caches = std::exchange(rows_[row].caches, {});
     part.cpus = rows_[row].cpus;
     part.parts = partsWithin(row + 1, &part.cpus);
@@ -128,7 +127,7 @@ class Nesting {
     }
     sortByCpu(part.parts);
     part.coreCount = 0;
-    for (const TopologyPart& inner : part.parts) {
+    for (const MachinePart& inner : part.parts) {
       part.coreCount += inner.coreCount;
       part.level = std::max(part.level, inner.level + 1);
     }
@@ -136,7 +135,7 @@ class Nesting {
   }
 
   std::vector<CacheRow> rows_;  // a row's caches are taken out when it is placed
-  std::vector<TopologyPart> cores_;
+  std::vector<MachinePart> cores_;
   std::vector<bool> isPlaced_;
   std::vector<CacheUnit> unplaced_;
 };
@@ -158,8 +157,8 @@ void addToRows(std::vector<CacheRow>& rows, const CacheNode& cache) {
   rows.push_back({{cache.unit}, cache.depth, cache.cpus});
 }
 
-TopologyPart* onlyUser(std::vector<TopologyPart>& cores, const CpuSet& cpus) {
-  for (TopologyPart& core : cores) {
+MachinePart* onlyUser(std::vector<MachinePart>& cores, const CpuSet& cpus) {
+  for (MachinePart& core : cores) {
     if (cpus.isSubsetOf(core.cpus)) {
       return &core;
     }
@@ -167,13 +166,13 @@ TopologyPart* onlyUser(std::vector<TopologyPart>& cores, const CpuSet& cpus) {
   return nullptr;
 }
 
-void readParts(TopologyProcessor& processor, std::vector<CacheNode> caches, std::vector<TopologyPart> cores) {
+void readParts(MachineProcessor& processor, std::vector<CacheNode> caches, std::vector<MachinePart> cores) {
   sortFromOutside(caches);
   std::vector<CacheRow> rows;
   for (const CacheNode& cache : caches) {
     if (cache.cpus.empty()) {
       processor.otherCaches.push_back(cache.unit);
-    } else if (TopologyPart* core = onlyUser(cores, cache.cpus)) {
+    } else if (MachinePart* core = onlyUser(cores, cache.cpus)) {
       core->caches.push_back(cache.unit);
     } else {
       addToRows(rows, cache);
@@ -185,22 +184,22 @@ void readParts(TopologyProcessor& processor, std::vector<CacheNode> caches, std:
   processor.otherCaches.insert(processor.otherCaches.end(), unplaced.begin(), unplaced.end());
 }
 
-TopologyProcessor readProcessor(const Tree& tree, NodeIndex index) {
+MachineProcessor readProcessor(const Tree& tree, NodeIndex index) {
   const Node& node = tree.node(index);
-  TopologyProcessor processor;
+  MachineProcessor processor;
   processor.path = node.path();
   processor.name = textOf(tree, node, Lexicon::PropProcessorName);
   processor.status = node.status;
   processor.maxClock = numberOf(tree, node, Lexicon::PropMaxClockSpeed);
   processor.threadCount = numberOf(tree, node, Lexicon::PropHardwareThreads);
   std::vector<CacheNode> caches;
-  std::vector<TopologyPart> cores;
+  std::vector<MachinePart> cores;
   for (NodeIndex i = index + 1; i < node.end; ++i) {
     const Node& part = tree.node(i);
     if (part.type == Lexicon::NodeCacheMemory) {
       caches.push_back(readCache(tree, part));
     } else if (part.type == Lexicon::NodeProcessorCore) {
-      TopologyPart core;
+      MachinePart core;
       core.corePath = part.path();
       core.status = part.status;
       core.cpus = part.cpus;
@@ -212,141 +211,26 @@ TopologyProcessor readProcessor(const Tree& tree, NodeIndex index) {
   return processor;
 }
 
-void collectCores(std::span<const TopologyPart> parts, std::vector<const TopologyPart*>& cores) {
-  for (const TopologyPart& part : parts) {
-    if (part.isCore()) {
-      cores.push_back(&part);
-    } else {
-      collectCores(part.parts, cores);
-    }
-  }
-}
-
 }  // namespace
 
-std::string CacheUnit::label() const {
-  return size == 0 ? name : name + ' ' + formatBytes(size);
-}
-
-std::string stateNote(unsigned int status) {
-  namespace Status = Tarn::Inventory::Status;
-  switch (status) {
-    case Status::inUse:
-      return "";
-    case Status::offline:
-      return "offline";
-    case Status::emptySocket:
-      return "empty socket";
-    case Status::disabled:
-      return "disabled";
-    case Status::failed:
-      return "failed";
-    default:
-      return "status " + std::to_string(status);
-  }
-}
-
-std::string cpuListText(const CpuSet& cpus) {
-  if (cpus.empty()) {
-    return "";
-  }
-  return (cpus.count() == 1 ? "CPU " : "CPUs ") + cpus.toList();
-}
-
-std::string labelsOf(std::span<const CacheUnit> caches) {
-  std::string text;
-  while (!caches.empty()) {
-    std::size_t equal = 1;
-    while (equal < caches.size() && caches[equal] == caches.front()) {
-      ++equal;
-    }
-    const std::string note = stateNote(caches.front().status);
-    text += text.empty() ? "" : ", ";
-    text += equal == 1 ? "" : std::to_string(equal) + " × ";
-    text += caches.front().label();
-    text += note.empty() ? "" : " (" + note + ')';
-    caches = caches.subspan(equal);
-  }
-  return text;
-}
-
-std::vector<std::string> factsOf(const TopologyProcessor& processor) {
-  std::vector<std::string> facts;
-  if (processor.coreCount != 0) {
-    facts.push_back(counted(processor.coreCount, "core"));
-  }
-  if (processor.threadCount != 0) {
-    facts.push_back(counted(processor.threadCount, "thread"));
-  }
-  if (processor.maxClock != 0) {
-    facts.push_back("up to " + formatMegahertz(processor.maxClock));
-  }
-  if (std::string note = stateNote(processor.status); !note.empty()) {
-    facts.push_back(std::move(note));
-  }
-  return facts;
-}
-
-std::string summaryOf(const Topology& topology) {
-  std::size_t threads = 0;
-  for (const TopologyProcessor& processor : topology.processors) {
-    threads += processor.threadCount;
-  }
-  std::string summary = topology.model;
-  const auto add = [&summary](const std::string& fact) { summary += (summary.empty() ? "" : " · ") + fact; };
-  add(counted(topology.processors.size(), "processor"));
-  add(counted(topology.coreCount(), "core"));
-  if (threads != 0) {
-    add(counted(threads, "thread"));
-  }
-  return summary;
-}
-
-std::size_t Topology::coreCount() const {
+std::size_t Machine::coreCount() const {
   std::size_t count = 0;
-  for (const TopologyProcessor& processor : processors) {
+  for (const MachineProcessor& processor : processors) {
     count += processor.coreCount;
   }
   return count;
 }
 
-Topology readTopology(const Tree& tree, std::string_view systemName) {
-  Topology topology;
-  topology.systemName = toPrintable(systemName);
+Machine readMachine(const Tree& tree, std::string_view systemName) {
+  Machine machine;
+  machine.systemName = toPrintable(systemName);
   for (const NodeIndex index : tree.ofType(Lexicon::NodeSystem)) {
-    topology.model = textOf(tree, tree.node(index), Lexicon::PropSystemModel);
+    machine.model = textOf(tree, tree.node(index), Lexicon::PropSystemModel);
   }
   for (const NodeIndex index : tree.ofType(Lexicon::NodeProcessor)) {
-    topology.processors.push_back(readProcessor(tree, index));
+    machine.processors.push_back(readProcessor(tree, index));
   }
-  return topology;
-}
-
-bool hasSameShape(const TopologyPart& left, const TopologyPart& right, States states) {
-  return left.caches == right.caches && (states == States::Ignored || left.status == right.status) &&
-         left.cpus.count() == right.cpus.count() &&
-         std::ranges::equal(left.parts, right.parts, [states](const TopologyPart& one, const TopologyPart& other) {
-           return hasSameShape(one, other, states);
-         });
-}
-
-std::vector<PartRun> runsOfShape(std::span<const TopologyPart> parts, States states) {
-  std::vector<PartRun> runs;
-  while (!parts.empty()) {
-    std::size_t length = 1;
-    while (length < parts.size() && hasSameShape(parts.front(), parts[length], states)) {
-      ++length;
-    }
-    runs.push_back(parts.first(length));
-    parts = parts.subspan(length);
-  }
-  return runs;
-}
-
-std::vector<const TopologyPart*> coresOf(std::span<const TopologyPart> parts) {
-  std::vector<const TopologyPart*> cores;
-  collectCores(parts, cores);
-  return cores;
+  return machine;
 }
 
 }  // namespace Corvcim

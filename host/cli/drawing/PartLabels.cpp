@@ -1,0 +1,71 @@
+#include "host/cli/drawing/PartLabels.h"
+
+#include <utility>
+
+#include "host/cli/Quantities.h"
+#include "host/cli/StateNote.h"
+#include "host/cli/Text.h"
+
+namespace Corvcim {
+
+std::string labelOf(const CacheUnit& cache) {
+  return cache.size == 0 ? cache.name : cache.name + ' ' + formatBytes(cache.size);
+}
+
+std::string cpuListText(const Tarn::Inventory::CpuSet& cpus) {
+  if (cpus.empty()) {
+    return "";
+  }
+  return (cpus.count() == 1 ? "CPU " : "CPUs ") + cpus.toList();
+}
+
+std::string labelsOf(std::span<const CacheUnit> caches) {
+  std::string text;
+  while (!caches.empty()) {
+    std::size_t equal = 1;
+    while (equal < caches.size() && caches[equal] == caches.front()) {
+      ++equal;
+    }
+    const std::string note = stateNote(caches.front().status);
+    text += text.empty() ? "" : ", ";
+    text += equal == 1 ? "" : std::to_string(equal) + " × ";
+    text += labelOf(caches.front());
+    text += note.empty() ? "" : " (" + note + ')';
+    caches = caches.subspan(equal);
+  }
+  return text;
+}
+
+std::vector<std::string> factsOf(const MachineProcessor& processor) {
+  std::vector<std::string> facts;
+  if (processor.coreCount != 0) {
+    facts.push_back(counted(processor.coreCount, "core"));
+  }
+  if (processor.threadCount != 0) {
+    facts.push_back(counted(processor.threadCount, "thread"));
+  }
+  if (processor.maxClock != 0) {
+    facts.push_back("up to " + formatMegahertz(processor.maxClock));
+  }
+  if (std::string note = stateNote(processor.status); !note.empty()) {
+    facts.push_back(std::move(note));
+  }
+  return facts;
+}
+
+std::string summaryOf(const Machine& machine) {
+  std::size_t threads = 0;
+  for (const MachineProcessor& processor : machine.processors) {
+    threads += processor.threadCount;
+  }
+  std::string summary = machine.model;
+  const auto add = [&summary](const std::string& fact) { summary += (summary.empty() ? "" : " · ") + fact; };
+  add(counted(machine.processors.size(), "processor"));
+  add(counted(machine.coreCount(), "core"));
+  if (threads != 0) {
+    add(counted(threads, "thread"));
+  }
+  return summary;
+}
+
+}  // namespace Corvcim

@@ -1,0 +1,19 @@
+#include "host/cli/drawing/PartLabels.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <vector>
+
+namespace Corvcim {
+namespace {
+
+TEST(PartLabels, EqualCachesAreCounted) {
+  const CacheUnit first = {"L2", 1U << 20U, 1};
+  const CacheUnit off = {"L2", 1U << 20U, 16};
+
+  EXPECT_EQ(labelsOf(std::vector<CacheUnit>{first, first, off}), "2 × L2 1 MiB, L2 1 MiB (disabled)");
+}
+
+}  // namespace
+}  // namespace Corvcim
