@@ -111,6 +111,6 @@ if(CMAKE_SCRIPT_MODE_FILE STREQUAL CMAKE_CURRENT_LIST_FILE)
   file(WRITE ${OUTPUT} "// Made by CorvaneCatalogues.cmake from the catalogues in locale/.\n\n"
     "#include \"platform/locale/Catalogue.h\"\n\n"
     "namespace Tarn::Locale {\nnamespace {\n\n${tables}"
-    "constexpr Catalogue kCatalogues[] = {\n${catalogues}};\n\n}  // namespace\n\n"
-    "std::span<const Catalogue> catalogues() {\n  return kCatalogues;\n}\n\n}  // namespace Tarn::Locale\n")
+    "constexpr Catalogue allCatalogues[] = {\n${catalogues}};\n\n}  // namespace\n\n"
+    "std::span<const Catalogue> catalogues() {\n  return allCatalogues;\n}\n\n}  // namespace Tarn::Locale\n")
 endif()

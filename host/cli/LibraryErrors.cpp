@@ -25,9 +25,8 @@ bool isLoggedHere() {
   using Tarn::Common::environmentOverride;
   const CVLog::Settings settings = CVLog::makeSettings(
       Tarn::Common::configuration(), environmentOverride("CORVANE_LOG"), environmentOverride("CORVANE_TRACE"));
-  return std::ranges::any_of(
-      std::array{settings.log.destination.kind, settings.trace.destination.kind},
-      [](CVLog::DestinationKind kind) { return kind == CVLog::DestinationKind::kStandardError; });
+  return std::ranges::any_of(std::array{settings.log.destination.kind, settings.trace.destination.kind},
+                             [](CVLog::DestinationKind kind) { return kind == CVLog::DestinationKind::StandardError; });
 }
 
 /// Calls `use` with one piece of what was kept after the other.

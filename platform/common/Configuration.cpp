@@ -15,9 +15,9 @@
 namespace Tarn::Common {
 namespace {
 
-constexpr std::size_t kLargestFile = 1 << 20;
+constexpr std::size_t largestFile = 1 << 20;
 
-constexpr std::array<std::string_view, 12> kKeys = {
+constexpr std::array<std::string_view, 12> knownKeys = {
     "inventory",          // which machine the library describes
     "language",           // of captions and descriptions
     "log.destination",    // the log sink
@@ -32,9 +32,9 @@ constexpr std::array<std::string_view, 12> kKeys = {
     "trace.size",         //
 };
 
-std::string knownKeys() {
+std::string listOfKeys() {
   std::string list;
-  for (std::string_view key : kKeys) {
+  for (std::string_view key : knownKeys) {
     list.append(list.empty() ? "" : ", ").append(key);
   }
   return list;
@@ -62,7 +62,7 @@ Content readContent(const std::string& file) {
   }
   Content content;
   std::array<char, 4096> block{};
-  while (content.text.size() <= kLargestFile) {
+  while (content.text.size() <= largestFile) {
     const ssize_t count = ::read(descriptor.number(), block.data(), block.size());
     if (count < 0 && errno == EINTR) {
       continue;
@@ -110,9 +110,9 @@ void Configuration::parseLine(std::string_view line, const std::string& where) {
     return;
   }
   const std::string_view key = trimmed(line.substr(0, equals));
-  if (std::find(kKeys.begin(), kKeys.end(), key) == kKeys.end()) {
+  if (std::find(knownKeys.begin(), knownKeys.end(), key) == knownKeys.end()) {
     problems_.push_back(
-        {where, "unknown key \"" + std::string(key) + "\"; the line is ignored (known keys: " + knownKeys() + ")"});
+        {where, "unknown key \"" + std::string(key) + "\"; the line is ignored (known keys: " + listOfKeys() + ")"});
     return;
   }
   settings_.insert_or_assign(std::string(key), Setting{std::string(trimmed(line.substr(equals + 1))), where});

@@ -13,7 +13,7 @@
 namespace Tarn::Common {
 namespace {
 
-constexpr std::string_view kDefaultFile = "/etc/corvane/corvane.conf";
+constexpr std::string_view defaultFile = "/etc/corvane/corvane.conf";
 
 }  // namespace
 
@@ -24,15 +24,15 @@ ConfigurationFile ConfigurationFile::ofThisProcess() {
     // The process may change its directory, and the file is looked after for as long as it runs.
     std::error_code error;
     const std::filesystem::path absolute = std::filesystem::absolute(*path, error);
-    return {error ? std::move(*path) : absolute.string(), Absence::kIsAProblem};
+    return {error ? std::move(*path) : absolute.string(), Absence::IsAProblem};
   }
-  return {std::string(kDefaultFile), Absence::kIsFine};
+  return {std::string(defaultFile), Absence::IsFine};
 }
 
 Configuration ConfigurationFile::read() {
   // Before reading: what changes in between is then seen as a change.
   lastRead_ = state();
-  if (!lastRead_ && absence_ == Absence::kIsFine && (errno == ENOENT || errno == ENOTDIR)) {
+  if (!lastRead_ && absence_ == Absence::IsFine && (errno == ENOENT || errno == ENOTDIR)) {
     return {};
   }
   return Configuration::read(path_);

@@ -15,7 +15,7 @@ namespace Tarn::Common {
 class ConfigurationFile {
  public:
   /// Whether the configuration has a problem when there is no such file.
-  enum class Absence { kIsFine, kIsAProblem };
+  enum class Absence { IsFine, IsAProblem };
 
   ConfigurationFile(std::string path, Absence absence);
   /// The file that CORVANE_CONFIG names, which must be there, else /etc/corvane/corvane.conf, which may be missing.

@@ -23,7 +23,7 @@ using Common::lessIgnoringCase;
 using Common::textOf;
 
 // Associations of associations nest two or three deep. A path that refers to itself must end somewhere.
-constexpr int kDeepestReference = 8;
+constexpr int deepestReference = 8;
 
 struct Key {
   std::string_view name;
@@ -136,7 +136,7 @@ class Comparison {
   }
 
   bool equalReferences(std::string_view key, const CMPIObjectPath* left, const CMPIObjectPath* right) {
-    if (depth_ == kDeepestReference) {
+    if (depth_ == deepestReference) {
       return differs([] { return "references are nested too deep"; });
     }
     const std::size_t lengthBefore = difference_.size();
@@ -166,7 +166,7 @@ bool isObjPathsEqual(const CMPIObjectPath* left, const CMPIObjectPath* right, bo
 
 bool isObjPathsEqualWithLog(const CMPIBroker* /*broker*/, const CMPIObjectPath* left, const CMPIObjectPath* right,
                             bool flag) {
-  constexpr int level = CVLog::kLevelInfo;
+  constexpr int level = CVLog::levelInfo;
   const bool explains = CVLog::CVLogger::logTakes(level) || CVLog::CVLogger::traceTakes(level);
   Comparison comparison(flag, explains);
   const bool areEqual = comparison.equal(left, right);

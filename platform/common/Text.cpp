@@ -7,7 +7,7 @@
 namespace Tarn {
 namespace {
 
-constexpr std::uint32_t kReplacementCharacter = 0xfffd;
+constexpr std::uint32_t replacementCharacter = 0xfffd;
 
 constexpr bool isCharacter(std::uint32_t code) {
   const bool isSurrogate = code >= 0xd800 && code <= 0xdfff;
@@ -53,7 +53,7 @@ std::string make_string(const std::wstring& text) {
   std::transform(text.begin(), firstBeyondAscii, utf8.begin(), [](wchar_t unit) { return static_cast<char>(unit); });
   std::for_each(firstBeyondAscii, text.end(), [&](wchar_t unit) {
     const std::uint32_t code = codeOf(unit);
-    appendUtf8(utf8, isCharacter(code) ? code : kReplacementCharacter);
+    appendUtf8(utf8, isCharacter(code) ? code : replacementCharacter);
   });
   return utf8;
 }

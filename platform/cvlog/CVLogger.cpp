@@ -33,7 +33,7 @@ std::string_view textOrNothing(const char* text) {
   return text == nullptr ? std::string_view() : text;
 }
 
-constexpr unsigned kNever = std::numeric_limits<unsigned>::max();
+constexpr unsigned neverLooked = std::numeric_limits<unsigned>::max();
 
 /// Seconds of a clock that nobody sets, read without a system call.
 unsigned secondsNow() {
@@ -63,7 +63,7 @@ void deliver(Deliver operation, const char* function, const char* file, int line
 }  // namespace
 
 void CVLogger::followConfiguration() {
-  static std::atomic<unsigned> lastLook{kNever};
+  static std::atomic<unsigned> lastLook{neverLooked};
   const unsigned now = secondsNow();
   if (lastLook.load(std::memory_order_relaxed) == now) [[likely]] {
     return;

@@ -11,7 +11,7 @@ namespace CVLog {
 namespace {
 
 // Room for the parameter list of one call, so that a text that grows value by value is moved once at most.
-constexpr std::size_t kExpectedText = 160;
+constexpr std::size_t expectedText = 160;
 
 }  // namespace
 
@@ -36,7 +36,7 @@ std::ostream& CVMessageBuffer::appendAddress(const void* address) {
 }
 
 std::ostream& CVMessageBuffer::borrowStream() {
-  text_.reserve(kExpectedText);
+  text_.reserve(expectedText);
   stream_ = &MessageStream::borrow(*this, text_);
   return *stream_;
 }

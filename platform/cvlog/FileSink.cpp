@@ -26,8 +26,8 @@ namespace {
 using Tarn::Common::FileDescriptor;
 
 // Non-blocking, or a pipe without a reader would hold the broker.
-constexpr int kAppending = O_WRONLY | O_APPEND | O_CLOEXEC | O_NOCTTY | O_NONBLOCK;
-constexpr mode_t kMode = S_IRUSR | S_IWUSR | S_IRGRP;
+constexpr int appending = O_WRONLY | O_APPEND | O_CLOEXEC | O_NOCTTY | O_NONBLOCK;
+constexpr mode_t modeOfNew = S_IRUSR | S_IWUSR | S_IRGRP;
 
 [[noreturn]] void fail(const std::string& what) {
   throw std::system_error(errno, std::generic_category(), what);
@@ -67,7 +67,7 @@ bool isSameFile(const std::optional<struct stat>& a, const std::optional<struct 
 }
 
 FileDescriptor openLog(const std::string& path) {
-  FileDescriptor file(open(path.c_str(), kAppending | O_CREAT, kMode));
+  FileDescriptor file(open(path.c_str(), appending | O_CREAT, modeOfNew));
   if (!file) {
     fail("log file " + path + " cannot be opened");
   }
@@ -81,23 +81,23 @@ FileDescriptor openLog(const std::string& path) {
 /// Opens the file of that name in the place of another, or makes it with the owner, group and mode of the other, so
 /// that who could write to that one can write to this.
 FileDescriptor openSuccessor(const std::string& path, const struct stat& predecessor) {
-  FileDescriptor next(open(path.c_str(), kAppending | O_CREAT | O_EXCL, kMode));
+  FileDescriptor next(open(path.c_str(), appending | O_CREAT | O_EXCL, modeOfNew));
   if (!next) {
-    next = FileDescriptor(open(path.c_str(), kAppending));
+    next = FileDescriptor(open(path.c_str(), appending));
     if (!next && errno == ENOENT) {  // a symbolic link that leads nowhere: O_EXCL follows none
-      next = FileDescriptor(open(path.c_str(), kAppending | O_CREAT, kMode));
+      next = FileDescriptor(open(path.c_str(), appending | O_CREAT, modeOfNew));
     }
     if (!next) {
       fail("cannot be opened again");
     }
     return next;
   }
-  constexpr uid_t kAsItIs = -1;
-  constexpr mode_t kPermissions = S_IRWXU | S_IRWXG | S_IRWXO;
+  constexpr uid_t asItIs = -1;
+  constexpr mode_t permissions = S_IRWXU | S_IRWXG | S_IRWXO;
   // Only a privileged process gives files away; the group may be one of the owner's.
   if (fchown(next.number(), predecessor.st_uid, predecessor.st_gid) == 0 ||
-      fchown(next.number(), kAsItIs, predecessor.st_gid) == 0) {
-    fchmod(next.number(), predecessor.st_mode & kPermissions);
+      fchown(next.number(), asItIs, predecessor.st_gid) == 0) {
+    fchmod(next.number(), predecessor.st_mode & permissions);
   }
   return next;
 }
@@ -165,14 +165,14 @@ void FileSink::write(const Message& message) {
     held.emplace(SIGXFSZ);
   }
   const End before = end_.load(std::memory_order_relaxed);
-  if (before != End::kOfLine && isTorn(before)) {
+  if (before != End::OfLine && isTorn(before)) {
     line.insert(line.begin(), '\n');
   }
   const std::size_t written = writeLine(file_.number(), line);
   if (written != line.size()) {
-    end_.store(written == 0 ? End::kUnknown : End::kTorn, std::memory_order_relaxed);
-  } else if (before != End::kOfLine) {
-    end_.store(End::kOfLine, std::memory_order_relaxed);
+    end_.store(written == 0 ? End::Unknown : End::Torn, std::memory_order_relaxed);
+  } else if (before != End::OfLine) {
+    end_.store(End::OfLine, std::memory_order_relaxed);
   }
 }
 
@@ -186,7 +186,7 @@ bool FileSink::isTorn(End known) const {
       return last != '\n';
     }
   }
-  return known == End::kTorn;
+  return known == End::Torn;
 }
 
 void FileSink::followName(std::size_t lineSize) {
@@ -238,7 +238,7 @@ bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
 
 bool FileSink::rotate(std::size_t lineSize) {
   // Opened anew: a lock belongs to what open(2) made, and that of file_ may be shared with a forked process.
-  const FileDescriptor locked(open(path_.c_str(), kAppending));
+  const FileDescriptor locked(open(path_.c_str(), appending));
   if (!locked) {
     fail("cannot be opened for its rotation");
   }
@@ -280,7 +280,7 @@ void FileSink::adopt(const FileDescriptor& next) {
 void FileSink::report(std::string_view why) const {
   const std::string text =
       "log file " + path_ + ' ' + std::string(why) + "; messages go to the file that is open, however large";
-  SystemLogSink().write(ownMessage(kLevelWarning, "FileSink.cpp", text));
+  SystemLogSink().write(ownMessage(levelWarning, "FileSink.cpp", text));
 }
 
 }  // namespace CVLog

@@ -54,9 +54,9 @@ class FileSink final : public Sink {
 
   /// What is known of how the file ends.
   enum class End {
-    kUnknown,  ///< it was just opened, or the disk was full, for other processes as well
-    kOfLine,
-    kTorn,  ///< in a part of a line
+    Unknown,  ///< it was just opened, or the disk was full, for other processes as well
+    OfLine,
+    Torn,  ///< in a part of a line
   };
   [[nodiscard]] bool isTorn(End known) const;
 
@@ -75,7 +75,7 @@ class FileSink final : public Sink {
   const bool isFollowed_;     // a regular file under a name of its own
   const bool mayBeTooLarge_;  // for the limit that was set when it was opened
   Identity identity_;
-  std::atomic<End> end_{End::kUnknown};
+  std::atomic<End> end_{End::Unknown};
   std::atomic_flag isBeingReplaced_;
   std::atomic<Clock::rep> retryAt_{0};  // 0: the last replacement did not fail
 };

@@ -17,17 +17,17 @@ struct NamedLevel {
   int priority;
 };
 
-constexpr std::array<NamedLevel, 4> kLevels = {{
-    {kLevelError, "error", LOG_ERR},
-    {kLevelWarning, "warning", LOG_WARNING},
-    {kLevelInfo, "info", LOG_INFO},
-    {kLevelDebug, "debug", LOG_DEBUG},
+constexpr std::array<NamedLevel, 4> levels = {{
+    {levelError, "error", LOG_ERR},
+    {levelWarning, "warning", LOG_WARNING},
+    {levelInfo, "info", LOG_INFO},
+    {levelDebug, "debug", LOG_DEBUG},
 }};
 
 const NamedLevel& named(int level) {
   const auto* found =
-      std::find_if(kLevels.begin(), kLevels.end(), [level](const NamedLevel& row) { return level >= row.level; });
-  return found == kLevels.end() ? kLevels.back() : *found;
+      std::find_if(levels.begin(), levels.end(), [level](const NamedLevel& row) { return level >= row.level; });
+  return found == levels.end() ? levels.back() : *found;
 }
 
 }  // namespace
@@ -41,7 +41,7 @@ int syslogPriority(int level) {
 }
 
 std::optional<int> parseLevel(std::string_view text) {
-  for (const NamedLevel& row : kLevels) {
+  for (const NamedLevel& row : levels) {
     if (Tarn::Common::equalIgnoringCase(text, row.name)) {
       return row.level;
     }

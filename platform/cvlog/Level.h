@@ -8,10 +8,10 @@ namespace CVLog {
 
 /// The levels with a name. Any number is a level; it has the name of the nearest named level below it,
 /// and "debug" where there is none.
-inline constexpr int kLevelDebug = 3000;
-inline constexpr int kLevelInfo = 4000;
-inline constexpr int kLevelWarning = 5000;
-inline constexpr int kLevelError = 6000;
+inline constexpr int levelDebug = 3000;
+inline constexpr int levelInfo = 4000;
+inline constexpr int levelWarning = 5000;
+inline constexpr int levelError = 6000;
 
 /// "error", "warning", "info" or "debug".
 std::string_view levelName(int level);

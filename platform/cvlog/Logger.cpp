@@ -19,18 +19,18 @@ using Tarn::Common::ConfigurationFile;
 using Tarn::Common::ConfigurationProblem;
 using Tarn::Common::environmentOverride;
 
-constexpr int kNothing = std::numeric_limits<int>::max();
+constexpr int noLevel = std::numeric_limits<int>::max();
 
 std::unique_ptr<Sink> openDestination(const SinkSettings& settings) {
   const Destination& destination = settings.destination;
   switch (destination.kind) {
-    case DestinationKind::kStandardError:
+    case DestinationKind::StandardError:
       return std::make_unique<StandardErrorSink>();
-    case DestinationKind::kSystemLog:
+    case DestinationKind::SystemLog:
       return std::make_unique<SystemLogSink>();
-    case DestinationKind::kFile:
+    case DestinationKind::File:
       return std::make_unique<FileSink>(destination.path, settings.rotation);
-    case DestinationKind::kNone:
+    case DestinationKind::None:
       break;
   }
   return nullptr;
@@ -44,7 +44,7 @@ std::unique_ptr<Sink> openSink(const SinkSettings& settings) {
   return sink;
 }
 
-constexpr std::string_view kThisFile = "Logger.cpp";
+constexpr std::string_view thisFile = "Logger.cpp";
 
 }  // namespace
 
@@ -65,8 +65,8 @@ Logger::Logger(ConfigurationFile file, std::optional<std::string> logOverride, s
 
 Logger::~Logger() {
   CVLogger::isClosed_.store(true, std::memory_order_relaxed);
-  CVLogger::logThreshold_.store(kNothing, std::memory_order_relaxed);
-  CVLogger::traceThreshold_.store(kNothing, std::memory_order_relaxed);
+  CVLogger::logThreshold_.store(noLevel, std::memory_order_relaxed);
+  CVLogger::traceThreshold_.store(noLevel, std::memory_order_relaxed);
 }
 
 void Logger::followConfiguration() {
@@ -83,7 +83,7 @@ void Logger::followConfiguration() {
 }
 
 int Logger::Route::threshold() const {
-  return sink ? level : kNothing;
+  return sink ? level : noLevel;
 }
 
 void Logger::setThresholds(const Routes& routes) {
@@ -122,13 +122,13 @@ void Logger::report(const std::vector<ConfigurationProblem>& problems) {
   const std::unique_ptr<Sink> sink = openSink(defaultLog());
   for (const ConfigurationProblem& problem : problems) {
     const std::string text = "Configuration: " + problem.where + ": " + problem.why;
-    sink->write(ownMessage(kLevelError, kThisFile, text));
+    sink->write(ownMessage(levelError, thisFile, text));
   }
 }
 
 void Logger::noteThatFileWasRead() {
   const std::string text = "Configuration: " + file_.path() + " was read again";
-  const Message message = ownMessage(kLevelInfo, kThisFile, text);
+  const Message message = ownMessage(levelInfo, thisFile, text);
   log(message);
   trace(message);
 }

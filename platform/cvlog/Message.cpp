@@ -83,11 +83,11 @@ void appendSourceAndText(std::string& line, const Message& message) {
 }
 
 // Time, level and the blanks between the fields.
-constexpr std::size_t kLineOverhead = 64;
+constexpr std::size_t lineOverhead = 64;
 
 std::string roomFor(const Message& message) {
   std::string line;
-  line.reserve(kLineOverhead + message.component.size() + message.function.size() + message.file.size() +
+  line.reserve(lineOverhead + message.component.size() + message.function.size() + message.file.size() +
                message.text.size());
   return line;
 }

@@ -38,7 +38,7 @@ void RateLimitedSink::write(const Message& message) {
 void RateLimitedSink::noteDropped(system_clock::time_point time, unsigned count) {
   const std::string text = std::to_string(count) + (count == 1 ? " message was" : " messages were") +
                            " dropped; the limit is " + std::to_string(perMinute_) + " a minute";
-  target_->write(ownMessage(kLevelWarning, "RateLimitedSink.cpp", text, time));
+  target_->write(ownMessage(levelWarning, "RateLimitedSink.cpp", text, time));
 }
 
 RateLimitedSink::Verdict RateLimitedSink::judge(system_clock::time_point time) {

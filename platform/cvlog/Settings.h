@@ -12,24 +12,24 @@
 
 namespace CVLog {
 
-enum class DestinationKind { kNone, kStandardError, kSystemLog, kFile };
+enum class DestinationKind { None, StandardError, SystemLog, File };
 
 struct Destination {
-  DestinationKind kind = DestinationKind::kNone;
+  DestinationKind kind = DestinationKind::None;
   std::string path;  ///< of a file
 
   friend bool operator==(const Destination&, const Destination&) = default;
 };
 
 // A forgotten trace must not fill a disk: 80 MiB at most, with the defaults.
-inline constexpr Rotation kDefaultRotation = {.size = std::uint64_t{16} << 20U, .keep = 4};
+inline constexpr Rotation defaultRotation = {.size = std::uint64_t{16} << 20U, .keep = 4};
 
 /// What one sink takes and where it goes.
 struct SinkSettings {
-  int level = kLevelDebug;  ///< the lowest level that is taken
+  int level = levelDebug;  ///< the lowest level that is taken
   Destination destination;
-  unsigned perMinute = 0;                ///< messages; 0 is no limit
-  Rotation rotation = kDefaultRotation;  ///< of a file
+  unsigned perMinute = 0;               ///< messages; 0 is no limit
+  Rotation rotation = defaultRotation;  ///< of a file
 
   /// The level stands in front of the sink: another one needs no other sink.
   bool differsOnlyInLevel(SinkSettings other) const {
@@ -41,11 +41,11 @@ struct SinkSettings {
 };
 
 // The system log belongs to the whole machine; a provider that fails all the time must not fill it.
-inline constexpr unsigned kSystemLogPerMinute = 60;
+inline constexpr unsigned systemLogPerMinute = 60;
 
 /// Errors go to the system log.
 inline SinkSettings defaultLog() {
-  return {.level = kLevelError, .destination = {DestinationKind::kSystemLog, {}}, .perMinute = kSystemLogPerMinute};
+  return {.level = levelError, .destination = {DestinationKind::SystemLog, {}}, .perMinute = systemLogPerMinute};
 }
 /// Nothing is traced; a trace that only has a destination takes everything.
 inline SinkSettings defaultTrace() {

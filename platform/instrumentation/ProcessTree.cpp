@@ -24,7 +24,7 @@ constinit std::shared_ptr<const Tree> current;
 void reportOnce(const std::string& text) {
   static std::string reported;
   if (std::exchange(reported, text) != text) {
-    Common::report({"Corvane.Inventory", "ProcessTree.cpp"}, CVLog::kLevelError, text);
+    Common::report({"Corvane.Inventory", "ProcessTree.cpp"}, CVLog::levelError, text);
   }
 }
 

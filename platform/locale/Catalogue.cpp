@@ -5,7 +5,7 @@
 namespace Tarn::Locale {
 namespace {
 
-constexpr std::wstring_view kLastLanguage = L"en";
+constexpr std::wstring_view lastLanguage = L"en";
 
 /// Where the shorter id is not the next best language. Chinese is written in two scripts, and a reader of one is not
 /// served by the other; without a script or region the simplified one is meant.
@@ -13,14 +13,14 @@ struct Parent {
   std::wstring_view language;
   std::wstring_view parent;
 };
-constexpr Parent kParents[] = {
+constexpr Parent parents[] = {
     {L"zh", L"zh_CN"}, {L"zh_CN", L""}, {L"zh_HK", L""}, {L"zh_Hant", L""}, {L"zh_MO", L""}, {L"zh_TW", L""},
 };
 
 std::wstring_view parentOf(std::wstring_view language) {
-  const auto* exception = std::find_if(std::begin(kParents), std::end(kParents),
-                                       [&](const Parent& row) { return row.language == language; });
-  if (exception != std::end(kParents)) {
+  const auto* exception =
+      std::find_if(std::begin(parents), std::end(parents), [&](const Parent& row) { return row.language == language; });
+  if (exception != std::end(parents)) {
     return exception->parent;
   }
   const std::size_t end = language.rfind(L'_');
@@ -57,7 +57,7 @@ std::optional<std::wstring_view> findMessage(int number, std::wstring_view langu
       return text;
     }
   }
-  return findHere(number, kLastLanguage, id);
+  return findHere(number, lastLanguage, id);
 }
 
 }  // namespace Tarn::Locale

@@ -18,7 +18,7 @@ bool isLetterOrDigit(char c) {
 
 // By the registry of language tags: a language has two or three letters, a script four, a region two
 // letters or three digits; anything else of up to eight characters is a variant.
-constexpr std::size_t kLongestPart = 8;
+constexpr std::size_t longestPart = 8;
 
 /// One subtag in its usual case: language "de", region "AT", script "Hant", variant "valencia".
 std::string normalizedPart(std::string_view part, bool isFirst) {
@@ -36,7 +36,7 @@ bool isPart(std::string_view part, bool isFirst) {
   if (isFirst) {
     return (part.size() == 2 || part.size() == 3) && std::all_of(part.begin(), part.end(), isLetter);
   }
-  return !part.empty() && part.size() <= kLongestPart && std::all_of(part.begin(), part.end(), isLetterOrDigit);
+  return !part.empty() && part.size() <= longestPart && std::all_of(part.begin(), part.end(), isLetterOrDigit);
 }
 
 }  // namespace

@@ -19,12 +19,12 @@ namespace {
 using Common::Setting;
 
 // The language where no other is asked for.
-constexpr std::string_view kDefaultLanguage = "en";
+constexpr std::string_view defaultLanguage = "en";
 
 std::optional<Setting> wantedLanguage() {
-  constexpr const char* kOverride = "CORVANE_LANGUAGE";
-  if (const auto value = Common::environmentOverride(kOverride)) {
-    return Setting{*value, kOverride};
+  constexpr const char* variable = "CORVANE_LANGUAGE";
+  if (const auto value = Common::environmentOverride(variable)) {
+    return Setting{*value, variable};
   }
   if (const Setting* setting = Common::configuration().find("language")) {
     return *setting;
@@ -33,7 +33,7 @@ std::optional<Setting> wantedLanguage() {
 }
 
 void reportUnknown(const Setting& setting) {
-  Common::report({"Corvane.Locale", "Locale.cpp"}, CVLog::kLevelError,
+  Common::report({"Corvane.Locale", "Locale.cpp"}, CVLog::levelError,
                  "Configuration: " + setting.where + ": \"" + setting.value +
                      "\" does not count: expected a language id such as de or de_AT");
 }
@@ -46,7 +46,7 @@ std::string languageOfThisProcess() {
     }
     reportUnknown(*wanted);
   }
-  return std::string(kDefaultLanguage);
+  return std::string(defaultLanguage);
 }
 
 }  // namespace
@@ -58,13 +58,13 @@ std::string getLanguageId() {
 
 std::wstring getResourceLibrary(int number, const std::string& languageId) {
   const std::string language = normalizedLanguageId(languageId);
-  const std::string_view wanted = language.empty() ? kDefaultLanguage : language;
+  const std::string_view wanted = language.empty() ? defaultLanguage : language;
   std::array<char, std::numeric_limits<int>::digits10 + 2> digits{};
   const auto [end, error] = std::to_chars(digits.data(), digits.data() + digits.size(), number);
 
   std::wstring library;
   library.reserve(digits.size() + 1 + wanted.size());
-  library.append(digits.data(), end).append(1, kLibrarySeparator).append(wanted.begin(), wanted.end());
+  library.append(digits.data(), end).append(1, librarySeparator).append(wanted.begin(), wanted.end());
   return library;
 }
 

@@ -4,7 +4,7 @@
 namespace Tarn::Locale {
 
 /// Between number and language in what getResourceLibrary returns, as in L"2/de_AT".
-inline constexpr wchar_t kLibrarySeparator = L'/';
+inline constexpr wchar_t librarySeparator = L'/';
 
 }  // namespace Tarn::Locale
 

@@ -26,7 +26,7 @@ std::optional<int> parseNumber(std::wstring_view digits) {
 }
 
 std::optional<std::wstring_view> find(std::wstring_view library, std::wstring_view messageId) {
-  const std::size_t separator = library.find(Locale::kLibrarySeparator);
+  const std::size_t separator = library.find(Locale::librarySeparator);
   const std::optional<int> number = parseNumber(library.substr(0, separator));
   if (!number || separator == std::wstring_view::npos) {
     return std::nullopt;

@@ -40,7 +40,7 @@ class ReadAgain : public testing::Test {
 
   const std::string directory_ = testing::TempDir() + "read_again_" + std::to_string(getpid());
   const std::string path_ = directory_ + "/corvane.conf";
-  ConfigurationFile file_{path_, ConfigurationFile::Absence::kIsFine};
+  ConfigurationFile file_{path_, ConfigurationFile::Absence::IsFine};
 };
 
 TEST_F(ReadAgain, HasNotChangedWhileNobodyTouchesIt) {
@@ -89,7 +89,7 @@ TEST_F(ReadAgain, HasChangedWhenItWasRemovedAndWhenItIsBack) {
 TEST_F(ReadAgain, IsMissedOnlyWhereItMustBeThere) {
   std::filesystem::remove(path_);
   EXPECT_THAT(file_.read().problems(), IsEmpty());
-  ConfigurationFile needed(path_, ConfigurationFile::Absence::kIsAProblem);
+  ConfigurationFile needed(path_, ConfigurationFile::Absence::IsAProblem);
   EXPECT_THAT(needed.read().problems(), SizeIs(1));
 }
 

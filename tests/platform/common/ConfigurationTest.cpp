@@ -25,7 +25,7 @@ void expectSetting(const Configuration& configuration, std::string_view key, std
   EXPECT_EQ(setting->where, where);
 }
 
-constexpr const char* kKnownKeys =
+constexpr const char* knownKeys =
     "(known keys: inventory, language, log.destination, log.keep, log.level, log.rate, log.size, trace.destination, "
     "trace.keep, trace.level, trace.rate, trace.size)";
 
@@ -58,8 +58,8 @@ TEST(Configuration, NamesEveryLineThatDoesNotCount) {
           ConfigurationProblem{"corvane.conf:1", "expected \"key = value\" but there is no \"=\"; the line is ignored"},
           ConfigurationProblem{"corvane.conf:2", std::string("unknown key \"log.levle\"; the line is "
                                                              "ignored ") +
-                                                     kKnownKeys},
-          ConfigurationProblem{"corvane.conf:3", std::string("unknown key \"\"; the line is ignored ") + kKnownKeys}));
+                                                     knownKeys},
+          ConfigurationProblem{"corvane.conf:3", std::string("unknown key \"\"; the line is ignored ") + knownKeys}));
   expectSetting(configuration, "language", "", "corvane.conf:4");
 }
 

@@ -52,8 +52,8 @@ TEST(EnvironmentOverride, IsNothingInAProcessWithRaisedPrivileges) {
   const std::string command = program + " CORVANE_LANGUAGE";
   EXPECT_EQ(outputOf(command), "de_AT\n");
 
-  constexpr uid_t kNobody = 65534;
-  ASSERT_EQ(chown(program.c_str(), kNobody, kNobody), 0);
+  constexpr uid_t nobody = 65534;
+  ASSERT_EQ(chown(program.c_str(), nobody, nobody), 0);
   ASSERT_EQ(chmod(program.c_str(), S_ISUID | 0755), 0);
   EXPECT_EQ(outputOf(command), "(none)\n");
   std::filesystem::remove_all(directory);

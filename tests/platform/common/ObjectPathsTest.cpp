@@ -99,8 +99,8 @@ TEST_F(ObjectPaths, CompareIntegersByValueWhateverTheirType) {
 }
 
 TEST_F(ObjectPaths, DoNotTakeALargeNumberForANegativeOne) {
-  constexpr CMPIUint64 kLargest = std::numeric_limits<CMPIUint64>::max();
-  EXPECT_FALSE(equal(withKey(CMPI_uint64, {.uint64 = kLargest}), withKey(CMPI_sint64, {.sint64 = -1})));
+  constexpr CMPIUint64 largest = std::numeric_limits<CMPIUint64>::max();
+  EXPECT_FALSE(equal(withKey(CMPI_uint64, {.uint64 = largest}), withKey(CMPI_sint64, {.sint64 = -1})));
   EXPECT_FALSE(equal(withKey(CMPI_uint8, {.uint8 = 255}), withKey(CMPI_sint8, {.sint8 = -1})));
   EXPECT_FALSE(equal(withKey(CMPI_uint16, {.uint16 = 256}), withKey(CMPI_uint8, {.uint8 = 0})));
 }

@@ -10,7 +10,7 @@ void setStatus(CMPIStatus* status, CMPIrc code) {
 
 }  // namespace
 
-const CMPIStringFT PathBroker::kStringTable = [] {
+const CMPIStringFT PathBroker::stringTable = [] {
   CMPIStringFT table{};
   table.ftVersion = CMPI_VERSION;
   table.getCharPtr = [](const CMPIString* string, CMPIStatus* status) {
@@ -20,7 +20,7 @@ const CMPIStringFT PathBroker::kStringTable = [] {
   return table;
 }();
 
-const CMPIDateTimeFT PathBroker::kDateTimeTable = [] {
+const CMPIDateTimeFT PathBroker::dateTimeTable = [] {
   CMPIDateTimeFT table{};
   table.ftVersion = CMPI_VERSION;
   table.getBinaryFormat = [](const CMPIDateTime* dateTime, CMPIStatus* status) {
@@ -34,7 +34,7 @@ const CMPIDateTimeFT PathBroker::kDateTimeTable = [] {
   return table;
 }();
 
-const CMPIObjectPathFT PathBroker::kPathTable = [] {
+const CMPIObjectPathFT PathBroker::pathTable = [] {
   CMPIObjectPathFT table{};
   table.ftVersion = CMPI_VERSION;
   table.getClassName = [](const CMPIObjectPath* path, CMPIStatus* status) {
@@ -64,18 +64,18 @@ const CMPIObjectPathFT PathBroker::kPathTable = [] {
 
 CMPIString* PathBroker::string(std::string_view text) {
   String& made = strings_.emplace_back(String{std::string(text), {}});
-  made.handle = {made.text.data(), &kStringTable};
+  made.handle = {made.text.data(), &stringTable};
   return &made.handle;
 }
 
 CMPIDateTime* PathBroker::dateTime(CMPIUint64 microseconds, bool isInterval) {
   DateTime& made = dateTimes_.emplace_back(DateTime{microseconds, isInterval, {}});
-  made.handle = {&made, &kDateTimeTable};
+  made.handle = {&made, &dateTimeTable};
   return &made.handle;
 }
 
 PathBroker::Path::Path(PathBroker& broker, std::string_view className)
-    : broker_(broker), className_(broker.string(className)), handle_{this, &kPathTable} {}
+    : broker_(broker), className_(broker.string(className)), handle_{this, &pathTable} {}
 
 PathBroker::Path& PathBroker::Path::in(std::string_view nameSpace) {
   nameSpace_ = broker_.string(nameSpace);

@@ -69,9 +69,9 @@ class PathBroker {
   static const Path& of(const CMPIObjectPath* path) { return *static_cast<const Path*>(path->hdl); }
   static const DateTime& of(const CMPIDateTime* dateTime) { return *static_cast<const DateTime*>(dateTime->hdl); }
 
-  static const CMPIStringFT kStringTable;
-  static const CMPIDateTimeFT kDateTimeTable;
-  static const CMPIObjectPathFT kPathTable;
+  static const CMPIStringFT stringTable;
+  static const CMPIDateTimeFT dateTimeTable;
+  static const CMPIObjectPathFT pathTable;
 
   std::deque<Path> paths_;
   std::deque<String> strings_;

@@ -111,9 +111,9 @@ class FullDisk {
 
 class TornLogFile : public LogDirectory {
  protected:
-  static constexpr std::size_t kPart = 7;
+  static constexpr std::size_t partSize = 7;
 
-  static std::string part(std::string_view text) { return line(text).substr(0, kPart); }
+  static std::string part(std::string_view text) { return line(text).substr(0, partSize); }
 
   /// Writes "a", and of "torn" as much as there is room for.
   void tear(FileSink& sink) const {
@@ -121,7 +121,7 @@ class TornLogFile : public LogDirectory {
     sink.write(message("torn"));
     ASSERT_EQ(content("log"), line("a") + part("torn"));
   }
-  static std::size_t room() { return line("a").size() + kPart; }
+  static std::size_t room() { return line("a").size() + partSize; }
 };
 
 TEST_F(TornLogFile, GoesOnWithALineOfItsOwn) {

@@ -26,13 +26,13 @@ using testing::IsEmpty;
 using testing::MatchesRegex;
 using testing::SizeIs;
 
-constexpr const char* kReadAgain = " was read again\n";
+constexpr const char* readAgain = " was read again\n";
 
 /// A logger that is told when to look at its file.
 class FollowingLogger : public LoggerProcess {
  protected:
   CVLog::Logger makeLogger(const std::optional<std::string>& logOverride = std::nullopt) {
-    return {{path("corvane.conf"), Tarn::Common::ConfigurationFile::Absence::kIsFine}, logOverride, std::nullopt};
+    return {{path("corvane.conf"), Tarn::Common::ConfigurationFile::Absence::IsFine}, logOverride, std::nullopt};
   }
 
   static CVLog::Message message(int level, std::string_view text) {
@@ -93,7 +93,7 @@ TEST_F(FollowingLogger, KeepsTheFileThatIsOpenWhereOnlyTheLevelChanges) {
   reconfigure(to("log") + "log.level = info\n");
   logger.followConfiguration();
   EXPECT_TRUE(CVLogger::logTakes(4000));
-  EXPECT_THAT(content("moved"), EndsWith(kReadAgain));
+  EXPECT_THAT(content("moved"), EndsWith(readAgain));
 }
 
 TEST_F(FollowingLogger, SaysThatItHasReadItsFileAgain) {
@@ -104,7 +104,7 @@ TEST_F(FollowingLogger, SaysThatItHasReadItsFileAgain) {
   logger.followConfiguration();
   EXPECT_THAT(content("log"),
               MatchesRegex("TIME info Corvane.Logger noteThatFileWasRead Logger.cpp:[0-9]+ Configuration: " +
-                           path("corvane.conf") + kReadAgain));
+                           path("corvane.conf") + readAgain));
 }
 
 TEST_F(FollowingLogger, DoesWhatItDoesByDefaultWithoutItsFile) {
@@ -185,16 +185,16 @@ TEST_F(FollowingLogger, LeavesNoFileOpenThatItDoesNotUseAnyMore) {
 }
 
 TEST_F(FollowingLogger, LosesNoMessageOfAThreadThatLogsMeanwhile) {
-  constexpr std::size_t kThreads = 3;
-  constexpr std::size_t kMessages = 2000;
+  constexpr std::size_t threadCount = 3;
+  constexpr std::size_t messageCount = 2000;
   configure(to("a"));
   CVLog::Logger logger = makeLogger();
-  std::atomic<std::size_t> running = kThreads;
+  std::atomic<std::size_t> running = threadCount;
   std::vector<std::thread> threads;
-  threads.reserve(kThreads);
-  for (std::size_t number = 0; number < kThreads; ++number) {
+  threads.reserve(threadCount);
+  for (std::size_t number = 0; number < threadCount; ++number) {
     threads.emplace_back([&] {
-      for (std::size_t count = 0; count < kMessages; ++count) {
+      for (std::size_t count = 0; count < messageCount; ++count) {
         logger.log(message(6000, "one"));
       }
       --running;
@@ -210,7 +210,7 @@ TEST_F(FollowingLogger, LosesNoMessageOfAThreadThatLogsMeanwhile) {
     thread.join();
   }
   const std::string all = content("a") + content("b");
-  EXPECT_EQ(all.size(), kThreads * kMessages * line("one").size());
+  EXPECT_EQ(all.size(), threadCount * messageCount * line("one").size());
   EXPECT_THAT(content("b"), Not(IsEmpty()));
 }
 
@@ -222,7 +222,7 @@ TEST_F(FollowingProcess, NoticesWithTheFirstMessageOfALaterSecondThoughNobodyWan
   reconfigure("log.level = debug\nlog.destination = file:" + path("log") + "\n");
   std::this_thread::sleep_for(std::chrono::milliseconds(1100));
   log(4000, "kept");
-  EXPECT_THAT(content("log"), EndsWith(kReadAgain + std::string("TIME info Corvane.Test function file.cpp:12 kept\n")));
+  EXPECT_THAT(content("log"), EndsWith(readAgain + std::string("TIME info Corvane.Test function file.cpp:12 kept\n")));
 }
 
 TEST_F(FollowingProcess, LooksOnlyOnceASecond) {

@@ -17,15 +17,15 @@ using CVLog::CVMessageBuffer;
 using LoggerInThreads = LoggerProcess;
 
 TEST_F(LoggerInThreads, FirstMessagesOfManyThreadsAllArriveWhole) {
-  constexpr int kThreads = 16;
-  constexpr int kMessages = 200;
+  constexpr int threadCount = 16;
+  constexpr int messageCount = 200;
   setenv("CORVANE_LOG", ("debug:file:" + path("log")).c_str(), 1);
-  std::latch start(kThreads);
+  std::latch start(threadCount);
   std::vector<std::thread> threads;
-  for (int number = 0; number < kThreads; ++number) {
+  for (int number = 0; number < threadCount; ++number) {
     threads.emplace_back([number, &start] {
       start.arrive_and_wait();
-      for (int message = 0; message < kMessages; ++message) {
+      for (int message = 0; message < messageCount; ++message) {
         CVMessageBuffer buffer;
         buffer << "thread " << number << " message " << message;
         log(3000, CVMessageBuffer::str(buffer));
@@ -38,8 +38,8 @@ TEST_F(LoggerInThreads, FirstMessagesOfManyThreadsAllArriveWhole) {
   }
 
   std::multiset<std::string> expected;
-  for (int number = 0; number < kThreads; ++number) {
-    for (int message = 0; message < kMessages; ++message) {
+  for (int number = 0; number < threadCount; ++number) {
+    for (int message = 0; message < messageCount; ++message) {
       expected.insert("TIME debug Corvane.Test function file.cpp:12 thread " + std::to_string(number) + " message " +
                       std::to_string(message));
     }

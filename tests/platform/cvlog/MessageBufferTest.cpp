@@ -107,9 +107,9 @@ TEST(MessageBuffer, PrintsNumbersAsTheStandardStreamDoes) {
 }
 
 TEST(MessageBuffer, PrintsEnumeratorsViewsAndBitsOfVectors) {
-  enum Code { kCode = 24 };
+  enum Code { code = 24 };
   CVMessageBuffer buffer;
-  buffer << kCode;
+  buffer << code;
   EXPECT_EQ(CVMessageBuffer::str(buffer), "24");
   buffer << std::string_view("view");
   EXPECT_EQ(CVMessageBuffer::str(buffer), "view");
@@ -219,13 +219,13 @@ TEST(MessageBuffer, YieldsNothingForAStreamThatIsNotItsOwn) {
 }
 
 TEST(MessageBuffer, ThreadsDoNotMixTheirTexts) {
-  constexpr int kThreads = 8;
-  constexpr int kRounds = 2000;
-  std::vector<int> wrong(kThreads, 0);
+  constexpr int threadCount = 8;
+  constexpr int roundCount = 2000;
+  std::vector<int> wrong(threadCount, 0);
   std::vector<std::thread> threads;
-  for (int number = 0; number < kThreads; ++number) {
+  for (int number = 0; number < threadCount; ++number) {
     threads.emplace_back([number, &wrong] {
-      for (int round = 0; round < kRounds; ++round) {
+      for (int round = 0; round < roundCount; ++round) {
         CVMessageBuffer outer;
         CVMessageBuffer inner;
         outer << "thread " << number << " round " << round;
@@ -240,7 +240,7 @@ TEST(MessageBuffer, ThreadsDoNotMixTheirTexts) {
   for (std::thread& thread : threads) {
     thread.join();
   }
-  EXPECT_EQ(wrong, std::vector<int>(kThreads, 0));
+  EXPECT_EQ(wrong, std::vector<int>(threadCount, 0));
 }
 
 }  // namespace

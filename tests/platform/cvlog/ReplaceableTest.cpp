@@ -87,15 +87,15 @@ TEST_F(ReplaceableValue, GoesWithItsOwner) {
 
 // What is freed too early shows itself to the address sanitizer and, mostly, in the value.
 TEST_F(ReplaceableValue, IsWholeForEveryThreadWhileItIsReplaced) {
-  constexpr int kLast = 20'000;
+  constexpr int lastValue = 20'000;
   Replaceable<std::vector<int>> replaceable(std::make_unique<std::vector<int>>(8, 0));
   std::atomic<bool> isBroken = false;
-  constexpr int kUsers = 3;
+  constexpr int userCount = 3;
   std::vector<std::thread> users;
-  users.reserve(kUsers);
-  for (int number = 0; number < kUsers; ++number) {
+  users.reserve(userCount);
+  for (int number = 0; number < userCount; ++number) {
     users.emplace_back([&] {
-      for (int value = 0; value != kLast;) {
+      for (int value = 0; value != lastValue;) {
         replaceable.with([&](const std::vector<int>& values) {
           isBroken = isBroken || values != std::vector<int>(8, values.front()) || values.front() < value;
           value = values.front();
@@ -103,7 +103,7 @@ TEST_F(ReplaceableValue, IsWholeForEveryThreadWhileItIsReplaced) {
       }
     });
   }
-  for (int value = 1; value <= kLast; ++value) {
+  for (int value = 1; value <= lastValue; ++value) {
     replaceable.replace(std::make_unique<std::vector<int>>(8, value));
     replaceable.discardUnused();
   }

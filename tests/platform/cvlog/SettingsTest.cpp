@@ -11,10 +11,10 @@
 namespace {
 
 using CVLog::defaultLog;
+using CVLog::defaultRotation;
 using CVLog::defaultTrace;
 using CVLog::Destination;
 using CVLog::DestinationKind;
-using CVLog::kDefaultRotation;
 using CVLog::makeSettings;
 using CVLog::parseDestination;
 using CVLog::Rotation;
@@ -26,7 +26,7 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::SizeIs;
 
-const Destination kFileX = {DestinationKind::kFile, "/x:y"};
+const Destination fileX = {DestinationKind::File, "/x:y"};
 
 Settings fromFile(const std::string& text) {
   return makeSettings(Configuration::parse(text, "corvane.conf"), std::nullopt, std::nullopt);
@@ -35,8 +35,8 @@ Settings fromFile(const std::string& text) {
 TEST(LogSettings, SendErrorsToTheSystemLogByDefault) {
   const Settings settings = fromFile("");
   EXPECT_EQ(settings.log,
-            (SinkSettings{.level = 6000, .destination = {DestinationKind::kSystemLog, {}}, .perMinute = 60}));
-  EXPECT_EQ(settings.trace, (SinkSettings{.level = 3000, .destination = {DestinationKind::kNone, {}}, .perMinute = 0}));
+            (SinkSettings{.level = 6000, .destination = {DestinationKind::SystemLog, {}}, .perMinute = 60}));
+  EXPECT_EQ(settings.trace, (SinkSettings{.level = 3000, .destination = {DestinationKind::None, {}}, .perMinute = 0}));
   EXPECT_THAT(settings.problems, IsEmpty());
 }
 
@@ -44,9 +44,9 @@ TEST(LogSettings, ComeFromTheFile) {
   const Settings settings = fromFile(
       "log.level = warning\nlog.destination = file:/x:y\nlog.rate = 5\n"
       "trace.level = 4000\ntrace.destination = stderr\n");
-  EXPECT_EQ(settings.log, (SinkSettings{.level = 5000, .destination = kFileX, .perMinute = 5}));
+  EXPECT_EQ(settings.log, (SinkSettings{.level = 5000, .destination = fileX, .perMinute = 5}));
   EXPECT_EQ(settings.trace,
-            (SinkSettings{.level = 4000, .destination = {DestinationKind::kStandardError, {}}, .perMinute = 0}));
+            (SinkSettings{.level = 4000, .destination = {DestinationKind::StandardError, {}}, .perMinute = 0}));
   EXPECT_THAT(settings.problems, IsEmpty());
 }
 
@@ -79,7 +79,7 @@ TEST(LogSettings, HaveSizesInBytesAndTheirMultiples) {
   for (const char* broken : {"", "K", "4095", "3K", "-1", "+4096", "4 K", "4KB", "1T", "1.5M", "8589934592G",
                              "9223372036854775808", "99999999999999999999"}) {
     const Settings settings = fromFile("log.size = " + std::string(broken) + "\n");
-    EXPECT_EQ(settings.log.rotation, kDefaultRotation) << broken;
+    EXPECT_EQ(settings.log.rotation, defaultRotation) << broken;
     EXPECT_THAT(settings.problems, SizeIs(1)) << broken;
   }
 }
@@ -101,8 +101,8 @@ TEST(LogSettings, OverridesComeBeforeTheFile) {
   const Configuration file = Configuration::parse("log.level = info\nlog.destination = none\n", "corvane.conf");
   const Settings settings = makeSettings(file, "debug:stderr", "6000:file:/x:y");
   EXPECT_EQ(settings.log,
-            (SinkSettings{.level = 3000, .destination = {DestinationKind::kStandardError, {}}, .perMinute = 0}));
-  EXPECT_EQ(settings.trace, (SinkSettings{.level = 6000, .destination = kFileX, .perMinute = 0}));
+            (SinkSettings{.level = 3000, .destination = {DestinationKind::StandardError, {}}, .perMinute = 0}));
+  EXPECT_EQ(settings.trace, (SinkSettings{.level = 6000, .destination = fileX, .perMinute = 0}));
   EXPECT_THAT(settings.problems, IsEmpty());
 }
 
@@ -145,10 +145,10 @@ TEST(LogSettings, ProblemsOfTheFileAreKept) {
 }
 
 TEST(LogSettings, DestinationsAreTheseAndNoOthers) {
-  EXPECT_EQ(parseDestination("none"), (Destination{DestinationKind::kNone, {}}));
-  EXPECT_EQ(parseDestination("stderr"), (Destination{DestinationKind::kStandardError, {}}));
-  EXPECT_EQ(parseDestination("syslog"), (Destination{DestinationKind::kSystemLog, {}}));
-  EXPECT_EQ(parseDestination("file:/x:y"), kFileX);
+  EXPECT_EQ(parseDestination("none"), (Destination{DestinationKind::None, {}}));
+  EXPECT_EQ(parseDestination("stderr"), (Destination{DestinationKind::StandardError, {}}));
+  EXPECT_EQ(parseDestination("syslog"), (Destination{DestinationKind::SystemLog, {}}));
+  EXPECT_EQ(parseDestination("file:/x:y"), fileX);
   for (const char* text : {"", "stdout", "None", "file", "file:", "/x"}) {
     EXPECT_EQ(parseDestination(text), std::nullopt) << text;
   }

@@ -17,10 +17,10 @@ namespace {
 using CVLog::FileSink;
 using CVLog::Rotation;
 
-constexpr int kWriters = 6;
-constexpr int kMessages = 400;
+constexpr int writerCount = 6;
+constexpr int messageCount = 400;
 // Some ten lines in a file, and room for all files.
-constexpr Rotation kSmallFiles = {.size = 1000, .keep = 999};
+constexpr Rotation smallFiles = {.size = 1000, .keep = 999};
 
 class SharedLogFile : public LogDirectory {
  protected:
@@ -28,7 +28,7 @@ class SharedLogFile : public LogDirectory {
     return "writer " + std::to_string(writer) + " message " + std::to_string(number);
   }
   static void writeAll(FileSink& sink, int writer) {
-    for (int number = 0; number < kMessages; ++number) {
+    for (int number = 0; number < messageCount; ++number) {
       sink.write(message(textOf(writer, number)));
     }
   }
@@ -46,8 +46,8 @@ class SharedLogFile : public LogDirectory {
   }
   static std::map<std::string, int> everyLineOnce() {
     std::map<std::string, int> counts;
-    for (int writer = 0; writer < kWriters; ++writer) {
-      for (int number = 0; number < kMessages; ++number) {
+    for (int writer = 0; writer < writerCount; ++writer) {
+      for (int number = 0; number < messageCount; ++number) {
         counts[line(textOf(writer, number))] = 1;
       }
     }
@@ -57,11 +57,11 @@ class SharedLogFile : public LogDirectory {
 
 TEST_F(SharedLogFile, LosesNoLineOfManyProcessesWhileItIsRotated) {
   std::vector<pid_t> children;
-  for (int writer = 0; writer < kWriters; ++writer) {
+  for (int writer = 0; writer < writerCount; ++writer) {
     const pid_t child = fork();
     ASSERT_GE(child, 0);
     if (child == 0) {
-      FileSink sink(path("log"), kSmallFiles);
+      FileSink sink(path("log"), smallFiles);
       writeAll(sink, writer);
       _exit(0);
     }
@@ -77,9 +77,9 @@ TEST_F(SharedLogFile, LosesNoLineOfManyProcessesWhileItIsRotated) {
 }
 
 TEST_F(SharedLogFile, LosesNoLineOfProcessesThatShareWhatWasOpenBeforeTheFork) {
-  FileSink sink(path("log"), kSmallFiles);
+  FileSink sink(path("log"), smallFiles);
   std::vector<pid_t> children;
-  for (int writer = 1; writer < kWriters; ++writer) {
+  for (int writer = 1; writer < writerCount; ++writer) {
     const pid_t child = fork();
     ASSERT_GE(child, 0);
     if (child == 0) {
@@ -97,10 +97,10 @@ TEST_F(SharedLogFile, LosesNoLineOfProcessesThatShareWhatWasOpenBeforeTheFork) {
 }
 
 TEST_F(SharedLogFile, LosesNoLineOfManyThreadsWhileItIsRotated) {
-  FileSink sink(path("log"), kSmallFiles);
+  FileSink sink(path("log"), smallFiles);
   std::vector<std::thread> threads;
-  threads.reserve(kWriters);
-  for (int writer = 0; writer < kWriters; ++writer) {
+  threads.reserve(writerCount);
+  for (int writer = 0; writer < writerCount; ++writer) {
     threads.emplace_back([&sink, writer] { writeAll(sink, writer); });
   }
   for (std::thread& thread : threads) {

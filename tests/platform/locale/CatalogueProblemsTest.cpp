@@ -10,19 +10,19 @@ namespace {
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-const std::string kHeader =
+const std::string header =
     "msgid \"\"\nmsgstr \"\"\n\"Language: fr\\n\"\n\"MIME-Version: 1.0\\n\"\n\"Content-Type: text/plain; charset=UTF-8\\n\"\n"
     "\"Content-Transfer-Encoding: 8bit\\n\"\n";
-const PoFile kEnglish = parsePoFile("msgid \"A\"\nmsgstr \"all %s\"\nmsgid \"B\"\nmsgstr \"both\"\n");
+const PoFile english = parsePoFile("msgid \"A\"\nmsgstr \"all %s\"\nmsgid \"B\"\nmsgstr \"both\"\n");
 
 std::vector<std::string> problemsOfFrench(const std::string& entries) {
-  return problemsOf(parsePoFile(kHeader + entries), "fr", kEnglish);
+  return problemsOf(parsePoFile(header + entries), "fr", english);
 }
 
-constexpr const char* kGoodB = "#. both\nmsgid \"B\"\nmsgstr \"deux\"\n";
+constexpr const char* goodB = "#. both\nmsgid \"B\"\nmsgstr \"deux\"\n";
 
 TEST(CatalogueProblems, AreNoneInACompleteCatalogue) {
-  EXPECT_THAT(problemsOfFrench(std::string("#. all %s\nmsgid \"A\"\nmsgstr \"\"\n\"tout \"\n\"%s\"\n") + kGoodB),
+  EXPECT_THAT(problemsOfFrench(std::string("#. all %s\nmsgid \"A\"\nmsgstr \"\"\n\"tout \"\n\"%s\"\n") + goodB),
               IsEmpty());
 }
 
@@ -32,21 +32,21 @@ TEST(CatalogueProblems, AreTextsThatAreMissingOrUnknown) {
 }
 
 TEST(CatalogueProblems, AreTextsThatOccurTwice) {
-  EXPECT_THAT(problemsOfFrench(std::string("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + kGoodB + kGoodB),
+  EXPECT_THAT(problemsOfFrench(std::string("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + goodB + goodB),
               ElementsAre("B in line 14 occurs twice"));
 }
 
 TEST(CatalogueProblems, AreTextsThatSayNothingOrAreUnsure) {
   EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n#. both\nmsgid \"B\"\nmsgstr \"\"\n"),
               ElementsAre("B in line 11 has no text"));
-  EXPECT_THAT(problemsOfFrench(std::string("#, fuzzy\n#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + kGoodB),
+  EXPECT_THAT(problemsOfFrench(std::string("#, fuzzy\n#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + goodB),
               ElementsAre("A in line 9 is marked fuzzy"));
 }
 
 TEST(CatalogueProblems, AreTranslationsOfAnEnglishTextThatHasChangedSince) {
-  EXPECT_THAT(problemsOfFrench(std::string("#. every %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + kGoodB),
+  EXPECT_THAT(problemsOfFrench(std::string("#. every %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + goodB),
               ElementsAre("A in line 8 does not quote the present English text as its note"));
-  EXPECT_THAT(problemsOfFrench(std::string("msgid \"A\"\nmsgstr \"tout %s\"\n") + kGoodB),
+  EXPECT_THAT(problemsOfFrench(std::string("msgid \"A\"\nmsgstr \"tout %s\"\n") + goodB),
               ElementsAre("A in line 7 does not quote the present English text as its note"));
 }
 
@@ -59,27 +59,27 @@ TEST(CatalogueProblems, ArePlurals) {
 
 TEST(CatalogueProblems, ArePlaceholdersThatDiffer) {
   for (const char* text : {"tout", "tout %d", "tout %s %s", "tout {0}", "tout %1", "tout {}"}) {
-    EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"" + std::string(text) + "\"\n" + kGoodB),
+    EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"" + std::string(text) + "\"\n" + goodB),
                 ElementsAre("A in line 8 has other placeholders than the English text"))
         << text;
   }
 }
 
 TEST(CatalogueProblems, AreBytesThatAreNoCharacters) {
-  EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"caf\xe9 %s\"\n" + std::string(kGoodB)),
+  EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"caf\xe9 %s\"\n" + std::string(goodB)),
               ElementsAre("A in line 8 is not UTF-8"));
 }
 
 TEST(CatalogueProblems, AreBlanksAtTheEnds) {
-  EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s \"\n" + std::string(kGoodB)),
+  EXPECT_THAT(problemsOfFrench("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s \"\n" + std::string(goodB)),
               ElementsAre("A in line 8 begins or ends with a blank"));
 }
 
 TEST(CatalogueProblems, AreHeadersOfAnotherLanguageOrEncoding) {
-  const std::string entries = std::string("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + kGoodB;
-  EXPECT_THAT(problemsOf(parsePoFile(kHeader + entries), "de", kEnglish),
+  const std::string entries = std::string("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + goodB;
+  EXPECT_THAT(problemsOf(parsePoFile(header + entries), "de", english),
               ElementsAre("the header has no \"Language: de\""));
-  EXPECT_THAT(problemsOf(parsePoFile(entries), "fr", kEnglish),
+  EXPECT_THAT(problemsOf(parsePoFile(entries), "fr", english),
               ElementsAre("the header has no \"Content-Transfer-Encoding: 8bit\"",
                           "the header has no \"Content-Type: text/plain; charset=UTF-8\"",
                           "the header has no \"Language: fr\"", "the header has no \"MIME-Version: 1.0\""));

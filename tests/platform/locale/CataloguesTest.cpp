@@ -31,7 +31,7 @@ const std::map<std::string, PoFile>& catalogueFiles() {
   return files;
 }
 
-const std::set<std::string> kIds = {
+const std::set<std::string> idsAskedFor = {
     "MSGID_COMPUTER_SYSTEM_CAPTION",   "MSGID_COMPUTER_SYSTEM_DESCRIPTION",   "MSGID_CPU_PROCESSOR_CAPTION",
     "MSGID_CPU_PROCESSOR_DESCRIPTION", "MSGID_CPU_PROC_CAPABILITIES_CAPTION", "MSGID_CPU_PROC_CAPABILITIES_DESCRIPTION",
     "MSGID_CPU_PROC_CORE_CAPTION",     "MSGID_CPU_PROC_CORE_DESCRIPTION",     "MSGID_CPU_MEMORY_CAPTION",
@@ -51,7 +51,7 @@ TEST(Catalogues, HaveInEnglishWhatTheLibraryAsksFor) {
   for (const PoEntry& entry : catalogueFiles().at("en").entries) {
     ids.insert(entry.id);
   }
-  EXPECT_EQ(ids, kIds);
+  EXPECT_EQ(ids, idsAskedFor);
 }
 
 TEST(Catalogues, AreComplete) {

@@ -44,8 +44,8 @@ class PoReader {
     ++number_;
     if (line.starts_with("#,")) {
       isFuzzy_ = line.find("fuzzy") != std::string_view::npos;
-    } else if (line.starts_with(kNote)) {
-      note_ = line.substr(kNote.size());
+    } else if (line.starts_with(note)) {
+      note_ = line.substr(note.size());
     } else if (line.starts_with("msgid_plural")) {
       entries_.back().hasPlural = true;
       continued_ = nullptr;
@@ -75,7 +75,7 @@ class PoReader {
   }
 
  private:
-  static constexpr std::string_view kNote = "#. ";
+  static constexpr std::string_view note = "#. ";
 
   int number_ = 0;
   std::string note_;

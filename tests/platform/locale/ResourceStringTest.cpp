@@ -9,10 +9,10 @@ namespace {
 using Tarn::ResourceString;
 using Tarn::Locale::getResourceLibrary;
 
-constexpr const wchar_t* kCaption = L"MSGID_CPU_PROCESSOR_CAPTION";
+constexpr const wchar_t* caption = L"MSGID_CPU_PROCESSOR_CAPTION";
 
 std::wstring captionIn(const std::string& language) {
-  return ResourceString(getResourceLibrary(2, language), kCaption).str();
+  return ResourceString(getResourceLibrary(2, language), caption).str();
 }
 
 TEST(ResourceLibrary, IsNamedByNumberAndLanguage) {
@@ -51,19 +51,19 @@ TEST(ResourceString, IsTheIdWhereNothingIsKnownOfIt) {
   EXPECT_EQ(ResourceString(L"2/de", L"").str(), L"");
   for (const wchar_t* library :
        {L"3/de", L"0/en", L"-2/en", L"2", L"", L"/", L"x/en", L"2x/en", L"99999999999999/en"}) {
-    EXPECT_EQ(ResourceString(library, kCaption).str(), kCaption) << library;
+    EXPECT_EQ(ResourceString(library, caption).str(), caption) << library;
   }
 }
 
 TEST(ResourceString, ReadsALibraryWithoutALanguageAsEnglish) {
-  EXPECT_EQ(ResourceString(L"2/", kCaption).str(), L"Processor");
+  EXPECT_EQ(ResourceString(L"2/", caption).str(), L"Processor");
 }
 
 TEST(ResourceString, CanBeCopiedAndOutlivesItsArguments) {
   std::vector<ResourceString> strings;
   {
     const std::wstring library = L"2/de";
-    const std::wstring known = kCaption;
+    const std::wstring known = caption;
     const std::wstring unknown = L"MSGID_UNKNOWN_BUT_LONG_ENOUGH_TO_BE_ALLOCATED";
     strings = {ResourceString(library, known), ResourceString(library, unknown)};
   }
