@@ -11,6 +11,10 @@ namespace {
 using Row = CodeTable::Row;
 using enum Step;
 
+// The codes of the libraries, told here once more: this program knows a library by its entry points alone, and
+// explains by these tables also what another build of it answers. ExplanationTest compares them with
+// model/StateCodes.h, ExplainCommandTest with what the built libraries, the companion among them, answer.
+
 constexpr Row enabledStateRows[] = {{0, "0"}, {1, "2"}, {12, "6"}, {16, "3"}};
 constexpr CodeTable enabledState = {"EnabledState", enabledStateRows, "5"};
 

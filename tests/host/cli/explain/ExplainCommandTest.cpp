@@ -79,6 +79,12 @@ TEST(ExplainCommand, ValuesAreThoseOfTheLibraryForEveryCode) {
   expectValuesOfTheLibrary(everyCode());
 }
 
+TEST(ExplainCommand, ValuesAreThoseOfTheCompanionForEveryState) {
+  for (const unsigned int status : {1U, 12U, 15U, 16U, 20U, 21U, 24U, 77U}) {
+    expectValuesOfTheLibrary(TreeBuilder().system().status(status).processor("P0").build());
+  }
+}
+
 TEST(ExplainCommand, ValuesAreThoseOfTheLibraryForMachines) {
   expectValuesOfTheLibrary(smallBoard());
   expectValuesOfTheLibrary(virtualMachine());
