@@ -44,13 +44,13 @@ void setEnvironment(const Options& options) {
 }
 
 std::shared_ptr<const Tarn::Inventory::Tree> inventoryTree(const Options& options) {
-  if (options.description.empty()) {
+  if (options.convertFrom.empty()) {
     return Tarn::Inventory::processTree();
   }
   // hwloc trusts that a description is complete.
-  const CrashReport report("cannot read the inventory: " + options.description +
+  const CrashReport report("cannot read the inventory: " + options.convertFrom +
                            ": hwloc crashed on it; correct the description");
-  return std::make_shared<const Tarn::Inventory::Tree>(readHwloc(options.description));
+  return std::make_shared<const Tarn::Inventory::Tree>(readHwloc(options.convertFrom));
 }
 
 std::string inventoryOutput(const Options& options) {

@@ -58,7 +58,7 @@ AssociationFilter filterOf(OperationKind kind, const AssociationOptions& options
 Operation operationOf(const Options& options) {
   Operation operation;
   operation.kind = kindOf(options.verb->verb);
-  operation.path = ObjectPath::parse(options.target);
+  operation.path = ObjectPath::parse(options.operand(0));
   if (operation.path.nameSpace.empty()) {
     operation.path.nameSpace = options.nameSpace;
   }
@@ -152,7 +152,7 @@ std::optional<std::string> inventoryError() {
 }
 
 Outcome performOperation(const LibraryFiles& files, const Options& options) {
-  const std::string what = std::string(options.verb->name) + ' ' + options.target + ": ";
+  const std::string what = std::string(options.verb->name).append(" ").append(options.operand(0)).append(": ");
   Outcome outcome;
   try {
     const Operation operation = operationOf(options);

@@ -13,20 +13,12 @@ std::string quoted(std::string_view text) {
   return "'" + std::string(text) + "'";
 }
 
-std::string usageLine(const VerbSyntax& verb) {
-  std::string line = "usage: corvcim [OPTION...] " + std::string(verb.name);
-  if (!verb.operands.empty()) {
-    line += ' ' + std::string(verb.operands);
-  }
-  return line;
-}
-
 [[noreturn]] void fail(const std::string& text) {
   throw UsageError(text + "; see 'corvcim --help'");
 }
 
 [[noreturn]] void fail(const VerbSyntax& verb, const std::string& text) {
-  throw UsageError(std::string(verb.name) + ": " + text + "; " + usageLine(verb));
+  throw UsageError(std::string(verb.name) + ": " + text + "; usage: corvcim [OPTION...] " + callOf(verb));
 }
 
 /// The verbs that an option is for, and what is said to the others.
@@ -105,7 +97,7 @@ constexpr Option optionTable[] = {
     {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
     {"--namespace", "-n", true, everyVerb, setNameSpace},
     {"--output", "-o", true, everyVerb, setFormat},
-    {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.description = value; }},
+    {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.convertFrom = value; }},
     {"--ignore", "", true, onlyDiff,
      [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
     {"--unmasked", "", false, onlySnapshot, [](Options& o, const std::string&) { o.unmasked = true; }},
@@ -179,13 +171,11 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
   if (count > verb->maximumOperands) {
     fail(*verb, "unexpected argument " + quoted(operands[verb->maximumOperands + 1]));
   }
-  if (count >= 1) {
-    options.target = operands[1];
-  }
+  options.operands.assign(operands.begin() + 1, operands.end());
   if (verb->verb == Verb::Diff) {
-    options.secondTarget = operands[2];
-    checkSource("diff", options.target);
-    checkSource("diff", options.secondTarget);
+    for (const std::string& source : options.operands) {
+      checkSource("diff", source);
+    }
   } else if (count >= 2) {
     options.hasPropertyList = true;
     options.properties = splitAtCommas(operands[2]);
@@ -209,7 +199,7 @@ void checkCombination(const Options& options, const std::vector<Given>& given) {
       fail(name + " takes no option " + quoted(spelling) + ": " + std::string(option->scope.explanation));
     }
   }
-  if (!options.description.empty() && !options.inventory.empty()) {
+  if (!options.convertFrom.empty() && !options.inventory.empty()) {
     fail("'--from' and '--inventory' both name a source");
   }
   if (!options.language.empty() && (options.format == Format::Mof || options.format == Format::Json)) {

@@ -1,9 +1,11 @@
 #ifndef HOST_CLI_OPTIONS_H
 #define HOST_CLI_OPTIONS_H
 
+#include <cstddef>
 #include <span>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "host/cli/Verbs.h"
@@ -23,13 +25,12 @@ struct Options {
   std::string library;      ///< the provider library; empty: the one that belongs to this program
   std::string companion;    ///< the library with HALDA_ComputerSystem; empty: the one beside it
   std::string inventory;    ///< as CORVANE_INVENTORY takes it; empty: as the environment says
-  std::string description;  ///< what the verb inventory converts, as readHwloc takes it; empty: nothing
+  std::string convertFrom;  ///< what the verb inventory converts, as readHwloc takes it; empty: nothing
   std::string language;     ///< as CORVANE_LANGUAGE takes it; empty: as the environment says
   std::string nameSpace = "root/cimv2";
   Format format = Format::Text;
   const VerbSyntax* verb = &overviewSyntax();
-  std::string target;        ///< the class, the path, the first source or the file to write; may be empty
-  std::string secondTarget;  ///< the second source of diff
+  std::vector<std::string> operands;  ///< the words after the verb, as its syntax names them
   bool hasPropertyList = false;
   std::vector<std::string> properties;  ///< an empty list selects the keys alone
   AssociationOptions association;
@@ -37,6 +38,11 @@ struct Options {
   bool unmasked = false;                   ///< snapshot keeps serial numbers and the like
   bool wantsHelp = false;
   bool wantsVersion = false;
+
+  /// The operand at that place, from 0 on; empty where it was left out.
+  [[nodiscard]] std::string_view operand(std::size_t place) const {
+    return place < operands.size() ? std::string_view(operands[place]) : std::string_view();
+  }
 };
 
 /// A command line that cannot be understood; what() is one line that says what is wrong and how it

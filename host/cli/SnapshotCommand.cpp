@@ -58,10 +58,10 @@ Outcome takeSnapshot(const Options& options) {
   if (!snapshot.error.empty()) {
     outcome.errors.push_back(std::move(snapshot.error));
   }
-  if (options.target.empty()) {
+  if (options.operand(0).empty()) {
     outcome.output = std::move(snapshot.text);
   } else {
-    writeFile(options.target, snapshot.text, identifiers);
+    writeFile(options.operands.front(), snapshot.text, identifiers);
   }
   return outcome;
 }

@@ -54,11 +54,7 @@ constexpr std::string_view ending =
 std::string programHelp() {
   std::string text(introduction);
   for (const VerbSyntax& verb : verbs()) {
-    std::string call(verb.name);
-    if (!verb.operands.empty()) {
-      call += ' ' + std::string(verb.operands);
-    }
-    text += "  " + padRight(call, 27) + std::string(verb.summary) + '\n';
+    text += "  " + padRight(callOf(verb), 27) + std::string(verb.summary) + '\n';
   }
   text += optionHelp;
   text += associationHelp;
@@ -67,10 +63,7 @@ std::string programHelp() {
 }
 
 std::string verbHelp(const VerbSyntax& verb) {
-  std::string text = "Usage: corvcim [OPTION...] " + std::string(verb.name);
-  if (!verb.operands.empty()) {
-    text += ' ' + std::string(verb.operands);
-  }
+  std::string text = "Usage: corvcim [OPTION...] " + callOf(verb);
   text += "\n\nShows " + std::string(verb.summary) + ".\n";
   text += "Output: " + formatList(verb.formats) + ".\n";
   if (!verb.details.empty()) {

@@ -30,13 +30,13 @@ enum class Format { Text, Mof, Json, Svg, Dot };
 struct VerbSyntax {
   std::string_view name;
   Verb verb;
-  std::string_view operands;  ///< as the usage line names them
-  unsigned minimumOperands;
-  unsigned maximumOperands;
+  std::string_view operands = {};  ///< as the usage line names them
+  unsigned minimumOperands = 0;
+  unsigned maximumOperands = 0;
   std::string_view summary;
   std::span<const Format> formats;  ///< the output formats that the verb knows
-  bool isAssociation;               ///< takes the options that name ends and classes
-  std::string_view details;         ///< further paragraphs of the verb's own help
+  bool isAssociation = false;       ///< takes the options that name ends and classes
+  std::string_view details = {};    ///< further paragraphs of the verb's own help
 };
 
 /// All verbs, in the order in which the help lists them. Overview has no name and is not listed.
@@ -47,6 +47,9 @@ const VerbSyntax* findVerb(std::string_view name);
 
 /// The syntax of `corvcim` without a verb.
 const VerbSyntax& overviewSyntax();
+
+/// The verb and its operands, as they are written: "ei CLASS [PROPERTY,...]".
+std::string callOf(const VerbSyntax& verb);
 
 std::string_view formatName(Format format);
 

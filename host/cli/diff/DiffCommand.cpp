@@ -99,8 +99,8 @@ std::string asJson(const Difference& difference) {
   json.member("format", "corvane-inventory-diff");
   json.key("version");
   json.number(std::uint64_t{1});
-  json.member("a", difference.options.target);
-  json.member("b", difference.options.secondTarget);
+  json.member("a", difference.options.operand(0));
+  json.member("b", difference.options.operand(1));
   json.key("equal");
   json.boolean(difference.changes.empty());
   json.key("changes");
@@ -119,8 +119,8 @@ std::string asJson(const Difference& difference) {
 
 Outcome diffInventories(const Options& options) {
   checkIgnored(options.ignoredFields);
-  const Tree before = Tarn::Inventory::loadInventory(options.target);
-  const Tree after = Tarn::Inventory::loadInventory(options.secondTarget);
+  const Tree before = Tarn::Inventory::loadInventory(options.operand(0));
+  const Tree after = Tarn::Inventory::loadInventory(options.operand(1));
   const Difference difference{options, before, after, compareInventories(before, after, options.ignoredFields)};
   const std::string output = options.format == Format::Json ? asJson(difference) : asText(difference);
   return {output, {}, !difference.changes.empty()};

@@ -50,7 +50,7 @@ void checkSelection(const std::vector<std::string>& selection, const std::vector
 Outcome explainValues(const LibraryFiles& files, const Options& options) {
   const std::string source = Tarn::Inventory::chosenSource();
   const Tree tree = Tarn::Inventory::loadInventory(source, Tarn::Inventory::Detail::WithOrigins);
-  const std::vector<ExplanationTarget> targets = explanationTargets(tree, options.target);
+  const std::vector<ExplanationTarget> targets = explanationTargets(tree, std::string(options.operand(0)));
   checkSelection(options.properties, targets);
 
   Dispatcher dispatcher(files);
@@ -66,7 +66,7 @@ Outcome explainValues(const LibraryFiles& files, const Options& options) {
   outcome.errors = explainer.failures();
   if (options.format == Format::Json) {
     outcome.output = writeExplanationsAsJson(tree, instances, source);
-  } else if (options.target.empty()) {
+  } else if (options.operand(0).empty()) {
     outcome.output = writeShortExplanations(tree, instances);
   } else {
     outcome.output = writeExplanations(tree, instances);

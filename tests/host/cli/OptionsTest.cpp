@@ -57,7 +57,7 @@ TEST(Options, MayStandBehindTheVerb) {
   const Options options = parse({"ei", "HALDA_CPUMemory", "-o", "mof", "DeviceID"});
 
   EXPECT_EQ(options.verb->verb, Verb::EnumerateInstances);
-  EXPECT_EQ(options.target, "HALDA_CPUMemory");
+  EXPECT_THAT(options.operands, ElementsAre("HALDA_CPUMemory", "DeviceID"));
   EXPECT_EQ(options.format, Format::Mof);
   EXPECT_THAT(options.properties, ElementsAre("DeviceID"));
 }
@@ -81,7 +81,7 @@ TEST(Options, AssociationOptionsAreThoseOfWbemcli) {
   EXPECT_EQ(options.association.resultClass, "R");
   EXPECT_EQ(options.association.role, "role");
   EXPECT_EQ(options.association.resultRole, "far");
-  EXPECT_EQ(options.target, "X.K=1");
+  EXPECT_THAT(options.operands, ElementsAre("X.K=1"));
 }
 
 TEST(Options, ReferencesTakeTheAssociationClassByEitherOption) {
@@ -94,7 +94,7 @@ TEST(Options, ReferencesTakeTheAssociationClassByEitherOption) {
 }
 
 TEST(Options, TwoDashesEndThem) {
-  EXPECT_EQ(parse({"ein", "--", "-strange"}).target, "-strange");
+  EXPECT_EQ(parse({"ein", "--", "-strange"}).operand(0), "-strange");
 }
 
 TEST(Options, HelpNeedsNoOperands) {
@@ -141,8 +141,7 @@ TEST(Options, AssociationOptionsBelongToAssociationVerbs) {
 TEST(Options, DiffTakesTwoSources) {
   const Options options = parse({"diff", "live", "--ignore=status,cpus", "json:b.json"});
 
-  EXPECT_EQ(options.target, "live");
-  EXPECT_EQ(options.secondTarget, "json:b.json");
+  EXPECT_THAT(options.operands, ElementsAre("live", "json:b.json"));
   EXPECT_FALSE(options.hasPropertyList);
   EXPECT_THAT(options.ignoredFields, ElementsAre("status", "cpus"));
 }
@@ -167,9 +166,9 @@ TEST(Options, SnapshotMayNameAFileAndKeepIdentifiers) {
   const Options toOutput = parse({"snapshot"});
   const Options toFile = parse({"snapshot", "--unmasked", "machine.txt"});
 
-  EXPECT_EQ(toOutput.target, "");
+  EXPECT_EQ(toOutput.operand(0), "");
   EXPECT_FALSE(toOutput.unmasked);
-  EXPECT_EQ(toFile.target, "machine.txt");
+  EXPECT_EQ(toFile.operand(0), "machine.txt");
   EXPECT_TRUE(toFile.unmasked);
   EXPECT_EQ(complaint({"snapshot", "a", "b"}),
             "snapshot: unexpected argument 'b'; usage: corvcim [OPTION...] snapshot [FILE]");
