@@ -14,7 +14,7 @@ struct Setting {
   std::string where;
 };
 
-/// Something wrong with the configuration: where, and why it does not count.
+/// Something wrong with the configuration: where, and why it is not valid.
 struct ConfigurationProblem {
   std::string where;
   std::string why;
@@ -23,8 +23,8 @@ struct ConfigurationProblem {
 };
 
 /// The agent's configuration file: lines of `key = value`, comment lines that begin with `#`, blank lines.
-/// Of two lines with one key the later counts. A line that is none of these, or has an unknown key, is
-/// noted as a problem; the other lines count all the same.
+/// Of two lines with one key the later is in force. A line that is none of these, or has an unknown key, is
+/// noted as a problem; the other lines are in force all the same.
 class Configuration {
  public:
   /// Parses the text of a file; `file` is its name in messages.

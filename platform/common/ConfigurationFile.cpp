@@ -21,7 +21,7 @@ ConfigurationFile::ConfigurationFile(std::string path, Absence absence) : path_(
 
 ConfigurationFile ConfigurationFile::ofThisProcess() {
   if (std::optional<std::string> path = environmentOverride("CORVANE_CONFIG")) {
-    // The process may change its directory, and the file is looked after for as long as it runs.
+    // The process may change its directory, and the file is checked for as long as it runs.
     std::error_code error;
     const std::filesystem::path absolute = std::filesystem::absolute(*path, error);
     return {error ? std::move(*path) : absolute.string(), Absence::IsAProblem};

@@ -31,7 +31,7 @@ class FileSink final : public Sink {
  public:
   using Clock = std::chrono::steady_clock;
 
-  /// Opens the file, creates it where needed (readable for its owner and group). A relative path counts from the
+  /// Opens the file, creates it where needed (readable for its owner and group). A relative path starts from the
   /// directory that the process is in now.
   /// Throws std::runtime_error or a child of it, whose text names the file and says why.
   explicit FileSink(const std::string& path, Rotation rotation = {},

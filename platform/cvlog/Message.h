@@ -18,7 +18,7 @@ struct Message {
   std::string_view text{};
 };
 
-/// A message of the logger itself, told as one of the calling function and line. `file` is the base name of its source.
+/// A message of the logger itself, from the calling function and line. `file` is the base name of its source.
 Message ownMessage(int level, std::string_view file, std::string_view text,
                    std::chrono::system_clock::time_point time = std::chrono::system_clock::now(),
                    std::string_view function = __builtin_FUNCTION(), int line = __builtin_LINE());

@@ -28,7 +28,7 @@ constexpr std::uint64_t smallestFile = 4096;
 constexpr std::uint64_t largestFile = std::numeric_limits<std::int64_t>::max();
 
 std::string expected(const Setting& setting, std::string_view wanted) {
-  return "\"" + setting.value + "\" does not count: expected " + std::string(wanted);
+  return "\"" + setting.value + "\" is not valid: expected " + std::string(wanted);
 }
 
 std::optional<std::uint64_t> parseNumber(std::string_view text) {

@@ -62,7 +62,7 @@ void Instrumentation::setFilter(PathType type, const std::string& internalPath) 
     begin = index + 1;
     end = tree_->node(index).end;
   }
-  // What lies below a node stands behind it in one stretch, and the selection is in the same order.
+  // What lies below a node stands after it in one stretch, and the selection is in the same order.
   first_ = std::lower_bound(first_, last_, begin);
   last_ = std::lower_bound(first_, last_, end);
   current_ = first_;

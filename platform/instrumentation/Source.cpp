@@ -111,8 +111,8 @@ struct Dump {
   std::optional<Choice> behind;
 };
 
-// FILE+SOURCE. The file's name may have a plus sign as well, so only one with a source of files behind it
-// counts.
+// FILE+SOURCE. The file's name may have a plus sign as well, so only one with a source of files after it
+// is meant.
 Dump splitDump(const std::string& location) {
   for (std::size_t plus = location.find('+'); plus != std::string::npos; plus = location.find('+', plus + 1)) {
     const std::optional<Choice> behind = find(std::string_view(location).substr(plus + 1));

@@ -35,7 +35,7 @@ std::optional<Setting> wantedLanguage() {
 void reportUnknown(const Setting& setting) {
   Common::report({"Corvane.Locale", "Locale.cpp"}, CVLog::levelError,
                  "Configuration: " + setting.where + ": \"" + setting.value +
-                     "\" does not count: expected a language id such as de or de_AT");
+                     "\" is not valid: expected a language id such as de or de_AT");
 }
 
 std::string languageOfThisProcess() {

@@ -63,7 +63,7 @@ class ArchiveReader {
   void beginEntry(std::string_view text) {
     const std::size_t end = text.find_first_of(":!#");
     if (end == 0 || end == std::string_view::npos) {
-      refuse("no file name with a colon behind it", "write name: contents");
+      refuse("no file name with a colon after it", "write name: contents");
     }
     if (directory_.empty()) {
       refuse("a file before the first directory", "begin with a line such as [sys/devices/system/cpu]");
@@ -109,7 +109,7 @@ class ArchiveReader {
     } else if (mark == ':' && rest.empty()) {
       more_ = &ArchiveReader::moreNames;
     } else {
-      refuse("a directory's names beside its own", "write them below, one on each line, behind a tab");
+      refuse("a directory's names beside its own", "write them below, one on each line, after a tab");
     }
     if (!wasRead) {
       open_->error = errorOfReading(*open_->listing);
@@ -144,7 +144,7 @@ class ArchiveReader {
   std::string directory_;
   std::set<std::string, std::less<>> seen_;  // what has had a line of its own
   Entry* open_ = nullptr;
-  void (ArchiveReader::*more_)(std::string_view text) = nullptr;  // what takes the lines behind a tab
+  void (ArchiveReader::*more_)(std::string_view text) = nullptr;  // what takes the lines after a tab
   MemoryFileSystem::Files files_;
 };
 

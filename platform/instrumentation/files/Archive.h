@@ -29,12 +29,12 @@ namespace Tarn::Inventory {
 ///     	011b010001020304f1bd7a1c3c2c11ec8f6c0242ac120002060506000045786d
 ///     	706c650000
 ///
-/// A directory in brackets begins its files. Behind a colon stands a file's one line; a file of more
-/// lines, or of none, has them below, each behind a tab. Behind # stands a file that is no text, its
+/// A directory in brackets begins its files. After a colon stands a file's one line; a file of more
+/// lines, or of none, has them below, each after a tab. After # stands a file that is no text, its
 /// bytes in hexadecimal, on this line or below. An exclamation mark says that reading the file fails,
 /// and how: by the error's name or its number. The name ./ is the directory itself: below it stands
 /// what listing it gives, one name on each line, where that is more or less than the files here. Lines
-/// that begin with # and empty lines do not count.
+/// that begin with # and empty lines are skipped.
 ///
 /// Throws InventoryError with the line number where a text is no such archive.
 MemoryFileSystem::Files readArchive(std::string_view text, const std::string& name);

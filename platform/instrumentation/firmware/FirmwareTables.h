@@ -31,7 +31,7 @@ struct FirmwareTables {
 };
 
 /// Reads the tables; nullptr, and a note, where they are not there or may not be read. What is broken in
-/// them is noted, and the rest counts.
+/// them is noted, and the rest is used.
 std::unique_ptr<const FirmwareTables> readFirmwareTables(Machine& machine);
 
 /// What the tables tell of the computer itself.

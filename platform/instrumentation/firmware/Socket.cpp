@@ -20,7 +20,7 @@ using namespace NodeLexicon;
 using Smbios::Field;
 using Smbios::ProcessorStatus;
 
-// With "S:" in front and a cache's name behind it, such a path is no longer than others.
+// With "S:" in front and a cache's name after it, such a path is no longer than others.
 constexpr std::size_t longestLabel = 8;
 
 constexpr std::size_t signatureLength = 4;
@@ -93,7 +93,7 @@ constexpr std::array<std::string_view, 7> x86Makers = {
 std::optional<unsigned int> x86Stepping(const Smbios::Processor& processor) {
   const std::string maker = comparableName(firmwareText(processor.manufacturer));
   const bool isX86 = std::ranges::any_of(x86Makers, [&](std::string_view known) { return maker.starts_with(known); });
-  // Without a signature the feature bits behind it say nothing of the stepping.
+  // Without a signature the feature bits after it say nothing of the stepping.
   const bool isTold = processor.id && (*processor.id & 0xFFFFFFFFU) != 0;
   return isX86 && isTold ? std::optional(static_cast<unsigned int>(*processor.id & 0xFU)) : std::nullopt;
 }
@@ -148,7 +148,7 @@ class Collector {
   void addProcessor() {
     number(PropFamily, processor_.family, "as it stands: the codes are CIM's");
     if (!processor_.family && matched_.empty()) {
-      facts_.number(PropFamily, CimFamily::unknown, told(processor_.family, "no family is told: unknown"));
+      facts_.number(PropFamily, CimFamily::unknown, told(processor_.family, "no family is given: unknown"));
     }
     text(PropProcessorName, processor_.version);
     addId();
@@ -169,7 +169,7 @@ class Collector {
     text(PropPartNumber, processor_.partNumber);
   }
 
-  // Two identifiers of one processor do not contradict each other: the kernel's counts.
+  // Two identifiers of one processor do not contradict each other: the kernel's is used.
   void addId() {
     const bool isOther = holdsSocId(processor_) && !matched_.empty();
     const std::string id = processor_.id && !isOther ? byteText(processor_.id.raw) : std::string();

@@ -16,7 +16,7 @@ inline constexpr unsigned int armv8 = 257;
 inline constexpr unsigned int armv9 = 258;
 }  // namespace CimFamily
 
-/// Which processors have a CIM family code. The row that says most about a processor counts: the longest
+/// Which processors have a CIM family code. The row that says most about a processor is chosen: the longest
 /// brand, then one that names a family, then one that names a model.
 struct FamilyRow {
   static constexpr int any = -1;
@@ -31,7 +31,7 @@ struct FamilyRow {
 /// The rows, sorted by vendor, brand, family and model.
 std::span<const FamilyRow> familyTable();
 
-/// The row that counts for this processor; nullptr where none fits.
+/// The row for this processor; nullptr where none fits.
 const FamilyRow* findFamilyRow(std::string_view vendor, std::string_view name, int family, int model);
 
 /// The CIM family code; CimFamily::unknown where no row fits. `family` and `model` may be any.

@@ -22,7 +22,7 @@ class Fields {
   /// A field that clients see.
   std::string text(std::string_view name) const { return plainText((*this)[name]); }
 
-  /// Decimal, or hexadecimal behind 0x; what stands behind the digits does not count.
+  /// Decimal, or hexadecimal after 0x; what stands after the digits is skipped.
   std::optional<unsigned int> number(std::string_view name) const {
     std::string_view text = (*this)[name];
     const int base = text.starts_with("0x") ? 16 : 10;
@@ -166,7 +166,7 @@ void identifyLoongArch(const Fields& fields, CpuIdentity& cpu) {
   cpu.clockSpeed = fields.megahertz("CPU MHz");
 }
 
-/// How an architecture's cpuinfo is told: by a field that it has, and how this field begins.
+/// How an architecture's cpuinfo is recognized: by a field that it has, and how this field begins.
 struct Dialect {
   std::string_view field;
   std::string_view begin;

@@ -21,8 +21,8 @@ struct CpuIdentity {
   std::string stepping;
   std::string processorId;  ///< the identification register, as SMBIOS writes it: bytes in memory order
   unsigned int family = CimFamily::unknown;
-  const FamilyRow* familyRow = nullptr;    ///< the row that told the family, if one did
-  const ArmPart* armPart = nullptr;        ///< the design that told name and family, if it is known
+  const FamilyRow* familyRow = nullptr;    ///< the row that gave the family, if one did
+  const ArmPart* armPart = nullptr;        ///< the design that gave name and family, if it is known
   std::optional<unsigned int> width;       ///< bits of a general register
   std::optional<unsigned int> clockSpeed;  ///< MHz at this moment
   bool hypervisor = false;                 ///< it says itself that it is virtual

@@ -57,7 +57,7 @@ class Machine {
   /// The same for cpuN/`suffix`.
   Origin originOfCpu(unsigned int cpu, std::string_view suffix, std::string rule) const;
 
-  /// The same for several CPUs of which one, with one of these suffixes, told the value: the first that
+  /// The same for several CPUs of which one, with one of these suffixes, gave the value: the first that
   /// could be read, else that field of /proc/cpuinfo.
   Origin originOfCpus(const CpuSet& cpus, std::span<const std::string_view> suffixes, std::string_view field,
                       std::string rule) const;

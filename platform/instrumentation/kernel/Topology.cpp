@@ -20,8 +20,8 @@ struct CpuPlace {
   std::optional<CpuSet> siblings;  // the CPUs of its core
 };
 
-// The number behind a prefix, as in "cpu12".
-std::optional<unsigned int> numberBehind(std::string_view prefix, std::string_view name) {
+// The number after a prefix, as in "cpu12".
+std::optional<unsigned int> numberAfter(std::string_view prefix, std::string_view name) {
   return name.starts_with(prefix) ? Attributes::toNumber(name.substr(prefix.size())) : std::nullopt;
 }
 
@@ -71,7 +71,7 @@ class TopologyReader {
     std::vector<std::string> names;
     machine_.root().files().list(kernelCpuDirectory, names);
     for (const std::string& name : names) {
-      if (const std::optional<unsigned int> cpu = numberBehind("cpu", name)) {
+      if (const std::optional<unsigned int> cpu = numberAfter("cpu", name)) {
         present.add(*cpu);
       }
     }
@@ -198,7 +198,7 @@ class TopologyReader {
     std::vector<std::string> names;
     cpus_.files().list(directory.c_str(), names);
     for (const std::string& name : names) {
-      if (numberBehind("node", name)) {
+      if (numberAfter("node", name)) {
         CpuSet neighbours = cpus_.list(directory, "/", name, "/cpulist").value_or(CpuSet());
         neighbours.remove(hidden_);
         return packageOfAll(neighbours);

@@ -48,7 +48,7 @@ class CacheNode {
                                                                 : "level, contents and the lowest CPU of the cache");
     });
     tree_.text(PropCacheName, cacheName(cache_)).from([&] {
-      return attribute("level", "L and the level, behind it d for data, i for instructions");
+      return attribute("level", "L and the level, after it d for data, i for instructions");
     });
     number(PropCacheLevel, levelCode(cache_.level), "level", "L1 is 3, L2 4, L3 5, any other 1");
     if (cache_.contents) {

@@ -71,7 +71,7 @@ class CacheNode {
     addStatus(offline);
     tree_.description(label(cache_)).from([&] { return told(structure_.level, "level and contents"); });
     tree_.text(PropCacheName, nameOf(cache_)).from([&] {
-      return told(structure_.level, "L and the level in bits 0 to 2, behind it d for data, i for instructions");
+      return told(structure_.level, "L and the level in bits 0 to 2, after it d for data, i for instructions");
     });
     tree_.number(PropCacheLevel, levelCode(cache_.level)).from([&] {
       return told(structure_.level, "the level in bits 0 to 2: L1 is 3, L2 4, L3 5, any other 1");
@@ -101,7 +101,7 @@ class CacheNode {
   }
 
   // The firmware tells no line size. CIM has 1 for what has no blocks; larger caches than that can count
-  // are told in KiB.
+  // are given in KiB.
   void addSize() {
     if (!structure_.installedSize) {
       return;

@@ -40,7 +40,7 @@ inline constexpr const char* associativityRule =
     "direct-mapped, 3, is 1; fully associative, 6, is 2; 2 ways are 3, 4 are 4, 8 are 5, 16 are 6";
 
 /// Puts the caches below the processor that was added last, for where the kernel shows none. Their paths
-/// are the processor's with the cache's name: "P0.L2"; a second one of that name has its handle behind it.
+/// are the processor's with the cache's name: "P0.L2"; a second one of that name has its handle after it.
 /// `offline` says that none of the processor's CPUs is online, and so its caches are offline as well; it is empty
 /// where one is online, and where the kernel shows no CPUs.
 void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& caches, const std::string& processor,

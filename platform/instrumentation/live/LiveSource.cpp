@@ -31,7 +31,7 @@ class LiveReader {
  public:
   LiveReader(FileSystem& root, Detail detail) : machine_(root, detail), kernel_(machine_), tree_(detail) {}
 
-  /// Forgets what the kernel was asked in vain.
+  /// Forgets which of the kernel's files could not be read.
   void expectNoKernel() { machine_.unread() = UnreadLog(); }
 
   void readFirmware() {

@@ -44,7 +44,7 @@ class Assigner {
   }
 
  private:
-  // Those count whose processor can be at work. Where the kernel has as many packages as there are processors
+  // Those are matched whose processor can be at work. Where the kernel has as many packages as there are processors
   // at all, it works with those that the firmware calls disabled as well; and so it may where the others are
   // not the kernel's processors, which would else be in the tree a second time, as disabled.
   void match() {

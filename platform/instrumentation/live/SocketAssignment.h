@@ -21,7 +21,7 @@ struct SocketAssignment {
   std::vector<PackageSocket> packages;  ///< in the kernel's order
 
   /// The sockets that become processors of their own, by ascending handle: empty ones, and those with a
-  /// processor that the kernel does not see. A socket whose package cannot be told is not among them: its
+  /// processor that the kernel does not see. A socket whose package cannot be determined is not among them: its
   /// processor would be there twice.
   std::vector<const Socket*> standalone;
 

@@ -12,7 +12,7 @@
 namespace Tarn::Smbios {
 
 /// The version of the standard that the firmware says its tables follow. Only for people: which fields there are is
-/// told by each structure's length.
+/// given by each structure's length.
 struct Version {
   std::uint8_t majorNumber = 0;
   std::uint8_t minorNumber = 0;

@@ -26,7 +26,7 @@ class Walker {
     }
     if (table_.size() > largestTable) {
       problems.add({Problem::Place::Table, largestTable,
-                    "the table has " + std::to_string(table_.size()) + " bytes; what is behind the first " +
+                    "the table has " + std::to_string(table_.size()) + " bytes; what comes after the first " +
                         std::to_string(largestTable) + " is not read"});
       table_ = table_.first(largestTable);
     }
@@ -54,7 +54,7 @@ class Walker {
     return false;
   }
 
-  // Under _SM3_ the number of structures is not told, and the mark counts wherever it stands.
+  // Under _SM3_ the number of structures is not given, and the mark ends the table wherever it stands.
   bool allSeen() const { return found_.size() >= entryPoint_.structures.value_or(0); }
 
   bool onlyZerosLeft() const {
@@ -98,15 +98,15 @@ class Walker {
            number, handle);
       return false;
     }
-    const Bytes behind = rest.subspan(length);
-    const std::size_t strings = endOfStrings(behind);
+    const Bytes following = rest.subspan(length);
+    const std::size_t strings = endOfStrings(following);
     found_.push_back({.number = number,
                       .offset = offset_,
                       .type = littleEndian<std::uint8_t>(rest, 0),
                       .handle = handle,
                       .formatted = rest.first(length),
-                      .strings = behind.first(strings)});
-    if (strings == behind.size()) {
+                      .strings = following.first(strings)});
+    if (strings == following.size()) {
       offset_ = table_.size();
       note("the table ends within the structure's strings", number, handle);
       return false;
@@ -117,13 +117,13 @@ class Walker {
   }
 
   // Where the zero stands that follows the last string's own; the end of the table where there is none.
-  static std::size_t endOfStrings(Bytes behind) {
-    const auto last = std::adjacent_find(behind.begin(), behind.end(),
+  static std::size_t endOfStrings(Bytes following) {
+    const auto last = std::adjacent_find(following.begin(), following.end(),
                                          [](std::byte one, std::byte next) { return (one | next) == zero; });
-    if (last == behind.end()) {
-      return behind.size();
+    if (last == following.end()) {
+      return following.size();
     }
-    const auto length = static_cast<std::size_t>(last - behind.begin());
+    const auto length = static_cast<std::size_t>(last - following.begin());
     return length == 0 ? 0 : length + 1;
   }
 

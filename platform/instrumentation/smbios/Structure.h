@@ -22,7 +22,7 @@ inline constexpr std::uint8_t inactive = 126;
 inline constexpr std::uint8_t endOfTable = 127;
 }  // namespace StructureType
 
-/// One structure of the table: a formatted area of fields at fixed offsets, and the strings behind it. It looks into
+/// One structure of the table: a formatted area of fields at fixed offsets, and the strings after it. It looks into
 /// the table's bytes, which must outlive it.
 struct Structure {
   static constexpr std::size_t headerLength = 4;
@@ -67,8 +67,8 @@ std::string placeOf(const Structure& structure, std::size_t offset);
 /// Finds the structures of a table. What is no structure ends the walk, as the length of a broken one does not tell
 /// where the next begins; a structure whose formatted area does not fit is not among them. The end-of-table structure
 /// is the last one under _SM3_. Under the older entry points it is the last one only when as many structures as were
-/// announced have been seen, since there the whole length of the table counts. What is behind the first `largestTable`
-/// bytes is not read.
+/// announced have been seen, since there the whole length of the table is looked at. What comes after the first
+/// `largestTable` bytes is not read.
 std::vector<Structure> walk(const EntryPoint& entryPoint, Bytes table, Problems& problems);
 
 }  // namespace Tarn::Smbios

@@ -111,7 +111,7 @@ Decoded decodeDump(Bytes file) {
   if (table.empty()) {
     return Problem{Problem::Place::EntryPoint, 0,
                    "the table is not in the file: it should begin at " + detail::hexadecimal(entryPoint.tableAddress) +
-                       ", behind the entry point's " + std::to_string(entryPoint.length) + " bytes and within the " +
+                       ", after the entry point's " + std::to_string(entryPoint.length) + " bytes and within the " +
                        std::to_string(file.size()) + " bytes of the file"};
   }
   return decodeTable(entryPoint, table, problems);

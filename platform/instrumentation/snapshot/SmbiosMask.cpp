@@ -89,7 +89,7 @@ class Masker {
       add("UUID");
     }
     if (structure.formatted.size() > knownLength && clear(structure.formatted.subspan(knownLength))) {
-      add("fields behind the known ones");
+      add("fields after the known ones");
     }
     if (!note.empty()) {
       notes_.push_back(Smbios::placeOf(structure) + ": " + note);

@@ -21,7 +21,7 @@ class CpuSet {
   CpuSet(std::initializer_list<unsigned int> numbers);
 
   /// Reads the kernel's list form, such as "0-3,8,10-11"; an empty text is the empty set, and white
-  /// space around the list does not count. Nothing if the text is no such list.
+  /// space around the list is skipped. Nothing if the text is no such list.
   static std::optional<CpuSet> fromList(std::string_view list);
 
   /// The set in the kernel's list form.

@@ -57,7 +57,7 @@ class Writer {
     return text + '}';
   }
 
-  // One on each line, and the bracket behind them.
+  // One on each line, and the bracket after them.
   template <class Entries, class Describe>
   void writeEntries(const Entries& entries, Describe describe) {
     const char* separator = "\n    ";

@@ -6,7 +6,7 @@
 
 namespace Tarn::Inventory {
 
-/// A node's internal path is its printable path behind a slash: the two cannot be mistaken for each
+/// A node's internal path is its printable path after a slash: the two cannot be mistaken for each
 /// other, need no look-up, and are short enough to be kept without memory of their own.
 inline constexpr char internalMark = '/';
 

@@ -128,7 +128,7 @@ class Tree {
   const Origin* statusOrigin(NodeIndex node) const { return origin(node, statusKey); }
   const Origin* descriptionOrigin(NodeIndex node) const { return origin(node, descriptionKey); }
 
-  /// Whether both say the same; where it comes from does not count.
+  /// Whether both say the same; where it comes from makes no difference.
   bool operator==(const Tree& other) const;
 
  private:

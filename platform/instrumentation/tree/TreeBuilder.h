@@ -21,7 +21,7 @@ namespace Tarn::Inventory {
 ///         .cache("P0.L3.0").number(PropCacheLevel, 5).cpus({0, 1})
 ///         .build();
 ///
-/// A builder that collects origins asks for each value where it comes from, right behind the value:
+/// A builder that collects origins asks for each value where it comes from, right after the value:
 ///
 ///     builder.number(PropMaxClockSpeed, 3500).from([&] { return fileOrigin(...); });
 ///

@@ -144,7 +144,7 @@ TEST_F(FollowingLogger, ReportsWhatIsWrongInTheChangedFile) {
   logger.followConfiguration();
   EXPECT_THAT(recordedSystemLog(),
               ElementsAre(Field(&SystemLogRecord::text,
-                                EndsWith(path("corvane.conf") + ":1: \"loud\" does not count: expected error, "
+                                EndsWith(path("corvane.conf") + ":1: \"loud\" is not valid: expected error, "
                                                                 "warning, info, debug or a number"))));
 }
 

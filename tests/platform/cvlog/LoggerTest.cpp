@@ -133,7 +133,7 @@ TEST_F(Logger, ReportsABrokenConfigurationOnceAndObeysTheRest) {
                                      ":2: unknown key \"log.levle\"; the line is ignored \\(known keys: .*\\)")),
                   Field(&SystemLogRecord::text,
                         MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
-                                     ":4: \"printer\" does not count: expected none, stderr, syslog or file:PATH")),
+                                     ":4: \"printer\" is not valid: expected none, stderr, syslog or file:PATH")),
                   SystemLogRecord{LOG_INFO, "Corvane.Test function file.cpp:12 logged"}));
 }
 

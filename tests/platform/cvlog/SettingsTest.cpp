@@ -87,13 +87,13 @@ TEST(LogSettings, HaveSizesInBytesAndTheirMultiples) {
 TEST(LogSettings, NameWhatARotationCanBe) {
   EXPECT_THAT(fromFile("log.size = 10\ntrace.keep = 0\nlog.keep = 1000\n").problems,
               ElementsAre(ConfigurationProblem{"corvane.conf:1",
-                                               "\"10\" does not count: expected a size from 4K on, such as 500K, 16M "
+                                               "\"10\" is not valid: expected a size from 4K on, such as 500K, 16M "
                                                "or 1G, or 0 for no limit"},
                           ConfigurationProblem{"corvane.conf:3",
-                                               "\"1000\" does not count: expected how many old files are kept, 1 to "
+                                               "\"1000\" is not valid: expected how many old files are kept, 1 to "
                                                "999"},
                           ConfigurationProblem{"corvane.conf:2",
-                                               "\"0\" does not count: expected how many old files are kept, 1 to "
+                                               "\"0\" is not valid: expected how many old files are kept, 1 to "
                                                "999"}));
 }
 
@@ -117,11 +117,10 @@ TEST(LogSettings, BrokenValuesAreNamedAndTheRestCounts) {
       settings.problems,
       ElementsAre(
           ConfigurationProblem{"corvane.conf:1",
-                               "\"loud\" does not count: expected error, warning, info, debug or a number"},
-          ConfigurationProblem{"corvane.conf:2",
-                               "\"file:\" does not count: expected none, stderr, syslog or file:PATH"},
+                               "\"loud\" is not valid: expected error, warning, info, debug or a number"},
+          ConfigurationProblem{"corvane.conf:2", "\"file:\" is not valid: expected none, stderr, syslog or file:PATH"},
           ConfigurationProblem{"corvane.conf:3",
-                               "\"-1\" does not count: expected a number of messages a minute, 0 for no limit"}));
+                               "\"-1\" is not valid: expected a number of messages a minute, 0 for no limit"}));
 }
 
 TEST(LogSettings, BrokenOverridesLeaveTheFileInForce) {
@@ -133,7 +132,7 @@ TEST(LogSettings, BrokenOverridesLeaveTheFileInForce) {
         settings.problems,
         ElementsAre(ConfigurationProblem{
             "CORVANE_LOG", '"' + std::string(broken) +
-                               "\" does not count: expected LEVEL:DESTINATION, where LEVEL is error, warning, "
+                               "\" is not valid: expected LEVEL:DESTINATION, where LEVEL is error, warning, "
                                "info, debug or a number and DESTINATION is none, stderr, syslog or file:PATH"}));
   }
 }

@@ -188,7 +188,7 @@ TEST(Source, RefusesARootWithoutAnyProcessor) {
 TEST(Source, RefusesAFileThatHoldsNoCapture) {
   EXPECT_EQ(refusalOf("root:" + fixture + "tree.json"),
             "cannot read the captured files: " + fixture +
-                "tree.json, line 1: no file name with a colon behind it; write name: contents");
+                "tree.json, line 1: no file name with a colon after it; write name: contents");
 }
 
 }  // namespace

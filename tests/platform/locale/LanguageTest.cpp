@@ -73,7 +73,7 @@ TEST_F(Language, ThatIsNoneIsReportedAndReadsAsEnglish) {
   configure("\nlanguage = German, please\n");
   EXPECT_EQ(getLanguageId(), "en");
   const std::string expected = " Configuration: " + directory_ +
-                               "/corvane.conf:2: \"German, please\" does not count: expected a language id such as de "
+                               "/corvane.conf:2: \"German, please\" is not valid: expected a language id such as de "
                                "or de_AT\n";
   EXPECT_TRUE(log().ends_with(expected)) << log();
 }

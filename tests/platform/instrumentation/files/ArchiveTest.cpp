@@ -88,7 +88,7 @@ TEST(Archive, RefusesWhatIsNone) {
             "cannot read the captured files: root.txt, line 2: a file before the first directory; begin with a line "
             "such as [sys/devices/system/cpu]");
   EXPECT_EQ(refusalOf("[a]\nonline\n"),
-            "cannot read the captured files: root.txt, line 2: no file name with a colon behind it; write name: "
+            "cannot read the captured files: root.txt, line 2: no file name with a colon after it; write name: "
             "contents");
   EXPECT_EQ(refusalOf("[a]\nb: 1\nb: 1\n"),
             "cannot read the captured files: root.txt, line 3: a/b is there twice; remove one of the two");
@@ -109,7 +109,7 @@ TEST(Archive, RefusesWhatIsNone) {
   for (const char* listing : {"./: one", "./# 00"}) {
     EXPECT_EQ(refusalOf("[a]\n" + std::string(listing) + '\n'),
               "cannot read the captured files: root.txt, line 2: a directory's names beside its own; write them below, "
-              "one on each line, behind a tab");
+              "one on each line, after a tab");
   }
   EXPECT_EQ(refusalOf("[a]\n./:\n./:\n"),
             "cannot read the captured files: root.txt, line 3: a/./ is there twice; remove one of the two");

@@ -58,7 +58,7 @@ P0.L2.9 CacheBlockSize: /sys/devices/system/cpu/cpu0/cache/index0/coherency_line
 P0.L2.9 CacheWritePolicy: /sys/devices/system/cpu/cpu0/cache/index0/write_policy: WriteBack: WriteBack is 1, WriteThrough 2
 P0.L2.9 CacheConsumableBlocks: /sys/devices/system/cpu/cpu0/cache/index0/size: 512K: the size by coherency_line_size
 P0.L2.9 CacheNumberOfBlocks: /sys/devices/system/cpu/cpu0/cache/index0/size: 512K: the size by coherency_line_size
-P0.L2.9 CacheName: /sys/devices/system/cpu/cpu0/cache/index0/level: 2: L and the level, behind it d for data, i for instructions
+P0.L2.9 CacheName: /sys/devices/system/cpu/cpu0/cache/index0/level: 2: L and the level, after it d for data, i for instructions
 )");
 }
 

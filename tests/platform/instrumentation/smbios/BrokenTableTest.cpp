@@ -259,8 +259,9 @@ TEST(BrokenTable, LargerThanAnyIsReadUpToTheLimit) {
   EXPECT_THAT(full.problems(),
               ElementsAre("SMBIOS table, offset 0x100000: the table ends without an end-of-table structure"));
   EXPECT_EQ(tables->structures.size(), largestTable / filled.table().size());
-  EXPECT_EQ(tables.problems().front(),
-            "SMBIOS table, offset 0x100000: the table has 1048588 bytes; what is behind the first 1048576 is not read");
+  EXPECT_EQ(
+      tables.problems().front(),
+      "SMBIOS table, offset 0x100000: the table has 1048588 bytes; what comes after the first 1048576 is not read");
 }
 
 TEST(BrokenTable, OfGarbageGivesNothingButWhy) {

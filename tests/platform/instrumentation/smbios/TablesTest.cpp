@@ -64,11 +64,11 @@ TEST(Tables, OfADumpThatDoesNotHoldThemAreRefused) {
   inMemory[0x17] = '\x80';
 
   EXPECT_EQ(failureOf(decodeDump(bytesOf(inEntryPoint))),
-            "SMBIOS entry point, offset 0x0: the table is not in the file: it should begin at 0x17, behind the entry "
+            "SMBIOS entry point, offset 0x0: the table is not in the file: it should begin at 0x17, after the entry "
             "point's 24 bytes and within the " +
                 std::to_string(inEntryPoint.size()) + " bytes of the file");
   EXPECT_EQ(failureOf(decodeDump(bytesOf(behindFile))),
-            "SMBIOS entry point, offset 0x0: the table is not in the file: it should begin at 0x20, behind the entry "
+            "SMBIOS entry point, offset 0x0: the table is not in the file: it should begin at 0x20, after the entry "
             "point's 24 bytes and within the 32 bytes of the file");
   EXPECT_NE(failureOf(decodeDump(bytesOf(inMemory))), "");
   EXPECT_EQ(failureOf(decodeDump(bytesOf("# no dump\n"))),

@@ -149,7 +149,7 @@ TEST(SmbiosMask, TakesFieldsBehindTheKnownOnes) {
 
   const Masked masked(encoder);
 
-  EXPECT_THAT(masked.notes, ElementsAre("SMBIOS type 7, handle 0x0007: fields behind the known ones"));
+  EXPECT_THAT(masked.notes, ElementsAre("SMBIOS type 7, handle 0x0007: fields after the known ones"));
   EXPECT_EQ(Smbios::hexOf(masked.after.structures.at(0).formatted.subspan(0x19)), "0101000000000000000000");
 }
 
