@@ -4,6 +4,7 @@
 #include <iterator>
 #include <span>
 #include <string_view>
+#include <type_traits>
 
 #include "ProviderFrame.h"
 
@@ -24,6 +25,8 @@ struct Association {
   const char* className;
   Reference first;
   Reference second;
+  /// What no property list filters away. Brokers take it as mutable pointers, and write none of them.
+  mutable const char* filterKeys[3] = {first.name, second.name, nullptr};
 };
 
 /// The elements that the 16-bit count of results reaches.
@@ -32,17 +35,14 @@ std::span<Element> counted(std::vector<Element>& elements) {
   return std::span(elements).first(countOf(elements));
 }
 
-/// Fails the request, with the same words for the client and for the log.
-inline void fail(const Association& association, CMPIStatus* status, const char* text,
-                 unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
-  setFailure(association.broker, status, text);
-  association.events.message(LevelError, text, line, function);
-}
-
-/// Fails the request with words of their own for the client and for the log.
+/// What is said of a failure: to the client, unless that is NULL, and in the log.
 struct FailureTexts {
   const char* status;
   const char* log;
+
+  // NOLINTNEXTLINE(google-explicit-constructor,hicpp-explicit-conversions): tables read better without the type
+  constexpr FailureTexts(const char* text) : status(text), log(text) {}
+  constexpr FailureTexts(const char* statusText, const char* logText) : status(statusText), log(logText) {}
 };
 
 inline void fail(const Association& association, CMPIStatus* status, const FailureTexts& texts,
@@ -83,7 +83,42 @@ inline void setEnds(const Association& association, CMPIInstance* instance, cons
   CMSetProperty(instance, association.second.name, &second, CMPI_ref);
 }
 
-/// What a walk over all pairs says where it fails; a NULL status text leaves the status alone.
+/// What the factory is asked for the elements that belong to the one with a key.
+struct Search {
+  const CMPIBroker* broker;
+  const CMPIObjectPath* ref;
+  CMPIString* key;
+  const char** properties;
+  bool isObjPath;
+  CMPIStatus* status;
+};
+
+using FindRelated = unsigned short (*)(CPUObjFactory* factory, const Search& search, Instances& found);
+
+/// Asks one of the factory's navigation functions. Those of capabilities always build whole instances.
+template <auto Navigate>
+unsigned short related(CPUObjFactory* factory, const Search& of, Instances& found) {
+  using ToWholeInstances = unsigned short (CPUObjFactory::*)(const CMPIBroker*, const CMPIObjectPath*, CMPIString*,
+                                                             const char**, Instances&, CMPIStatus*);
+  if constexpr (std::is_same_v<decltype(Navigate), ToWholeInstances>) {
+    return (factory->*Navigate)(of.broker, of.ref, of.key, of.properties, found, of.status);
+  } else {
+    return (factory->*Navigate)(of.broker, of.ref, of.key, of.properties, of.isObjPath, found, of.status);
+  }
+}
+
+/// A walk over all pairs of an association: from all object paths of one class, the near ends, by the key of
+/// each to the elements at its far end.
+struct PairWalk {
+  const char* nearClass;
+  unsigned short (CPUObjFactory::*nearPaths)(const CMPIBroker*, const CMPIObjectPath*, Paths&, CMPIStatus*);
+  CountRecords expectedNear;
+  const char* key;
+  FindRelated farElements;
+  CountRecords expectedFar = nullptr;  ///< of each near end, if that is known
+};
+
+/// What a walk says where it fails.
 struct WalkTexts {
   const char* noPaths;
   FailureTexts nullNear;
@@ -92,30 +127,28 @@ struct WalkTexts {
   FailureTexts noAssociationPath;
 };
 
-/// The near ends of a walk: all object paths of one class, the key that leads on from them, and how many
-/// elements to expect at the far end of each, where that is known.
-struct NearEnds {
-  const char* objectClass;
-  unsigned short (CPUObjFactory::*allPaths)(const CMPIBroker*, const CMPIObjectPath*, Paths&, CMPIStatus*);
-  unsigned short (CPUObjFactory::*expected)() const;
-  const char* key;
-  unsigned short (CPUObjFactory::*expectedFar)() const = nullptr;
+/// For whom a walk is made.
+struct WalkRequest {
+  CPUObjFactory* factory;
+  const CMPIObjectPath* cop;
+  CMPIStatus* status;
+  const char** properties = nullptr;  ///< that the elements at the far ends shall have
 };
 
-/// Walks over every near end and, from its key, every element that `related` finds for it. Hands each
-/// pair to `link`, as a new path of the association and the paths of its two ends, until that returns
-/// false. False when the walk did not reach its end.
-template <class Related, class Link>
-bool forEachPair(const Association& association, CPUObjFactory* factory, const CMPIObjectPath* cop, CMPIStatus* status,
-                 const NearEnds& nearEnds, const WalkTexts& texts, Related related, Link link,
-                 unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
+/// Hands each pair of a walk to `link`, as a new path of the association and the paths of its two ends, until
+/// that returns false. False when the walk did not reach its end.
+template <class Link>
+bool forEachPair(const Association& association, const PairWalk& walk, const WalkTexts& texts,
+                 const WalkRequest& request, Link link, unsigned int line = __builtin_LINE(),
+                 const char* function = __builtin_FUNCTION()) {
+  const auto& [factory, cop, status, properties] = request;
   Paths nearPaths;
-  nearPaths.reserve((factory->*nearEnds.expected)());
-  if ((factory->*nearEnds.allPaths)(association.broker, cop, nearPaths, status) != 0) {
+  nearPaths.reserve((factory->*walk.expectedNear)());
+  if ((factory->*walk.nearPaths)(association.broker, cop, nearPaths, status) != 0) {
     association.events.message(LevelError, texts.noPaths, line, function);
     return false;
   }
-  const bool nearIsFirst = std::string_view(nearEnds.objectClass) == association.first.objectClass;
+  const bool nearIsFirst = std::string_view(walk.nearClass) == association.first.objectClass;
   for (CMPIObjectPath* near : counted(nearPaths)) {
     if (isNull(near)) {
       fail(association, status, texts.nullNear, line, function);
@@ -123,10 +156,11 @@ bool forEachPair(const Association& association, CPUObjFactory* factory, const C
     }
     stampPath(near, cop);
     Instances elements;
-    if (nearEnds.expectedFar != nullptr) {
-      elements.reserve((factory->*nearEnds.expectedFar)());
+    if (walk.expectedFar != nullptr) {
+      elements.reserve((factory->*walk.expectedFar)());
     }
-    if (related(stringKey(near, nearEnds.key), elements) != 0) {
+    const Search search{association.broker, cop, stringKey(near, walk.key), properties, true, status};
+    if (walk.farElements(factory, search, elements) != 0) {
       association.events.message(LevelError, texts.noRelated, line, function);
       return false;
     }
@@ -163,127 +197,28 @@ inline auto deliverName(const Association& association, const CMPIResult* result
   };
 }
 
-/// The way from a request's object to the elements of one target class.
-struct Direction {
-  const char* targetClass;
-  const char* sourceKey;
-  unsigned short (CPUObjFactory::*expected)() const;
-  unsigned short (CPUObjFactory::*navigate)(const CMPIBroker*, const CMPIObjectPath*, CMPIString*, const char**, bool,
-                                            Instances&, CMPIStatus*);
-};
-
-/// What an association request looks for, and how much of it.
-struct Search {
-  CPUObjFactory* factory;
-  const CMPIObjectPath* cop;
-  const CMPIObjectPath* target;
-  const char** properties;
-  bool isObjPath;
-  CMPIStatus* status;
-};
-
-/// The elements at the far end of a request, and the end of the association that they stand at.
-struct FarEnds {
-  Instances elements;
-  bool areFirst = false;
-};
-
-/// Finds the elements at the far end; none for a target class that neither direction leads to. False,
-/// and the direction's own text logged, when the navigation failed.
-inline bool findRelated(const Association& association, const Search& search, const Direction (&directions)[2],
-                        const char* const (&failures)[2], FarEnds& related, unsigned int line = __builtin_LINE(),
-                        const char* function = __builtin_FUNCTION()) {
-  const std::string_view targetClass = classNameOf(search.target);
-  for (std::size_t i = 0; i < std::size(directions); ++i) {
-    const Direction& direction = directions[i];
-    if (targetClass != direction.targetClass) {
-      continue;
-    }
-    related.areFirst = targetClass == association.first.objectClass;
-    related.elements.reserve((search.factory->*direction.expected)());
-    if ((search.factory->*direction.navigate)(association.broker, search.target,
-                                              stringKey(search.cop, direction.sourceKey), search.properties,
-                                              search.isObjPath, related.elements, search.status) != 0) {
-      association.events.message(LevelError, failures[i], line, function);
-      return false;
-    }
-  }
-  return true;
-}
-
 /// The association of two objects on its own path; what the broker answers when it cannot make it.
 inline CMPIInstance* newAssociation(const Association& association, const CMPIObjectPath* path,
-                                    const CMPIObjectPath* first, const CMPIObjectPath* second, const char** properties,
-                                    const char** filterKeys) {
+                                    const CMPIObjectPath* first, const CMPIObjectPath* second,
+                                    const char** properties) {
   CMPIInstance* instance = CMNewInstance(association.broker, path, nullptr);
   if (!isNull(instance)) {
-    CMSetPropertyFilter(instance, properties, filterKeys);
+    CMSetPropertyFilter(instance, properties, association.filterKeys);
     setEnds(association, instance, first, second);
   }
   return instance;
 }
 
 /// Collects each pair of a walk as an association of its own; one that the broker cannot make is left out.
-inline auto collectPairs(const Association& association, const char** properties, const char** filterKeys,
-                         Instances& instances) {
-  return [&association, properties, filterKeys, &instances](const CMPIObjectPath* path, const CMPIObjectPath* first,
-                                                            const CMPIObjectPath* second) {
-    CMPIInstance* instance = newAssociation(association, path, first, second, properties, filterKeys);
+inline auto collectPairs(const Association& association, const char** properties, Instances& instances) {
+  return [&association, properties, &instances](const CMPIObjectPath* path, const CMPIObjectPath* first,
+                                                const CMPIObjectPath* second) {
+    CMPIInstance* instance = newAssociation(association, path, first, second, properties);
     if (!isNull(instance)) {
       instances.push_back(instance);
     }
     return true;
   };
-}
-
-/// How the references of a request are built: on the association's template path, between the object
-/// that the request starts from and those at the far end. With `filterKeys` the property list filters
-/// them.
-struct ReferenceTemplate {
-  const CMPIObjectPath* source;
-  const CMPIObjectPath* path;
-  const char** properties = nullptr;
-  const char** filterKeys = nullptr;
-};
-
-/// One reference; NULL when the broker has none.
-inline CMPIInstance* newReference(const Association& association, const ReferenceTemplate& from,
-                                  const CMPIObjectPath* far, bool farIsFirst) {
-  CMPIInstance* instance = CMNewInstance(association.broker, from.path, nullptr);
-  if (isNull(instance)) {
-    return nullptr;
-  }
-  if (from.filterKeys != nullptr) {
-    CMSetPropertyFilter(instance, from.properties, from.filterKeys);
-  }
-  setEnds(association, instance, farIsFirst ? far : from.source, farIsFirst ? from.source : far);
-  return instance;
-}
-
-/// Hands the reference to each related element to `use`, with the element's path; what could not be
-/// built is left out.
-template <class Use>
-void forEachReference(const Association& association, const ReferenceTemplate& from, FarEnds& related, Use use) {
-  for (const CMPIInstance* element : counted(related.elements)) {
-    CMPIObjectPath* far = pathOf(element);
-    if (isNull(far)) {
-      continue;
-    }
-    stampPath(far, from.source);
-    CMPIInstance* reference = newReference(association, from, far, related.areFirst);
-    if (!isNull(reference)) {
-      use(reference, far);
-    }
-  }
-}
-
-/// Delivers a reference's own path, in the namespace of `cop` and with this system's host name.
-inline void deliverStampedPathOf(const CMPIResult* result, const CMPIInstance* reference, const CMPIObjectPath* cop) {
-  CMPIObjectPath* path = pathOf(reference);
-  if (!isNull(path)) {
-    stampPath(path, cop);
-    CMReturnObjectPath(result, path);
-  }
 }
 
 /// Delivers the first instance whose path `matches`; instances that could not be built do not count.
@@ -308,10 +243,12 @@ inline void deliverPathsOf(const CMPIResult* result, Instances& elements) {
   }
 }
 
-/// The same, each in the namespace of `cop` and with this system's host name.
-inline void deliverStampedPathsOf(const CMPIResult* result, Instances& elements, const CMPIObjectPath* cop) {
-  for (const CMPIInstance* element : counted(elements)) {
-    deliverStampedPathOf(result, element, cop);
+/// Delivers an instance's own path, in the namespace of `cop` and with this system's host name.
+inline void deliverStampedPathOf(const CMPIResult* result, const CMPIInstance* instance, const CMPIObjectPath* cop) {
+  CMPIObjectPath* path = pathOf(instance);
+  if (!isNull(path)) {
+    stampPath(path, cop);
+    CMReturnObjectPath(result, path);
   }
 }
 

@@ -12,31 +12,10 @@ static const Association association{
 CORVANE_REFUSED_OPERATIONS(CPUAssociatedCacheMemory)
 CORVANE_ASSOCIATION_CLEANUP(CPUAssociatedCacheMemory)
 
+unsigned short CPUAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* cop, const char** properties,
+                                                     std::vector<CMPIInstance*>& instances);
+
 namespace {
-
-constexpr NearEnds caches{cpuMemoryClass, &CPUObjFactory::getAllCPUMemoryCMPIObjPaths,
-                          &CPUObjFactory::getNumberOfMemInstances, "DeviceID"};
-
-constexpr WalkTexts instanceTexts{
-    "***Can't get ObjectPaths.             Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is                 NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
-    "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
-    {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
-     "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."}};
-
-constexpr WalkTexts nameTexts{
-    "getAllCPUMemoryCMPIObjPaths Failed",
-    {"CMPIObjectPath is NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
-    "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
-    {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
-    {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass.",
-     "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass."}};
-
-constexpr Direction directions[] = {{cpuProcessorClass, "DeviceID", &CPUObjFactory::getNumberOfProcInstances,
-                                     &CPUObjFactory::getProcessorRefByMemoryHandle},
-                                    {cpuMemoryClass, "DeviceID", &CPUObjFactory::getNumberOfMemInstances,
-                                     &CPUObjFactory::getCPUMemoryRefByProcessorHandle}};
 
 CPUObjFactory* factoryOfProcessorsAndCaches() {
   return CPUObjFactory::getFactoryInstance(true, true, false);
@@ -48,201 +27,100 @@ bool coresAreKnown(const CPUObjFactory* factory) {
   return factory->getNumberOfProcCoreInstances() != 0;
 }
 
-/// Finds the processor of a cache, for a walk over all of them.
-auto processorOf(CPUObjFactory* factory, const CMPIObjectPath* cop, CMPIStatus* status) {
-  return [=](CMPIString* key, Instances& processors) {
-    return factory->getProcessorRefByMemoryHandle(broker, cop, key, nullptr, true, processors, status);
-  };
-}
+constexpr CacheAssociation provider{
+    .association = association,
+    .factory = factoryOfProcessorsAndCaches,
+    .isSuspended = coresAreKnown,
+    .makeInstances = CPUAssociatedCacheMemoryCMPIInstances,
+
+    .walk = {.nearClass = cpuMemoryClass,
+             .nearPaths = &CPUObjFactory::getAllCPUMemoryCMPIObjPaths,
+             .expectedNear = &CPUObjFactory::getNumberOfMemInstances,
+             .key = "DeviceID",
+             .farElements = related<&CPUObjFactory::getProcessorRefByMemoryHandle>},
+    .instanceTexts =
+        {.noPaths = "***Can't get ObjectPaths.             Exiting EnumerateInstanceNames***",
+         .nullNear = {"CMPIObjectPath is                 NULL for CPUMemory", "CMPIObjectPath is NULL for CPUMemory"},
+         .noRelated =
+             "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
+         .nullFar = {"CMPIObjectPath is                     NULL for CPUProcessor",
+                     "CMPIObjectPath is NULL for CPUProcessor"},
+         .noAssociationPath = {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
+                               "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."}},
+    .nameTexts =
+        {.noPaths = "getAllCPUMemoryCMPIObjPaths Failed",
+         .nullNear = "CMPIObjectPath is NULL for CPUMemory",
+         .noRelated =
+             "***Can't get Processor ObjectPaths based on passed in Mem                 DeviceID. Exiting EnumerateInstanceNames***",
+         .nullFar = "CMPIObjectPath is NULL for CPUProcessor",
+         .noAssociationPath = "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemoryClass."},
+
+    .directions = {{cpuProcessorClass, "DeviceID", &CPUObjFactory::getNumberOfProcInstances,
+                    related<&CPUObjFactory::getProcessorRefByMemoryHandle>},
+                   {cpuMemoryClass, "DeviceID", &CPUObjFactory::getNumberOfMemInstances,
+                    related<&CPUObjFactory::getCPUMemoryRefByProcessorHandle>}},
+    .associatorsFailed = {"***Can't get Processor instances related to Memory.                 Exiting Associators***",
+                          "***Can't get Memory instances related to Processor.                 Exiting Associators***"},
+    .associatorNamesFailed =
+        {"***Can't get processor ObjPaths related to Processor.                 Exiting AssociatorNames***",
+         "***Can't get Memory ObjectPaths related to Processor.                 Exiting AssociatorNames***"},
+    .referencesFailed = {"***Can't get Processor instances                 Exiting References***",
+                         "***Can't get Memory instances.                 Exiting References***"},
+    .referenceNamesFailed = {"***Can't get Processor ObjPaths.                 Exiting ReferenceNames***",
+                             "***Can't get Memory ObjPaths.                 Exiting ReferenceNames***"},
+
+    .tracesClasses = false,
+    .referencesDescribe = false,
+};
 
 }  // namespace
 
 unsigned short CPUAssociatedCacheMemoryCMPIInstances(const CMPIObjectPath* cop, const char** properties,
                                                      std::vector<CMPIInstance*>& instances) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (coresAreKnown(factory)) {
-    events.providerExit();
-    return 0;
-  }
-  const auto link = [&, function = __func__](const CMPIObjectPath* path, const CMPIObjectPath* cache,
-                                             const CMPIObjectPath* processor) {
-    return appendCacheAssociation(association, factory, path, cache, processor, properties, instances, &status,
-                                  __builtin_LINE(), function);
-  };
-  const bool complete =
-      forEachPair(association, factory, cop, &status, caches, instanceTexts, processorOf(factory, cop, &status), link);
-  events.providerExit();
-  return complete ? 0 : 1;
+  return makeInstances(provider, cop, properties, instances);
 }
 
 CMPIStatus CPUAssociatedCacheMemory_EnumInstances(CMPIInstanceMI* /*mi*/, const CMPIContext* /*context*/,
                                                   const CMPIResult* result, const CMPIObjectPath* cop,
                                                   const char** properties) {
-  events.providerEntry();
-  Instances instances;
-  if (CPUAssociatedCacheMemoryCMPIInstances(cop, properties, instances) == 0) {
-    deliver(result, instances);
-  }
-  CMReturnDone(result);
-  events.providerExit();
-  return succeeded();
+  return enumInstances(provider, {result, cop, properties});
 }
 
 CMPIStatus CPUAssociatedCacheMemory_EnumInstanceNames(CMPIInstanceMI* /*mi*/, const CMPIContext* /*context*/,
                                                       const CMPIResult* result, const CMPIObjectPath* cop) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (!coresAreKnown(factory)) {
-    forEachPair(association, factory, cop, &status, caches, nameTexts, processorOf(factory, cop, &status),
-                deliverName(association, result));
-  }
-  events.providerExit();
-  CMReturnDone(result);
-  return status;
+  return enumInstanceNames(provider, {result, cop});
 }
 
 CMPIStatus CPUAssociatedCacheMemory_GetInstance(CMPIInstanceMI* /*mi*/, const CMPIContext* /*context*/,
                                                 const CMPIResult* result, const CMPIObjectPath* cop,
                                                 const char** properties) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  Instances instances;
-  if (!lacksKeys(association, cop, &status) && CPUAssociatedCacheMemoryCMPIInstances(cop, properties, instances) == 0) {
-    deliverMatch(result, instances, [&](CMPIObjectPath* path) {
-      stampPath(path, cop);
-      return isObjPathsEqualWithLog(broker, cop, path, true);
-    });
-  }
-  CMReturnDone(result);
-  events.providerExit();
-  return status;
+  return getInstance(provider, {result, cop, properties});
 }
-
-// The association operations never call CMReturnDone.
 
 CMPIStatus CPUAssociatedCacheMemory_Associators(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                 const CMPIResult* result, const CMPIObjectPath* cop,
                                                 const char* assocClass, const char* resultClass, const char* /*role*/,
                                                 const char* /*resultRole*/, const char** properties) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (coresAreKnown(factory)) {
-    events.providerExit();
-    return status;
-  }
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    fail(association, &status, "Object Path is NULL in Associators.");
-    return status;
-  }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
-                   {"***Can't get Processor instances related to Memory.                 Exiting Associators***",
-                    "***Can't get Memory instances related to Processor.                 Exiting Associators***"},
-                   related)) {
-    return status;
-  }
-  deliver(result, related.elements);
-  events.providerExit();
-  return status;
+  return associators(provider, {result, cop, properties, assocClass, resultClass});
 }
 
 CMPIStatus CPUAssociatedCacheMemory_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                     const CMPIResult* result, const CMPIObjectPath* cop,
                                                     const char* assocClass, const char* resultClass,
                                                     const char* /*role*/, const char* /*resultRole*/) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (coresAreKnown(factory)) {
-    events.providerExit();
-    return status;
-  }
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    fail(association, &status, "Object Path is NULL in AssociatorNames.");
-    return status;
-  }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions,
-                   {"***Can't get processor ObjPaths related to Processor.                 Exiting AssociatorNames***",
-                    "***Can't get Memory ObjectPaths related to Processor.                 Exiting AssociatorNames***"},
-                   related)) {
-    return status;
-  }
-  deliverStampedPathsOf(result, related.elements, cop);
-  events.providerExit();
-  return status;
+  return associatorNames(provider, {result, cop, nullptr, assocClass, resultClass});
 }
 
 CMPIStatus CPUAssociatedCacheMemory_References(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                const CMPIResult* result, const CMPIObjectPath* cop,
-                                               const char* /*resultClass*/, const char* /*role*/,
-                                               const char** properties) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (coresAreKnown(factory)) {
-    events.providerExit();
-    return status;
-  }
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    fail(association, &status, "Object Path is NULL in References.");
-    return status;
-  }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions,
-                   {"***Can't get Processor instances                 Exiting References***",
-                    "***Can't get Memory instances.                 Exiting References***"},
-                   related)) {
-    return status;
-  }
-  forEachReference(
-      association, {cop, templatePath, properties, cacheAssociationKeys}, related,
-      [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
-  events.providerExit();
-  return status;
+                                               const char* resultClass, const char* /*role*/, const char** properties) {
+  return references(provider, {result, cop, properties, nullptr, resultClass});
 }
 
 CMPIStatus CPUAssociatedCacheMemory_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                    const CMPIResult* result, const CMPIObjectPath* cop,
                                                    const char* /*resultClass*/, const char* /*role*/) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCaches();
-  if (coresAreKnown(factory)) {
-    events.providerExit();
-    return status;
-  }
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    fail(association, &status, "Object Path is NULL in ReferenceNames.");
-    return status;
-  }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions,
-                   {"***Can't get Processor ObjPaths.                 Exiting ReferenceNames***",
-                    "***Can't get Memory ObjPaths.                 Exiting ReferenceNames***"},
-                   related)) {
-    return status;
-  }
-  forEachReference(association, {cop, templatePath, nullptr, cacheAssociationKeys}, related,
-                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
-                     deliverStampedPathOf(result, reference, cop);
-                   });
-  events.providerExit();
-  return status;
+  return referenceNames(provider, {result, cop});
 }
 
 static const CMPIInstanceMIFT instMIFT__ = {

@@ -1,4 +1,4 @@
-#include "AssociationSteps.h"
+#include "Navigation.h"
 
 namespace Tarn::CPUProvider {
 
@@ -11,16 +11,20 @@ static const Association association{events,
                                      cpuConcreteComponentClass,
                                      {"GroupComponent", cpuProcessorClass},
                                      {"PartComponent", cpuProcessorCoreClass}};
-static const char* filterKeys[] = {"GroupComponent", "PartComponent", nullptr};
 
 CORVANE_REFUSED_OPERATIONS(CPUConcreteComponent)
 CORVANE_ASSOCIATION_CLEANUP(CPUConcreteComponent)
 
 namespace {
 
-constexpr NearEnds processors{cpuProcessorClass, &CPUObjFactory::getAllCPUProcCMPIObjPaths,
-                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID",
-                              &CPUObjFactory::getNumberOfProcCoreInstances};
+constexpr PairWalk coresOfProcessors{
+    .nearClass = cpuProcessorClass,
+    .nearPaths = &CPUObjFactory::getAllCPUProcCMPIObjPaths,
+    .expectedNear = &CPUObjFactory::getNumberOfProcInstances,
+    .key = "DeviceID",
+    .farElements = related<&CPUObjFactory::getProcessorCoreRefByProcHandle>,
+    .expectedFar = &CPUObjFactory::getNumberOfProcCoreInstances,
+};
 
 constexpr WalkTexts instanceTexts{
     "***Can't get ConcreteComponent ObjectPaths.             Exiting EnumerateInstanceNames***",
@@ -34,25 +38,18 @@ constexpr WalkTexts nameTexts{
     {"CMPIObjectPath is                 NULL for Processor", "CMPIObjectPath is NULL for Processor"},
     "Can't get ObjectPaths for Processor Core",
     {"CMPIObjectPath is                     NULL for Processor Cores", "CMPIObjectPath is NULL for Processor Cores"},
-    {"Create CMPIObjectPath failed for ConcreteComponent", "Create CMPIObjectPath failed for ConcreteComponent"}};
+    "Create CMPIObjectPath failed for ConcreteComponent"};
 
 constexpr Direction directions[] = {{cpuProcessorClass, "InstanceID", &CPUObjFactory::getNumberOfProcInstances,
-                                     &CPUObjFactory::getProcessorRefByProcCoreHandle},
+                                     related<&CPUObjFactory::getProcessorRefByProcCoreHandle>},
                                     {cpuProcessorCoreClass, "DeviceID", &CPUObjFactory::getNumberOfProcCoreInstances,
-                                     &CPUObjFactory::getProcessorCoreRefByProcHandle}};
-// The second names the function of the other direction, and always has.
-constexpr const char* navigationFailures[] = {"getProcessorRefByProcCoreHandle Failed for InstanceID",
-                                              "getProcessorRefByProcCoreHandle Failed for DeviceID"};
+                                     related<&CPUObjFactory::getProcessorCoreRefByProcHandle>}};
+// The second names the function of the other direction. Log filters match this text: do not correct it.
+constexpr DirectionTexts navigationFailures = {"getProcessorRefByProcCoreHandle Failed for InstanceID",
+                                               "getProcessorRefByProcCoreHandle Failed for DeviceID"};
 
 CPUObjFactory* factoryOfProcessorsAndCores() {
   return CPUObjFactory::getFactoryInstance(true, false, true);
-}
-
-/// Finds the cores of a processor, for a walk over all of them.
-auto coresOf(CPUObjFactory* factory, const CMPIObjectPath* cop, CMPIStatus* status) {
-  return [=](CMPIString* key, Instances& cores) {
-    return factory->getProcessorCoreRefByProcHandle(broker, cop, key, nullptr, true, cores, status);
-  };
 }
 
 }  // namespace
@@ -61,10 +58,9 @@ unsigned short ConcreteComponentCMPIInstances(const CMPIObjectPath* cop, const c
                                               std::vector<CMPIInstance*>& instances) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
   const bool complete =
-      forEachPair(association, factory, cop, &status, processors, instanceTexts, coresOf(factory, cop, &status),
-                  collectPairs(association, properties, filterKeys, instances));
+      forEachPair(association, coresOfProcessors, instanceTexts, {factoryOfProcessorsAndCores(), cop, &status},
+                  collectPairs(association, properties, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -86,8 +82,7 @@ CMPIStatus CPUConcreteComponent_EnumInstanceNames(CMPIInstanceMI* /*mi*/, const 
                                                   const CMPIResult* result, const CMPIObjectPath* cop) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  forEachPair(association, factory, cop, &status, processors, nameTexts, coresOf(factory, cop, &status),
+  forEachPair(association, coresOfProcessors, nameTexts, {factoryOfProcessorsAndCores(), cop, &status},
               deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
@@ -116,22 +111,14 @@ CMPIStatus CPUConcreteComponent_Associators(CMPIAssociationMI* /*mi*/, const CMP
                                             const char* resultClass, const char* /*role*/, const char* /*resultRole*/,
                                             const char** properties) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.message(LevelError, "Object Path is NULL in Associations.");
-    return status;
+  Navigation navigation(association, factoryOfProcessorsAndCores(), cop);
+  if (!navigation.findTarget(assocClass, resultClass, {nullptr, "Object Path is NULL in Associations."}) ||
+      !navigation.findElements(directions, properties, false, navigationFailures)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, properties, false, &status}, directions, navigationFailures,
-                   related)) {
-    return status;
-  }
-  deliver(result, related.elements);
+  deliver(result, navigation.elements);
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUConcreteComponent_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
@@ -139,76 +126,50 @@ CMPIStatus CPUConcreteComponent_AssociatorNames(CMPIAssociationMI* /*mi*/, const
                                                 const char* assocClass, const char* resultClass, const char* /*role*/,
                                                 const char* /*resultRole*/) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.message(LevelError, "Object Path is NULL in AssociatorNames.");
-    return status;
+  Navigation navigation(association, factoryOfProcessorsAndCores(), cop);
+  if (!navigation.findTarget(assocClass, resultClass, {nullptr, "Object Path is NULL in AssociatorNames."}) ||
+      !navigation.findElements(directions, nullptr, true, navigationFailures)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
-                   related)) {
-    return status;
-  }
-  deliverPathsOf(result, related.elements);
+  deliverPathsOf(result, navigation.elements);
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUConcreteComponent_References(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                            const CMPIResult* result, const CMPIObjectPath* cop,
                                            const char* /*resultClass*/, const char* /*role*/, const char** properties) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    events.message(LevelError, "Object Path is NULL in References.");
-    return status;
+  Navigation navigation(association, factoryOfProcessorsAndCores(), cop);
+  if (!navigation.findTargetOfReferences({nullptr, "Object Path is NULL in References."}) ||
+      !navigation.findElements(directions, nullptr, true, navigationFailures)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
-                   related)) {
-    return status;
-  }
-  forEachReference(
-      association, {cop, templatePath, properties, filterKeys}, related,
+  navigation.filterReferences(properties);
+  navigation.forEachReference(
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUConcreteComponent_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                const CMPIResult* result, const CMPIObjectPath* cop,
                                                const char* /*resultClass*/, const char* /*role*/) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessorsAndCores();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    events.message(LevelError, "Object Path is NULL in ReferenceNames.");
-    return status;
+  Navigation navigation(association, factoryOfProcessorsAndCores(), cop);
+  if (!navigation.findTargetOfReferences({nullptr, "Object Path is NULL in ReferenceNames."}) ||
+      !navigation.findElements(directions, nullptr, true, navigationFailures)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(association, {factory, cop, target, nullptr, true, &status}, directions, navigationFailures,
-                   related)) {
-    return status;
-  }
-  forEachReference(association, {cop, templatePath, nullptr, filterKeys}, related,
-                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
-                     const CMPIObjectPath* path = pathOf(reference);
-                     if (!isNull(path)) {
-                       CMReturnObjectPath(result, path);
-                     }
-                   });
+  navigation.filterReferences(nullptr);
+  navigation.forEachReference([&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+    const CMPIObjectPath* path = pathOf(reference);
+    if (!isNull(path)) {
+      CMReturnObjectPath(result, path);
+    }
+  });
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 static const CMPIInstanceMIFT instMIFT__ = {

@@ -1,4 +1,4 @@
-#include "AssociationSteps.h"
+#include "Navigation.h"
 
 namespace Tarn::CPUProvider {
 
@@ -6,18 +6,27 @@ static const CMPIBroker* broker = nullptr;
 static const std::string loggerCPUEleCap = "Corvane.CPUElementCapabilitiesProvider";
 static constexpr EventLog events{loggerCPUEleCap, "CPUElementCapabilitiesProvider.cpp", LevelInfo};
 
-static const Association association{
-    events, broker, cpuElementCapClass, {"ManagedElement", cpuProcessorClass}, {"Capabilities", cpuProcessorCapClass}};
-// Not this association's own references: property lists have always been filtered with these.
-static const char* filterKeys[] = {"Antecedent", "Dependent", nullptr};
+// The keys that property lists are filtered with are another association's: what clients receive depends on
+// them, so they stay.
+static const Association association{events,
+                                     broker,
+                                     cpuElementCapClass,
+                                     {"ManagedElement", cpuProcessorClass},
+                                     {"Capabilities", cpuProcessorCapClass},
+                                     {"Antecedent", "Dependent", nullptr}};
 
 CORVANE_REFUSED_OPERATIONS(CPUElementCapabilities)
 CORVANE_ASSOCIATION_CLEANUP(CPUElementCapabilities)
 
 namespace {
 
-constexpr NearEnds processors{cpuProcessorClass, &CPUObjFactory::getAllCPUProcCMPIObjPaths,
-                              &CPUObjFactory::getNumberOfProcInstances, "DeviceID"};
+constexpr PairWalk capabilitiesOfProcessors{
+    .nearClass = cpuProcessorClass,
+    .nearPaths = &CPUObjFactory::getAllCPUProcCMPIObjPaths,
+    .expectedNear = &CPUObjFactory::getNumberOfProcInstances,
+    .key = "DeviceID",
+    .farElements = related<&CPUObjFactory::getProcessorCapRefByProcHandle>,
+};
 
 constexpr FailureTexts nullProcessor{"CMPIObjectPath is                 NULL for Processor",
                                      "CMPIObjectPath is NULL for Processor"};
@@ -35,32 +44,14 @@ constexpr WalkTexts nameTexts{"getAllCPUProcCMPIObjPaths Failed", nullProcessor,
                               "getProcessorCapRefByProcHandle Failed for DeviceId", nullCapabilities,
                               noAssociationPath};
 
+constexpr Direction directions[] = {{cpuProcessorCapClass, "DeviceID", &CPUObjFactory::getNumberOfProcInstances,
+                                     related<&CPUObjFactory::getProcessorCapRefByProcHandle>},
+                                    {cpuProcessorClass, "InstanceID", &CPUObjFactory::getNumberOfProcInstances,
+                                     related<&CPUObjFactory::getProcessorRefByProcCapHandle>}};
+constexpr DirectionTexts silently = {nullptr, nullptr};
+
 CPUObjFactory* factoryOfProcessors() {
   return CPUObjFactory::getFactoryInstance(true, false, false);
-}
-
-/// Finds the capabilities of a processor, for a walk over all of them.
-auto capabilitiesOf(CPUObjFactory* factory, const CMPIObjectPath* cop, const char** properties, CMPIStatus* status) {
-  return [=](CMPIString* key, Instances& capabilities) {
-    return factory->getProcessorCapRefByProcHandle(broker, cop, key, properties, capabilities, status);
-  };
-}
-
-/// The processor of capabilities, or the capabilities of a processor. False when the navigation failed.
-bool findRelated(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPIObjectPath* target,
-                 const char** properties, FarEnds& related, CMPIStatus* status) {
-  const std::string_view targetClass = classNameOf(target);
-  related.areFirst = targetClass == association.first.objectClass;
-  related.elements.reserve(factory->getNumberOfProcInstances());
-  if (targetClass == cpuProcessorCapClass) {
-    return factory->getProcessorCapRefByProcHandle(broker, target, stringKey(cop, "DeviceID"), properties,
-                                                   related.elements, status) == 0;
-  }
-  if (targetClass == cpuProcessorClass) {
-    return factory->getProcessorRefByProcCapHandle(broker, target, stringKey(cop, "InstanceID"), properties,
-                                                   related.elements, status) == 0;
-  }
-  return true;
 }
 
 }  // namespace
@@ -69,10 +60,9 @@ unsigned short ElementCapabilitiesCMPIInstances(const CMPIObjectPath* cop, const
                                                 std::vector<CMPIInstance*>& instances) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const bool complete = forEachPair(association, factory, cop, &status, processors, instanceTexts,
-                                    capabilitiesOf(factory, cop, properties, &status),
-                                    collectPairs(association, properties, filterKeys, instances));
+  const bool complete =
+      forEachPair(association, capabilitiesOfProcessors, instanceTexts,
+                  {factoryOfProcessors(), cop, &status, properties}, collectPairs(association, properties, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -94,8 +84,7 @@ CMPIStatus CPUElementCapabilities_EnumInstanceNames(CMPIInstanceMI* /*mi*/, cons
                                                     const CMPIResult* result, const CMPIObjectPath* cop) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  forEachPair(association, factory, cop, &status, processors, nameTexts, capabilitiesOf(factory, cop, nullptr, &status),
+  forEachPair(association, capabilitiesOfProcessors, nameTexts, {factoryOfProcessors(), cop, &status},
               deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
@@ -124,21 +113,14 @@ CMPIStatus CPUElementCapabilities_Associators(CMPIAssociationMI* /*mi*/, const C
                                               const char* assocClass, const char* resultClass, const char* /*role*/,
                                               const char* /*resultRole*/, const char** properties) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.message(LevelError, "Object Path is NULL in Associations.");
-    return status;
+  Navigation navigation(association, factoryOfProcessors(), cop);
+  if (!navigation.findTarget(assocClass, resultClass, {nullptr, "Object Path is NULL in Associations."}) ||
+      !navigation.findElements(directions, properties, false, silently)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(factory, cop, target, properties, related, &status)) {
-    return status;
-  }
-  deliver(result, related.elements);
+  deliver(result, navigation.elements);
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUElementCapabilities_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
@@ -146,21 +128,14 @@ CMPIStatus CPUElementCapabilities_AssociatorNames(CMPIAssociationMI* /*mi*/, con
                                                   const char* assocClass, const char* resultClass, const char* /*role*/,
                                                   const char* /*resultRole*/) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.message(LevelError, "Object Path is NULL in AssociatorNames.");
-    return status;
+  Navigation navigation(association, factoryOfProcessors(), cop);
+  if (!navigation.findTarget(assocClass, resultClass, {nullptr, "Object Path is NULL in AssociatorNames."}) ||
+      !navigation.findElements(directions, nullptr, true, silently)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(factory, cop, target, nullptr, related, &status)) {
-    return status;
-  }
-  deliverPathsOf(result, related.elements);
+  deliverPathsOf(result, navigation.elements);
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUElementCapabilities_References(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
@@ -168,53 +143,35 @@ CMPIStatus CPUElementCapabilities_References(CMPIAssociationMI* /*mi*/, const CM
                                              const char* /*resultClass*/, const char* /*role*/,
                                              const char** /*properties*/) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    events.message(LevelError, "Object Path is NULL in References.");
-    return status;
+  Navigation navigation(association, factoryOfProcessors(), cop);
+  if (!navigation.findTargetOfReferences({nullptr, "Object Path is NULL in References."}) ||
+      !navigation.findElements(directions, nullptr, true, silently)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(factory, cop, target, nullptr, related, &status)) {
-    return status;
-  }
-  forEachReference(
-      association, {cop, templatePath}, related,
+  navigation.forEachReference(
       [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) { CMReturnInstance(result, reference); });
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 CMPIStatus CPUElementCapabilities_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIContext* /*context*/,
                                                  const CMPIResult* result, const CMPIObjectPath* cop,
                                                  const char* /*resultClass*/, const char* /*role*/) {
   events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    events.message(LevelError, "Object Path is NULL in ReferenceNames.");
-    return status;
+  Navigation navigation(association, factoryOfProcessors(), cop);
+  if (!navigation.findTargetOfReferences({nullptr, "Object Path is NULL in ReferenceNames."}) ||
+      !navigation.findElements(directions, nullptr, true, silently)) {
+    return navigation.status;
   }
-  FarEnds related;
-  if (!findRelated(factory, cop, target, nullptr, related, &status)) {
-    return status;
-  }
-  forEachReference(association, {cop, templatePath}, related,
-                   [&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
-                     CMPIObjectPath* path = pathOf(reference);
-                     if (!isNull(path)) {
-                       CMSetNameSpace(path, namespaceOf(cop));
-                       CMReturnObjectPath(result, path);
-                     }
-                   });
+  navigation.forEachReference([&](const CMPIInstance* reference, const CMPIObjectPath* /*far*/) {
+    CMPIObjectPath* path = pathOf(reference);
+    if (!isNull(path)) {
+      CMSetNameSpace(path, namespaceOf(cop));
+      CMReturnObjectPath(result, path);
+    }
+  });
   events.providerExit();
-  return status;
+  return navigation.status;
 }
 
 static const CMPIInstanceMIFT instMIFT__ = {

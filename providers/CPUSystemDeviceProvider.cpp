@@ -1,6 +1,7 @@
 #include <algorithm>
 
-#include "AssociationSteps.h"
+#include "ComputerSystems.h"
+#include "Navigation.h"
 
 namespace Tarn::CPUProvider {
 
@@ -13,7 +14,6 @@ static const Association association{events,
                                      cpuSystemDeviceClass,
                                      {"GroupComponent", computerSystemClass},
                                      {"PartComponent", cpuProcessorClass}};
-static const char* filterKeys[] = {"GroupComponent", "PartComponent", nullptr};
 
 CORVANE_REFUSED_OPERATIONS(CPUSystemDevice)
 CORVANE_ASSOCIATION_CLEANUP(CPUSystemDevice)
@@ -24,112 +24,51 @@ CPUObjFactory* factoryOfProcessors() {
   return CPUObjFactory::getFactoryInstance(true, false, false);
 }
 
-// The computer system is another provider's: its names and instances come from the broker. Brokers
-// answer a failed call with a failing status, and then with an enumeration or without one. The static is
-// read before the up-call: during it, a registration may write it.
-
-/// Logs and returns false when the broker's answer is a failure.
-bool answered(const CMPIStatus& status, unsigned int line = __builtin_LINE(),
-              const char* function = __builtin_FUNCTION()) {
-  if (status.rc == CMPI_RC_OK) {
-    return true;
-  }
-  events.message(LevelError, "Call to CBEnumInstances of target Class Failed.", line, function);
-  return false;
-}
-
-CMPIEnumeration* enumerateSystemNames(const CMPIContext* context, const CMPIObjectPath* systemClass,
-                                      CMPIStatus* status) {
-  return upCall([&, caller = broker] { return CBEnumInstanceNames(caller, context, systemClass, status); });
-}
-
-CMPIEnumeration* enumerateSystems(const CMPIContext* context, const CMPIObjectPath* systemClass, CMPIStatus* status) {
-  return upCall([&, caller = broker] { return CBEnumInstances(caller, context, systemClass, nullptr, status); });
-}
-
-/// Hands each element of an enumeration, an instance or a path, to `handle`, until that returns false. What
-/// the broker fails to give is left out; one that has given nothing for very long would never come to the end,
-/// and is not asked on.
-template <class Element, class Handle>
-bool forEach(const CMPIEnumeration* enumeration, Element* CMPIValue::*kind, Handle handle,
-             const char* function = __builtin_FUNCTION()) {
-  constexpr int patience = 1000;
-  if (isNull(enumeration)) {
-    return true;
-  }
-  int callsInVain = 0;
-  while (CMHasNext(enumeration, nullptr) != 0) {
-    const CMPIData data = CMGetNext(enumeration, nullptr);
-    if (hasValue(data) && !isNull(data.value.*kind)) {
-      callsInVain = 0;
-      if (!handle(data.value.*kind)) {
-        return false;
-      }
-    } else if (++callsInVain == patience) {
-      events.message(LevelError, "1000 calls in a row gave no computer system: the enumeration is given up",
-                     __builtin_LINE(), function);
-      break;
-    }
+/// All processors' paths; false, and `failure` logged, when the factory has none.
+bool findProcessors(CPUObjFactory* factory, const CMPIObjectPath* ref, Paths& processors, CMPIStatus* status,
+                    const char* failure, const char* function) {
+  processors.reserve(factory->getNumberOfProcInstances());
+  if (factory->getAllCPUProcCMPIObjPaths(broker, ref, processors, status) != 0) {
+    events.message(LevelError, failure, __builtin_LINE(), function);
+    return false;
   }
   return true;
 }
 
-/// Whether a request's result class leaves room for elements of the target class: it names that class or
-/// its parent.
-bool leavesRoomFor(std::string_view targetClass, const char* resultClass) {
-  struct Row {
-    std::string_view targetClass;
-    std::string_view parent;
-  };
-  constexpr Row rows[] = {{computerSystemClass, "CIM_ComputerSystem"}, {cpuProcessorClass, "CIM_Processor"}};
-  const Row* row = std::ranges::find(rows, targetClass, &Row::targetClass);
-  return resultClass == nullptr || row == std::end(rows) || equalIgnoringCase(resultClass, row->targetClass) ||
-         equalIgnoringCase(resultClass, row->parent);
-}
+/// What a walk says where it fails.
+struct SystemWalkTexts {
+  FailureTexts nullProcessor;
+  FailureTexts noAssociationPath;
+};
 
-/// Traced under the call that yields it, which is what this variable has always been called.
-std::string_view tracedClassOf(const CMPIObjectPath* target, unsigned int line = __builtin_LINE(),
-                               const char* function = __builtin_FUNCTION()) {
-  const char* name = classNameOf(target);
-  events.variable("((targetClass)->ft->getCharPtr((targetClass),(&rc)))", name, line, function);
-  return name;
-}
-
-/// Hands every pair of a computer system and a processor to `link`, as a new path of the association and
-/// the paths of its two ends, until that returns false.
-/// The status is the broker's when its answer was a failure. False when the walk did not reach its end.
+/// Hands every pair of a computer system and a processor to `link`, as a new path of the association and the
+/// paths of its two ends, until that returns false. False when the walk did not reach its end; the status is
+/// the broker's when its answer was a failure.
 template <class Link>
-bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStatus* status,
-                 const FailureTexts& nullProcessor, const FailureTexts& noAssociationPath, Link link,
-                 const char* function = __builtin_FUNCTION()) {
+bool forEachSystemAndProcessor(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStatus* status,
+                               const SystemWalkTexts& texts, Link link, const char* function = __builtin_FUNCTION()) {
   CPUObjFactory* factory = factoryOfProcessors();
   const CMPIObjectPath* systemClass = CMNewObjectPath(broker, namespaceOf(cop), computerSystemClass, nullptr);
   if (isNull(systemClass)) {
     fail(association, status,
-         FailureTexts{"Create CMPIObjectPath failed.", "Create CMPIObjectPath failed for ComputerSystemClass."},
-         __builtin_LINE(), function);
-    return false;
-  }
-  const CMPIEnumeration* systems = enumerateSystemNames(context, systemClass, status);
-  if (!answered(*status, __builtin_LINE(), function)) {
+         {"Create CMPIObjectPath failed.", "Create CMPIObjectPath failed for ComputerSystemClass."}, __builtin_LINE(),
+         function);
     return false;
   }
   const auto linkProcessors = [&](const CMPIObjectPath* system) {
     Paths processors;
-    processors.reserve(factory->getNumberOfProcInstances());
-    if (factory->getAllCPUProcCMPIObjPaths(broker, cop, processors, status) != 0) {
-      events.message(LevelError, "getAllCPUProcCMPIObjPaths Failed", __builtin_LINE(), function);
+    if (!findProcessors(factory, cop, processors, status, "getAllCPUProcCMPIObjPaths Failed", function)) {
       return false;
     }
     for (CMPIObjectPath* processor : counted(processors)) {
       if (isNull(processor)) {
-        fail(association, status, nullProcessor, __builtin_LINE(), function);
+        fail(association, status, texts.nullProcessor, __builtin_LINE(), function);
         return false;
       }
       stampPath(processor, cop);
       CMPIObjectPath* path = newAssociationPath(association, cop);
       if (isNull(path)) {
-        fail(association, status, noAssociationPath, __builtin_LINE(), function);
+        fail(association, status, texts.noAssociationPath, __builtin_LINE(), function);
         return false;
       }
       if (!link(path, system, processor)) {
@@ -138,7 +77,7 @@ bool forEachPair(const CMPIObjectPath* cop, const CMPIContext* context, CMPIStat
     }
     return true;
   };
-  return forEach(systems, &CMPIValue::ref, linkProcessors, function);
+  return forEachSystemName(association, {context, systemClass, status}, linkProcessors, __builtin_LINE(), function);
 }
 
 }  // namespace
@@ -147,13 +86,13 @@ unsigned short CPUSystemDeviceCMPIInstances(const CMPIObjectPath* cop, const cha
                                             std::vector<CMPIInstance*>& instances) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  const bool complete = forEachPair(
+  const bool complete = forEachSystemAndProcessor(
       cop, ctx, &status,
-      {"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
-      // The words of another association, as they have always been.
-      {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
-       "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."},
-      collectPairs(association, properties, filterKeys, instances));
+      // The second names another association. Clients and log filters match this text: do not correct it.
+      {{"CMPIObjectPath is                     NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
+       {"Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory",
+        "Create CMPIObjectPath failed for                     cpuAssociatedCacheMemory."}},
+      collectPairs(association, properties, instances));
   events.providerExit();
   return complete ? 0 : 1;
 }
@@ -174,11 +113,10 @@ CMPIStatus CPUSystemDevice_EnumInstanceNames(CMPIInstanceMI* /*mi*/, const CMPIC
                                              const CMPIResult* result, const CMPIObjectPath* cop) {
   events.providerEntry();
   CMPIStatus status = succeeded();
-  forEachPair(cop, context, &status,
-              {"CMPIObjectPath is NULL for CPUProcessor", "CMPIObjectPath is NULL for CPUProcessor"},
-              {"Create CMPIObjectPath failed for                     cpuSystemDeviceClass.",
-               "Create CMPIObjectPath failed for                     cpuSystemDeviceClass."},
-              deliverName(association, result));
+  forEachSystemAndProcessor(cop, context, &status,
+                            {"CMPIObjectPath is NULL for CPUProcessor",
+                             "Create CMPIObjectPath failed for                     cpuSystemDeviceClass."},
+                            deliverName(association, result));
   events.providerExit();
   CMReturnDone(result);
   return status;
@@ -199,116 +137,137 @@ CMPIStatus CPUSystemDevice_GetInstance(CMPIInstanceMI* /*mi*/, const CMPIContext
 
 // The association operations never call CMReturnDone.
 
+namespace {
+
+/// Whether a request's result class leaves room for elements of the target class: it names that class or
+/// its parent.
+bool leavesRoomFor(std::string_view targetClass, const char* resultClass) {
+  struct Row {
+    std::string_view targetClass;
+    std::string_view parent;
+  };
+  constexpr Row rows[] = {{computerSystemClass, "CIM_ComputerSystem"}, {cpuProcessorClass, "CIM_Processor"}};
+  const Row* row = std::ranges::find(rows, targetClass, &Row::targetClass);
+  return resultClass == nullptr || row == std::end(rows) || equalIgnoringCase(resultClass, row->targetClass) ||
+         equalIgnoringCase(resultClass, row->parent);
+}
+
+/// The operations that answer the far ends themselves. Each function delivers the elements of one class; false
+/// ends the request without an exit mark.
+template <class Systems, class Processors>
+CMPIStatus answerFarEnds(const CMPIObjectPath* cop, const char* assocClass, const char* resultClass,
+                         Systems deliverSystems, Processors deliverProcessors, unsigned int line = __builtin_LINE(),
+                         const char* function = __builtin_FUNCTION()) {
+  events.providerEntry(line, function);
+  Navigation navigation(association, factoryOfProcessors(), cop, line, function);
+  if (!navigation.hasTarget(assocClass, resultClass)) {
+    events.providerExit(line, function);
+    return succeeded();
+  }
+  const std::string_view targetClass = classNameOf(navigation.target);
+  // The variable bears the call that yields it. Log filters match this name.
+  events.variable("((targetClass)->ft->getCharPtr((targetClass),(&rc)))", targetClass.data(), line, function);
+  if (!leavesRoomFor(targetClass, resultClass)) {
+    events.providerExit(line, function);
+    return succeeded();
+  }
+  if (targetClass == computerSystemClass && !deliverSystems(navigation)) {
+    return navigation.status;
+  }
+  if (targetClass == cpuProcessorClass) {
+    deliverProcessors(navigation);
+  }
+  events.providerExit(line, function);
+  return navigation.status;
+}
+
+}  // namespace
+
 CMPIStatus CPUSystemDevice_Associators(CMPIAssociationMI* /*mi*/, const CMPIContext* context, const CMPIResult* result,
                                        const CMPIObjectPath* cop, const char* assocClass, const char* resultClass,
                                        const char* /*role*/, const char* /*resultRole*/, const char** properties) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.providerExit();
-    return succeeded();
-  }
-  const std::string_view targetClass = tracedClassOf(target);
-  if (!leavesRoomFor(targetClass, resultClass)) {
-    events.providerExit();
-    return succeeded();
-  }
-  if (targetClass == computerSystemClass) {
-    const CMPIEnumeration* systems = enumerateSystems(context, target, &status);
-    if (!answered(status)) {
-      return status;
-    }
-    forEach(systems, &CMPIValue::inst, [&](const CMPIInstance* system) {
+  const auto deliverSystems = [&, function = __func__](Navigation& navigation) {
+    const auto deliverSystem = [&](const CMPIInstance* system) {
       CMReturnInstance(result, system);
       return true;
-    });
-  } else if (targetClass == cpuProcessorClass) {
+    };
+    return forEachSystem(association, {context, navigation.target, &navigation.status}, deliverSystem, __builtin_LINE(),
+                         function);
+  };
+  const auto deliverProcessors = [&, function = __func__](Navigation& navigation) {
     Instances processors;
-    processors.reserve(factory->getNumberOfProcInstances());
-    if (factory->getAllCPUProcCMPIInstances(broker, target, properties, false, processors, &status) != 0) {
-      events.message(LevelError, "***Can't get Processor ObjectPaths.                 Exiting Associators***");
+    processors.reserve(navigation.factory->getNumberOfProcInstances());
+    if (navigation.factory->getAllCPUProcCMPIInstances(broker, navigation.target, properties, false, processors,
+                                                       &navigation.status) != 0) {
+      events.message(LevelError, "***Can't get Processor ObjectPaths.                 Exiting Associators***",
+                     __builtin_LINE(), function);
     } else {
       deliver(result, processors);
     }
-  }
-  events.providerExit();
-  return status;
+  };
+  return answerFarEnds(cop, assocClass, resultClass, deliverSystems, deliverProcessors);
 }
 
 CMPIStatus CPUSystemDevice_AssociatorNames(CMPIAssociationMI* /*mi*/, const CMPIContext* context,
                                            const CMPIResult* result, const CMPIObjectPath* cop, const char* assocClass,
                                            const char* resultClass, const char* /*role*/, const char* /*resultRole*/) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, assocClass, resultClass, &status);
-  if (isNull(target)) {
-    events.providerExit();
-    return succeeded();
-  }
-  const std::string_view targetClass = tracedClassOf(target);
-  if (!leavesRoomFor(targetClass, resultClass)) {
-    events.providerExit();
-    return succeeded();
-  }
-  if (targetClass == computerSystemClass) {
-    const CMPIEnumeration* systems = enumerateSystemNames(context, target, &status);
-    if (!answered(status)) {
-      return status;
-    }
-    forEach(systems, &CMPIValue::ref, [&](const CMPIObjectPath* system) {
+  const auto deliverSystems = [&, function = __func__](Navigation& navigation) {
+    const auto deliverSystem = [&](const CMPIObjectPath* system) {
       CMReturnObjectPath(result, system);
       return true;
-    });
-  } else if (targetClass == cpuProcessorClass) {
+    };
+    return forEachSystemName(association, {context, navigation.target, &navigation.status}, deliverSystem,
+                             __builtin_LINE(), function);
+  };
+  const auto deliverProcessors = [&, function = __func__](Navigation& navigation) {
     Paths processors;
-    processors.reserve(factory->getNumberOfProcInstances());
-    if (factory->getAllCPUProcCMPIObjPaths(broker, target, processors, &status) != 0) {
-      events.message(LevelError, "***Can't get Processor ObjectPaths.                 Exiting AssociatorNames***");
-    } else {
+    if (findProcessors(navigation.factory, navigation.target, processors, &navigation.status,
+                       "***Can't get Processor ObjectPaths.                 Exiting AssociatorNames***", function)) {
       deliver(result, processors);
     }
-  }
-  events.providerExit();
-  return status;
+  };
+  return answerFarEnds(cop, assocClass, resultClass, deliverSystems, deliverProcessors);
 }
 
 namespace {
 
-/// Hands the path at the far end of each of the request's associations to `link`, and whether it stands at
-/// the association's first end. False, and the failure logged, when the far ends could not be had.
-template <class Link>
-bool forEachFarEnd(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPIContext* context,
-                   const CMPIObjectPath* target, CMPIStatus* status, const char* noProcessors, Link link,
-                   const char* function = __builtin_FUNCTION()) {
-  const std::string_view targetClass = classNameOf(target);
+/// The operations that answer references. Hands the one to each far end to `deliverReference`; a far end that
+/// could not be had ends the request without an exit mark.
+template <class Deliver>
+CMPIStatus answerReferences(const CMPIObjectPath* cop, const CMPIContext* context, const char* nullTarget,
+                            const char* noProcessors, Deliver deliverReference, unsigned int line = __builtin_LINE(),
+                            const char* function = __builtin_FUNCTION()) {
+  events.providerEntry(line, function);
+  Navigation navigation(association, factoryOfProcessors(), cop, line, function);
+  if (!navigation.findTargetOfReferences(nullTarget)) {
+    return navigation.status;
+  }
+  const auto link = [&](const CMPIObjectPath* far, bool farIsFirst) {
+    const CMPIInstance* reference = navigation.newReference(far, farIsFirst);
+    if (!isNull(reference)) {
+      deliverReference(reference);
+    }
+    return true;
+  };
+  const std::string_view targetClass = classNameOf(navigation.target);
   if (targetClass == cpuProcessorClass) {
     Paths processors;
-    processors.reserve(factory->getNumberOfProcInstances());
-    if (factory->getAllCPUProcCMPIObjPaths(broker, target, processors, status) != 0) {
-      events.message(LevelError, noProcessors, __builtin_LINE(), function);
-      return false;
+    if (!findProcessors(navigation.factory, navigation.target, processors, &navigation.status, noProcessors,
+                        function)) {
+      return navigation.status;
     }
     for (CMPIObjectPath* processor : counted(processors)) {
       stampPath(processor, cop);
       link(processor, false);
     }
   } else if (targetClass == computerSystemClass) {
-    const CMPIEnumeration* systems = enumerateSystemNames(context, target, status);
-    if (!answered(*status, __builtin_LINE(), function)) {
-      return false;
+    const auto linkSystem = [&](const CMPIObjectPath* system) { return link(system, true); };
+    if (!forEachSystemName(association, {context, navigation.target, &navigation.status}, linkSystem, line, function)) {
+      return navigation.status;
     }
-    const auto linkSystem = [&](const CMPIObjectPath* system) {
-      link(system, true);
-      return true;
-    };
-    forEach(systems, &CMPIValue::ref, linkSystem, function);
   }
-  return true;
+  events.providerExit(line, function);
+  return navigation.status;
 }
 
 }  // namespace
@@ -316,49 +275,16 @@ bool forEachFarEnd(CPUObjFactory* factory, const CMPIObjectPath* cop, const CMPI
 CMPIStatus CPUSystemDevice_References(CMPIAssociationMI* /*mi*/, const CMPIContext* context, const CMPIResult* result,
                                       const CMPIObjectPath* cop, const char* /*resultClass*/, const char* /*role*/,
                                       const char** /*properties*/) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    fail(association, &status, "Object Path is NULL in References.");
-    return status;
-  }
-  const auto link = [&](const CMPIObjectPath* far, bool farIsFirst) {
-    const CMPIInstance* reference = newReference(association, {cop, templatePath}, far, farIsFirst);
-    if (!isNull(reference)) {
-      CMReturnInstance(result, reference);
-    }
-  };
-  if (forEachFarEnd(factory, cop, context, target, &status, "getAllCPUProcCMPIObjPaths Failed", link)) {
-    events.providerExit();
-  }
-  return status;
+  return answerReferences(cop, context, "Object Path is NULL in References.", "getAllCPUProcCMPIObjPaths Failed",
+                          [&](const CMPIInstance* reference) { CMReturnInstance(result, reference); });
 }
 
 CMPIStatus CPUSystemDevice_ReferenceNames(CMPIAssociationMI* /*mi*/, const CMPIContext* context,
                                           const CMPIResult* result, const CMPIObjectPath* cop,
                                           const char* /*resultClass*/, const char* /*role*/) {
-  events.providerEntry();
-  CMPIStatus status = succeeded();
-  CPUObjFactory* factory = factoryOfProcessors();
-  const CMPIObjectPath* target =
-      factory->get_assoc_targetClass_ObjectPath(broker, cop, association.className, nullptr, &status);
-  const CMPIObjectPath* templatePath = newAssociationPath(association, cop);
-  if (isNull(target) || isNull(templatePath)) {
-    fail(association, &status, "Object Path is NULL in ReferenceNames.");
-    return status;
-  }
-  const auto link = [&](const CMPIObjectPath* far, bool farIsFirst) {
-    deliverStampedPathOf(result, newReference(association, {cop, templatePath}, far, farIsFirst), cop);
-  };
-  if (forEachFarEnd(factory, cop, context, target, &status,
-                    "***Can't get Processor instances                 Exiting References***", link)) {
-    events.providerExit();
-  }
-  return status;
+  return answerReferences(cop, context, "Object Path is NULL in ReferenceNames.",
+                          "***Can't get Processor instances                 Exiting References***",
+                          [&](const CMPIInstance* reference) { deliverStampedPathOf(result, reference, cop); });
 }
 
 static const CMPIInstanceMIFT instMIFT__ = {

@@ -1,44 +1,60 @@
 #ifndef TARN_CACHEASSOCIATION_H
 #define TARN_CACHEASSOCIATION_H
 
-#include "AssociationSteps.h"
+#include "Navigation.h"
 
-/// What the two associations of caches have in common: they carry the cache's own properties.
+/// The two associations of caches, with processors and with cores. They carry the cache's own properties. Each
+/// says in a CacheAssociation what is its own; the operations below say what they do with it.
 namespace Tarn::CPUProvider {
 
-inline const char* cacheAssociationKeys[] = {"Antecedent", "Dependent", nullptr};
+struct CacheAssociation {
+  const Association& association;
+  CPUObjFactory* (*factory)();
+  /// Whether the association is not served at present, for which there may be a reason.
+  bool (*isSuspended)(const CPUObjFactory* factory);
+  /// Makes all instances; 0, or 1 when it did not come to the end.
+  unsigned short (*makeInstances)(const CMPIObjectPath* cop, const char** properties, Instances& instances);
 
-/// Sets the cache's properties on an association of it. False, and the failure logged, when the cache
-/// is unknown.
-inline bool setCacheProperties(const Association& association, CPUObjFactory* factory, CMPIInstance* instance,
-                               const CMPIObjectPath* cache, CMPIStatus* status, unsigned int line = __builtin_LINE(),
-                               const char* function = __builtin_FUNCTION()) {
-  CPUObjFactory::ProcCacheData data{};
-  if (factory->getAssocCacheData(association.broker, stringKey(cache, "DeviceID"), data, status) != 0) {
-    association.events.message(LevelError, "Error retrieving CPU AssociatedCacheMemory data", line, function);
-    return false;
-  }
-  CMSetProperty(instance, "Level", &data.level, CMPI_uint16);
-  CMSetProperty(instance, "WritePolicy", &data.writePolicy, CMPI_uint16);
-  CMSetProperty(instance, "ReadPolicy", &data.readPolicy, CMPI_uint16);
-  CMSetProperty(instance, "CacheType", &data.cacheType, CMPI_uint16);
-  CMSetProperty(instance, "Associativity", &data.associativity, CMPI_uint16);
-  return true;
-}
+  PairWalk walk;
+  WalkTexts instanceTexts;
+  WalkTexts nameTexts;
 
-/// Appends the association of a cache with its processor or core, also when the broker could not make
-/// it. False when the cache is unknown.
-inline bool appendCacheAssociation(const Association& association, CPUObjFactory* factory, const CMPIObjectPath* path,
-                                   const CMPIObjectPath* cache, const CMPIObjectPath* dependent,
-                                   const char** properties, Instances& instances, CMPIStatus* status, unsigned int line,
-                                   const char* function) {
-  CMPIInstance* instance = newAssociation(association, path, cache, dependent, properties, cacheAssociationKeys);
-  if (!isNull(instance) && !setCacheProperties(association, factory, instance, cache, status, line, function)) {
-    return false;
-  }
-  instances.push_back(instance);
-  return true;
-}
+  Direction directions[2];
+  DirectionTexts associatorsFailed;
+  DirectionTexts associatorNamesFailed;
+  DirectionTexts referencesFailed;
+  DirectionTexts referenceNamesFailed;
+
+  bool tracesClasses;       ///< whether the classes that a request names are logged
+  bool referencesDescribe;  ///< whether References answers the cache's properties, too
+};
+
+/// One request, and the entry point that reports it.
+struct AssociationRequest {
+  const CMPIResult* result;
+  const CMPIObjectPath* cop;
+  const char** properties = nullptr;
+  const char* assocClass = nullptr;
+  const char* resultClass = nullptr;
+  unsigned int line = __builtin_LINE();
+  const char* function = __builtin_FUNCTION();
+};
+
+/// All instances, into `instances`; the builder that an association's makeInstances calls.
+unsigned short makeInstances(const CacheAssociation& provider, const CMPIObjectPath* cop, const char** properties,
+                             Instances& instances, unsigned int line = __builtin_LINE(),
+                             const char* function = __builtin_FUNCTION());
+
+CMPIStatus enumInstances(const CacheAssociation& provider, const AssociationRequest& request);
+CMPIStatus enumInstanceNames(const CacheAssociation& provider, const AssociationRequest& request);
+CMPIStatus getInstance(const CacheAssociation& provider, const AssociationRequest& request);
+
+// These never call CMReturnDone.
+
+CMPIStatus associators(const CacheAssociation& provider, const AssociationRequest& request);
+CMPIStatus associatorNames(const CacheAssociation& provider, const AssociationRequest& request);
+CMPIStatus references(const CacheAssociation& provider, const AssociationRequest& request);
+CMPIStatus referenceNames(const CacheAssociation& provider, const AssociationRequest& request);
 
 }  // namespace Tarn::CPUProvider
 

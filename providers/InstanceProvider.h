@@ -17,9 +17,6 @@ struct Remark {
   explicit constexpr operator bool() const { return text != nullptr; }
 };
 
-/// A number that is logged before it is used.
-using CountRecords = unsigned short (CPUObjFactory::*)() const;
-
 struct InstanceProvider {
   const EventLog& events;
   const CMPIBroker* const& broker;

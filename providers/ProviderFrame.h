@@ -60,6 +60,9 @@ inline CMPIStatus notSupported() {
 using Instances = std::vector<CMPIInstance*>;
 using Paths = std::vector<CMPIObjectPath*>;
 
+/// How many results to expect.
+using CountRecords = unsigned short (CPUObjFactory::*)() const;
+
 /// The text of a string key; NULL when the path does not have it or it is no string. Minimal brokers
 /// leave the type of a string at 0.
 inline CMPIString* stringKey(const CMPIObjectPath* path, const char* name, CMPIStatus* status = nullptr) {
