@@ -1,0 +1,31 @@
+#ifndef TESTS_HOST_CLI_EXPECTED_H
+#define TESTS_HOST_CLI_EXPECTED_H
+
+#include <string>
+
+#include "tests/host/cli/Program.h"
+
+namespace Corvcim::Testing {
+
+// What the built program is expected to print.
+
+/// The name of this machine, as the libraries tell it.
+std::string host();
+
+/// The object path of a part, by its path in the inventory.
+std::string processorPath(const std::string& identifier);
+std::string cachePath(const std::string& identifier);
+std::string corePath(const std::string& identifier);
+
+/// The object path of the computer system.
+std::string systemPath();
+
+/// A run that printed the output, and nothing to standard error.
+Finished success(const std::string& output);
+
+/// A run that failed with that one line, and printed nothing else.
+Finished failed(const std::string& error);
+
+}  // namespace Corvcim::Testing
+
+#endif
