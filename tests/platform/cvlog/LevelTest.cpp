@@ -36,7 +36,7 @@ TEST(Level, IsWrittenAsANameOrANumber) {
   EXPECT_EQ(parseLevel("4500"), 4500);
 }
 
-TEST(Level, IsNothingElse) {
+TEST(Level, RejectsTextsThatAreNoLevel) {
   for (const char* text : {"", "errors", "verbose", "-1", "+1", "3000x", " 3000", "0x10", "99999999999"}) {
     EXPECT_EQ(parseLevel(text), std::nullopt) << text;
   }

@@ -94,7 +94,7 @@ TEST_F(Cursor, SelectsNothingOfATypeThatThereIsNot) {
   expectNoNode(cursor);
 }
 
-TEST_F(Cursor, StaysBehindTheEnd) {
+TEST_F(Cursor, StaysPastTheEnd) {
   Instrumentation cursor;
   cursor.selectNode(NodeSystem);
 

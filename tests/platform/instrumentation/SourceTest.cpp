@@ -166,7 +166,7 @@ TEST(Source, RefusesADumpWithoutSockets) {
                 "another source: smbios:FILE+live");
 }
 
-TEST(Source, RefusesFilesThatCanNotBeRead) {
+TEST(Source, RefusesFilesThatCannotBeRead) {
   EXPECT_EQ(refusalOf("json:/nothing"),
             "cannot read the inventory: /nothing: no such file or directory; name a file that holds an inventory as "
             "JSON");

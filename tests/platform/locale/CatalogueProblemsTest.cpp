@@ -50,7 +50,7 @@ TEST(CatalogueProblems, AreTranslationsOfAnEnglishTextThatHasChangedSince) {
               ElementsAre("A in line 7 does not quote the present English text as its note"));
 }
 
-TEST(CatalogueProblems, ArePlurals) {
+TEST(CatalogueProblems, ArePluralsThatNothingAsksFor) {
   EXPECT_THAT(
       problemsOfFrench(
           "#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n#. both\nmsgid \"B\"\nmsgid_plural \"Bs\"\nmsgstr[0] \"deux\"\n"),

@@ -42,7 +42,7 @@ TEST(Archive, HoldsFilesOfOneLineOfManyAndOfNone) {
   EXPECT_EQ(files.files().size(), 3U);
 }
 
-TEST(Archive, HoldsFilesThatCanNotBeRead) {
+TEST(Archive, HoldsFilesThatCannotBeRead) {
   MemoryFileSystem files(readArchive("[a]\none! EACCES\ntwo! EIO\n", "root.txt"));
   std::string contents = "x";
 

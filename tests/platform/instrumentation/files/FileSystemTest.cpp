@@ -49,13 +49,13 @@ MemoryFileSystem::Files threeFiles() {
   return {{"a/one", {"1\n", 0}}, {"a/b/two", {"2\n", 0}}, {"a/b/three", {"3\n", 0}}};
 }
 
-TEST(FileSystem, InMemory) {
+TEST(FileSystem, ReadsAndListsFilesInMemory) {
   MemoryFileSystem files(threeFiles());
   expectFiles(files);
   EXPECT_EQ(files.nameOf("a/one"), "/a/one");
 }
 
-TEST(FileSystem, InADirectory) {
+TEST(FileSystem, ReadsAndListsFilesInADirectory) {
   const ScratchDirectory directory;
   for (const auto& [path, entry] : threeFiles()) {
     directory.write(path, entry.contents);
@@ -65,7 +65,7 @@ TEST(FileSystem, InADirectory) {
   EXPECT_EQ(files->nameOf("a/one"), directory.name() + "/a/one");
 }
 
-TEST(FileSystem, Recorded) {
+TEST(FileSystem, RecordsWhatIsReadAndListed) {
   MemoryFileSystem target(threeFiles());
   target.fail("c/denied", EACCES);
   RecordingFileSystem::Record record;
@@ -125,7 +125,7 @@ TEST(FileSystem, ReadsFilesLongerThanItsBuffer) {
   EXPECT_EQ(contents, text);
 }
 
-TEST(FileSystem, TellsWhyAFileCanNotBeRead) {
+TEST(FileSystem, TellsWhyAFileCannotBeRead) {
   const ScratchDirectory directory;
   directory.write("a/file", "x");
   const std::unique_ptr<FileSystem> files = openDirectory(directory.name());

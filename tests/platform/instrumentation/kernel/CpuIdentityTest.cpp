@@ -15,7 +15,7 @@ std::string x86(const std::string& family, const std::string& model, const std::
          "\ncpu MHz\t\t: 2299.998\nflags\t\t: fpu sse2 lm hypervisor\n";
 }
 
-TEST(CpuIdentity, OfX86) {
+TEST(CpuIdentity, IsReadFromABlockOfX86) {
   const CpuIdentity cpu = identify(x86("6", "207", "2"));
 
   EXPECT_EQ(cpu.architecture, Architecture::X86);
@@ -60,7 +60,7 @@ std::string arm(const std::string& part, const std::string& architecture) {
          "\nCPU revision\t: 3\n";
 }
 
-TEST(CpuIdentity, OfArm) {
+TEST(CpuIdentity, IsReadFromABlockOfArm) {
   const CpuIdentity cpu = identify(arm("0xd08", "8"));
 
   EXPECT_EQ(cpu.architecture, Architecture::Arm);
@@ -73,7 +73,7 @@ TEST(CpuIdentity, OfArm) {
   EXPECT_FALSE(cpu.hypervisor);
 }
 
-TEST(CpuIdentity, OfArmPartsThatAreNotKnown) {
+TEST(CpuIdentity, IsTheArchitecturesForArmPartsThatAreNotKnown) {
   EXPECT_EQ(identify(arm("0xfff", "8")).name, "");
   EXPECT_EQ(identify(arm("0xfff", "9")).family, 257U);
   EXPECT_EQ(identify(arm("0xfff", "7")).family, 256U);
@@ -82,7 +82,7 @@ TEST(CpuIdentity, OfArmPartsThatAreNotKnown) {
   EXPECT_EQ(identify(arm("0xfff", "5TEJ")).processorId, "") << "older registers tell their version";
 }
 
-TEST(CpuIdentity, OfPowerPc) {
+TEST(CpuIdentity, IsReadFromABlockOfPowerPc) {
   const CpuIdentity cpu =
       identify("cpu\t\t: POWER9, altivec supported\nclock\t\t: 3425.000000MHz\nrevision\t: 2.2 (pvr 004e 1202)\n");
 
@@ -94,7 +94,7 @@ TEST(CpuIdentity, OfPowerPc) {
   EXPECT_EQ(cpu.clockSpeed, 3425U);
 }
 
-TEST(CpuIdentity, OfS390) {
+TEST(CpuIdentity, IsReadFromABlockOfS390) {
   const CpuIdentity cpu = identifyCpu(CpuInfo("vendor_id       : IBM/S390\nfeatures\t: esan3 zarch stfle\n"
                                               "processor 0: version = FF,  identification = 0123,  machine = 3931\n\n"
                                               "cpu number      : 0\ncpu MHz dynamic : 5200\ncpu MHz static  : 5200\n"),
@@ -106,7 +106,7 @@ TEST(CpuIdentity, OfS390) {
   EXPECT_EQ(cpu.clockSpeed, 5200U);
 }
 
-TEST(CpuIdentity, OfRiscV) {
+TEST(CpuIdentity, IsReadFromABlockOfRiscV) {
   const CpuIdentity cpu = identify("hart\t\t: 1\nisa\t\t: rv64imafdc\nmmu\t\t: sv39\nuarch\t\t: sifive,u74-mc\n");
 
   EXPECT_EQ(cpu.architecture, Architecture::RiscV);
@@ -117,7 +117,7 @@ TEST(CpuIdentity, OfRiscV) {
   EXPECT_EQ(identify("isa\t: rv32imac\n").width, 32U);
 }
 
-TEST(CpuIdentity, OfLoongArch) {
+TEST(CpuIdentity, IsReadFromABlockOfLoongArch) {
   const CpuIdentity cpu = identify(
       "package\t\t\t: 0\nModel Name\t\t: Loongson-3A5000-HV\nCPU Revision\t\t: 0x11\n"
       "CPU MHz\t\t\t: 2500.00\nISA\t\t\t: loongarch32 loongarch64\n");
@@ -144,7 +144,7 @@ TEST(CpuIdentity, HasBlanksForControlCharacters) {
   EXPECT_EQ(loongArch.stepping, "0x 1");
 }
 
-TEST(CpuIdentity, OfACpuThatSaysNothing) {
+TEST(CpuIdentity, IsUnknownWhereTheBlockSaysNothing) {
   const CpuIdentity cpu = identify("");
 
   EXPECT_EQ(cpu.architecture, Architecture::Unknown);

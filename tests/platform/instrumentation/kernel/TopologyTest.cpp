@@ -202,7 +202,7 @@ TEST(Topology, WithoutAnyPlaceTheProcessorIsKnownButNotItsCores) {
   EXPECT_EQ(numberAt(tree, "P@0", PropEnabledCores), std::nullopt);
 }
 
-TEST(Topology, APackageThatCanNotBeReadNeverMakesAProcessor) {
+TEST(Topology, APackageThatCannotBeReadNeverMakesAProcessor) {
   KernelFiles files;
   files.cpus("0-1");
   files.cpu(0, {.package = {}, .core = 0, .siblings = "0"}).cpu(1, {.package = 3, .core = 0, .siblings = "1"});
@@ -219,7 +219,7 @@ TEST(Topology, APackageThatCanNotBeReadNeverMakesAProcessor) {
   EXPECT_EQ(nodeAt(files.tree(), "P3").cpus, (CpuSet{0, 1})) << "unless /proc/cpuinfo tells it";
 }
 
-TEST(Topology, APackageThatCanNotBeReadIsThatOfTheCpusBesideIt) {
+TEST(Topology, APackageThatCannotBeReadIsThatOfTheCpusBesideIt) {
   KernelFiles files;
   files.cpus("0-1");
   files.cpu(0, {.package = 3, .core = 0, .siblings = "0"});

@@ -21,22 +21,22 @@ Cache cache(unsigned int level, std::optional<CacheContents> contents, std::opti
   return cache;
 }
 
-TEST(NodePaths, OfProcessors) {
+TEST(NodePaths, OfProcessorsHaveTheirNumberElseTheirLowestCpu) {
   EXPECT_EQ(processorPath({.id = 0, .lowestCpu = 0, .cpus = {}, .cores = {}}), "P0");
   EXPECT_EQ(processorPath({.id = 9999, .lowestCpu = 4, .cpus = {}, .cores = {}}), "P9999");
   EXPECT_EQ(processorPath({.id = 10000, .lowestCpu = 4, .cpus = {}, .cores = {}}), "P@4");
   EXPECT_EQ(processorPath({.id = {}, .lowestCpu = 8, .cpus = {}, .cores = {}}), "P@8");
 }
 
-TEST(NodePaths, OfCores) {
+TEST(NodePaths, OfCoresHaveTheirNumberElseTheirLowestCpu) {
   EXPECT_EQ(corePaths("P0", {core(0, {0}), core(12, {1}), core({}, {2})}), (Paths{"P0.C0", "P0.C12", "P0.C@2"}));
 }
 
-TEST(NodePaths, OfCoresWithOneNumberFallBackTogether) {
+TEST(NodePaths, OfCoresWithOneNumberAllHaveTheirLowestCpu) {
   EXPECT_EQ(corePaths("P0", {core(3, {5, 6}), core(3, {7}), core(4, {8})}), (Paths{"P0.C@5", "P0.C@7", "P0.C4"}));
 }
 
-TEST(NodePaths, OfGroupsThatAreNotTheFirst) {
+TEST(NodePaths, NameDiesAndClustersButTheFirst) {
   Core grouped = core(7, {1});
   grouped.place.die = 2;
   grouped.place.cluster = 3;
@@ -52,7 +52,7 @@ TEST(NodePaths, ThatWouldBeTooLongAreByCpu) {
   EXPECT_EQ(corePaths("P36", {far}), Paths{"P36.C@127"});
 }
 
-TEST(NodePaths, OfCaches) {
+TEST(NodePaths, OfCachesHaveLevelContentsAndNumber) {
   const Cache numbered = cache(1, CacheContents::Data, 7, {3});
   const Cache unnumbered = cache(3, CacheContents::Unified, {}, {0, 1, 2});
   const Cache unknown = cache(2, {}, 7, {3});
@@ -60,7 +60,7 @@ TEST(NodePaths, OfCaches) {
   EXPECT_EQ(cachePaths("P1", {&numbered, &unnumbered, &unknown}), (Paths{"P1.L1d.7", "P1.L3@0", "P1.L2x.7"}));
 }
 
-TEST(NodePaths, OfTheLargestMachinesBuiltToday) {
+TEST(NodePaths, OfTheLargestMachinesBuiltTodayFitFifteenCharacters) {
   const Cache last = cache(1, CacheContents::Instructions, 2047, {4095});
   const std::string processor = processorPath({.id = 31, .lowestCpu = 0, .cpus = {}, .cores = {}});
 

@@ -145,7 +145,7 @@ TEST(BrokenTable, FewerStructuresThanAnnouncedAreNoted) {
               ElementsAre("SMBIOS table, offset 0xc: the table has 2 structures; its entry point announces 9"));
 }
 
-TEST(BrokenTable, ZerosBehindTheLastStructureArePadding) {
+TEST(BrokenTable, ZerosAfterTheLastStructureArePadding) {
   SmbiosEncoder encoder = twoSmall(2);
   encoder.announceLength(40);
 

@@ -102,7 +102,7 @@ TEST(EntryPoint, HasTwoChecksumsUnder32Bits) {
                                    "up to 0x01 instead of 0"));
 }
 
-TEST(EntryPoint, OfALengthThatCanNotBeIsReadAtItsLeast) {
+TEST(EntryPoint, OfALengthThatCannotBeIsReadAtItsLeast) {
   for (const int length : {0, 0x17, 0x40}) {
     std::string bytes = encoderOf(3, 0, SmbiosEncoder::EntryPoint::Smbios3).entryPoint();
     bytes[0x05] = static_cast<char>(bytes[0x05] + 0x18 - length);

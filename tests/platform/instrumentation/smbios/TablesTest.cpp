@@ -36,7 +36,7 @@ TEST(Tables, OfADumpAreThoseOfItsTwoParts) {
   }
 }
 
-TEST(Tables, OfADumpMayStandAnywhereBehindTheEntryPoint) {
+TEST(Tables, OfADumpMayStandAnywhereAfterTheEntryPoint) {
   SmbiosEncoder encoder;
   encoder.add(Support::SmbiosProcessor{});
   encoder.end();
@@ -113,7 +113,7 @@ TEST(Tables, AnInactiveStructureEndsNothing) {
   EXPECT_EQ(tables->processors.size(), 1U);
 }
 
-TEST(Tables, OfAMachineWithTwoSocketsAndOneEmpty) {
+TEST(Tables, HoldBothSocketsOfAMachineWithOneEmpty) {
   SmbiosEncoder encoder;
   encoder.add(Support::SmbiosProcessor{.socket = "CPU 1", .cores = 512, .coresEnabled = 510, .threads = 1024});
   encoder.add(Support::emptySocket("CPU 2"));

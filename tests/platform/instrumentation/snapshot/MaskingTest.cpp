@@ -141,7 +141,7 @@ TEST(SmbiosMask, LeavesWhatIdentifiesNothing) {
   EXPECT_EQ(masked.table, masked.original);
 }
 
-TEST(SmbiosMask, TakesFieldsBehindTheKnownOnes) {
+TEST(SmbiosMask, TakesFieldsAfterTheKnownOnes) {
   SmbiosEncoder encoder;
   encoder.add(
       Support::SmbiosOther{.frame = {.handle = 7}, .type = 7, .fields = std::string(0x20, '\x01'), .strings = {"L1"}});
@@ -202,7 +202,7 @@ TEST(SmbiosMask, KeepsTheShapeOfSoundAndOfBrokenTables) {
   }
 }
 
-TEST(SmbiosMask, TwiceIsOnce) {
+TEST(SmbiosMask, FindsNothingMoreInATableThatIsMasked) {
   Masked masked(Support::smbiosMachine(2, 12));
   const std::string once = masked.table;
 

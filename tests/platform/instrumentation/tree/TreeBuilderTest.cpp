@@ -154,7 +154,7 @@ struct Refusal {
 
 class TreeBuilderRefusal : public testing::TestWithParam<Refusal> {};
 
-TEST_P(TreeBuilderRefusal, SaysWhatCanNotBe) {
+TEST_P(TreeBuilderRefusal, SaysWhatCannotBe) {
   TreeBuilder builder;
   try {
     GetParam().action(builder);
