@@ -4,7 +4,6 @@
 #include "host/broker/Names.h"
 
 #include <algorithm>
-#include <array>
 #include <iterator>
 
 namespace Corvcim {

@@ -1,7 +1,6 @@
 #ifndef CORVCIM_ARENA_H
 #define CORVCIM_ARENA_H
 
-#include <cstddef>
 #include <memory>
 #include <mutex>
 #include <utility>

@@ -87,7 +87,7 @@ class Broker {
   [[nodiscard]] std::size_t liveObjects() const { return liveObjects_.load(std::memory_order_relaxed); }
 
   /// For the services' implementation: where objects made by the calling thread belong (its request,
-  /// else the broker itself), where clones belong, and the broker behind a handle.
+  /// else the broker itself), where clones belong, and the broker that a handle is of.
   [[nodiscard]] Arena& currentArena();
   [[nodiscard]] Arena& keptObjects() { return *kept_; }
   [[nodiscard]] std::atomic<std::size_t>& liveObjectCounter() { return liveObjects_; }

@@ -5,7 +5,7 @@
 namespace Corvcim {
 namespace {
 
-// What differs: which services the calls count as.
+// What differs: which services the calls are.
 struct EntryServices {
   Service add;
   Service get;

@@ -31,7 +31,7 @@ class Block : public Object {
   [[nodiscard]] std::size_t size() const { return storage_.front().size; }
 
  private:
-  std::vector<BlockHeader> storage_;  // all zero behind the header
+  std::vector<BlockHeader> storage_;  // all zero after the header
 };
 
 class Mark : public Object {};

@@ -2,7 +2,6 @@
 #define CORVCIM_NAMES_H
 
 #include <algorithm>
-#include <string>
 #include <string_view>
 
 namespace Corvcim {

@@ -17,7 +17,7 @@ bool isSigned(const Value& value) {
   return !value.isNull() && !value.isArray() && value.type() <= CMPI_sint64 && (value.type() & CMPI_SINT) == CMPI_SINT;
 }
 
-// Brokers change the width and sign of integer keys on the way, so only the number counts.
+// Brokers change the width and sign of integer keys on the way, so only the number is compared.
 bool sameNumber(const Value& left, const Value& right) {
   if (isUnsigned(left) && isUnsigned(right)) {
     return left.asUnsigned() == right.asUnsigned();

@@ -47,7 +47,7 @@ struct ObjectPath {
 };
 
 /// Whether both name the same instance: class and key names without regard to case, the same set of
-/// keys, in any order, texts exactly, integers by number whatever their type. Hosts do not count,
+/// keys, in any order, texts exactly, integers by number whatever their type. Hosts are not compared,
 /// namespaces only where both are given.
 [[nodiscard]] bool namesSameInstance(const ObjectPath& left, const ObjectPath& right);
 

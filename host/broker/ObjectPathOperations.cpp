@@ -1,4 +1,3 @@
-#include "host/ClassTable.h"
 #include "host/broker/Call.h"
 
 namespace Corvcim {

@@ -4,7 +4,6 @@
 #include <cmpift.h>
 
 #include <cstddef>
-#include <optional>
 #include <string>
 #include <utility>
 #include <vector>
@@ -28,7 +27,7 @@ extern const CMPIArgsFT argsOperations;
 extern const CMPIResultFT resultOperations;
 extern const CMPIDateTimeFT dateTimeOperations;
 
-/// What stands behind the { hdl, ft } record that a provider sees. The handle holds the address of this
+/// What belongs to the { hdl, ft } record that a provider sees. The handle holds the address of this
 /// part of a Derived.
 template <class RecordType, class Derived>
 class Encapsulated : public Object {

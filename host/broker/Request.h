@@ -33,7 +33,7 @@ class Request {
   /// Where a provider puts its results; response() shows them.
   [[nodiscard]] const CMPIResult* result() const { return result_; }
 
-  /// Broker objects of this request for these values. None of them counts as a call of a service.
+  /// Broker objects of this request for these values. None of them is counted as a call of a service.
   CMPIObjectPath* objectPath(const ObjectPath& path);
   CMPIInstance* instance(const Instance& instance);
   CMPIString* string(std::string_view text);

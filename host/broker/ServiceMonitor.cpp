@@ -1,6 +1,5 @@
 #include "host/broker/ServiceMonitor.h"
 
-#include <algorithm>
 #include <numeric>
 #include <ostream>
 #include <stdexcept>

@@ -79,7 +79,7 @@ class Value {
   using Data = std::variant<std::monostate, bool, std::uint64_t, std::int64_t, double, std::string, std::vector<Value>,
                             PathPointer, InstancePointer>;
 
-  /// Data is made in place: moving a variant would be one step more for nothing.
+  /// Data is made in place: moving a variant would be a step that changes nothing.
   template <class Content>
   Value(CMPIType type, Content content) : type_(type), data_(std::move(content)) {}
 

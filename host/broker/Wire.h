@@ -1,7 +1,6 @@
 #ifndef CORVCIM_WIRE_H
 #define CORVCIM_WIRE_H
 
-#include <cstdint>
 #include <stdexcept>
 #include <string>
 #include <string_view>

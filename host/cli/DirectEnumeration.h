@@ -2,7 +2,6 @@
 #define HOST_CLI_DIRECTENUMERATION_H
 
 #include <optional>
-#include <string_view>
 
 #include "host/ClassTable.h"
 #include "host/broker/Operation.h"

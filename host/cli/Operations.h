@@ -3,7 +3,6 @@
 
 #include <optional>
 #include <string>
-#include <string_view>
 
 #include "host/broker/Operation.h"
 #include "host/cli/Commands.h"

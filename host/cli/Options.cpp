@@ -21,7 +21,7 @@ std::string quoted(std::string_view text) {
   throw UsageError(std::string(verb.name) + ": " + text + "; usage: corvcim [OPTION...] " + callOf(verb));
 }
 
-/// The verbs that an option is for, and what is said to the others.
+/// The verbs that an option is for, and what the others answer.
 struct Scope {
   bool (*holds)(const VerbSyntax& verb);
   std::string_view explanation;

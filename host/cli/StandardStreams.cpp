@@ -6,7 +6,6 @@
 
 #include <cerrno>
 #include <stdexcept>
-#include <string>
 #include <system_error>
 #include <utility>
 

@@ -16,7 +16,7 @@ std::string toValidUtf8(std::string_view text);
 /// that a name in the inventory cannot move the cursor.
 std::string toPrintable(std::string_view text);
 
-/// The columns that valid UTF-8 takes; every character counts as one.
+/// The columns that valid UTF-8 takes; one for every character.
 std::size_t columns(std::string_view text);
 
 /// Valid UTF-8, filled with blanks on the right up to that many columns.

@@ -2,7 +2,6 @@
 #define HOST_HWLOC_HWLOCPARTS_H
 
 #include <optional>
-#include <string>
 #include <string_view>
 #include <vector>
 
@@ -20,7 +19,7 @@ struct HwlocCache {
 
 struct HwlocPackage {
   Tarn::Inventory::Package package;
-  hwloc_obj_t object = nullptr;  ///< the machine where nothing tells of a package
+  hwloc_obj_t object = nullptr;  ///< the machine where there is no package
   std::vector<HwlocCache> caches;
 };
 

@@ -39,7 +39,7 @@ constexpr std::array translations = {
     Translation{"CPUVendor", "vendor_id"},
 };
 
-/// What is said of the package, or in older files of the machine.
+/// What the package says of itself, or in older files the machine.
 std::string_view remark(hwloc_obj_t package, const char* name) {
   std::string_view text;
   for (hwloc_obj_t object = package; object != nullptr && text.empty(); object = object->parent) {

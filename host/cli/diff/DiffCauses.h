@@ -17,11 +17,11 @@ enum class Event {
   Added,
   SocketEmptied,
   SocketFilled,
-  WentOffline,  ///< a core that is not told of any more, while its CPUs are still there: the kernel hides it
+  WentOffline,  ///< a core that is not in the inventory any more, while its CPUs are still there: the kernel hides it
   CameOnline
 };
 
-/// The events behind a list of changes, and which changes come of others: cores and caches come and go
+/// The events that a list of changes comes of, and which changes come of others: cores and caches come and go
 /// with their processor, caches with a core that the kernel hides.
 class DiffCauses {
  public:

@@ -23,7 +23,7 @@ std::string coded(std::string_view property, unsigned int code) {
   return name.empty() ? std::to_string(code) : std::string(name) + " (" + std::to_string(code) + ')';
 }
 
-/// How a field is told: "the LABEL is NEW now, was OLD", or where it counts something, "has NEW LABELs now".
+/// How a field's change is worded: "the LABEL is NEW now, was OLD", or where it counts something, "has NEW LABELs now".
 struct Wording {
   std::string_view field;
   std::string_view label;
@@ -44,7 +44,7 @@ std::string bytes(unsigned int value) {
   return formatBytes(value);
 }
 
-// CacheNumberOfBlocks is told as the cache's size, CacheConsumableBlocks where it says something else.
+// CacheNumberOfBlocks is shown as the cache's size, CacheConsumableBlocks where it says something else.
 constexpr std::array wordings = {
     Wording{"type", "type", false, plain},
     Wording{"parent", "part above it", false, plain},

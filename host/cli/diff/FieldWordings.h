@@ -9,7 +9,7 @@
 namespace Corvcim {
 
 /// What became of a field, in words: "the maximum clock is 3.6 GHz now, was 3.5 GHz". A field without
-/// words of its own is told by its name.
+/// words of its own is shown by its name.
 Predicate describeFieldChange(const FieldChange& change);
 
 /// What became of a part of that type whose status differs: "went offline". Both values are there.

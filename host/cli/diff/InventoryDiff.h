@@ -33,7 +33,7 @@ struct NodeChange {
 };
 
 /// What differs between two inventories. Nodes are matched by their paths: first what is in `before`, in
-/// its order, then what only `after` has. The fields that `ignored` names do not count. What a source could
+/// its order, then what only `after` has. The fields that `ignored` names are left out. What a source could
 /// not read is no part of the machine, and not compared.
 std::vector<NodeChange> compareInventories(const Tarn::Inventory::Tree& before, const Tarn::Inventory::Tree& after,
                                            std::span<const std::string> ignored = {});

@@ -14,7 +14,7 @@ std::string listPaths(const std::vector<std::string>& paths);
 enum class Verbal { None, Is, Has };
 
 /// What is said of a path: "is" or "has", as its number asks, and what follows. Without either, `rest`
-/// stands right behind the path and begins with a blank or a colon.
+/// stands right after the path and begins with a blank or a colon.
 struct Predicate {
   Verbal verbal = Verbal::None;
   std::string rest;

@@ -4,7 +4,6 @@
 #include <cmath>
 #include <iterator>
 #include <span>
-#include <utility>
 
 #include "host/cli/Text.h"
 

@@ -3,7 +3,6 @@
 
 #include <span>
 #include <string>
-#include <vector>
 
 #include "host/cli/drawing/Machine.h"
 #include "host/cli/drawing/SvgLayout.h"

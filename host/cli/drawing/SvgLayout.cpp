@@ -1,7 +1,6 @@
 #include "host/cli/drawing/SvgLayout.h"
 
 #include <algorithm>
-#include <string_view>
 #include <utility>
 
 #include "host/cli/Text.h"
@@ -64,7 +63,8 @@ void addRun(std::vector<Box>& boxes, PartRun run, const Plan& plan, int maxWidth
 /// Small cells show a core's state, so that cores need not be in the same state to stand in one group.
 std::vector<Box> partBoxes(std::span<const MachinePart> parts, const Plan& plan, int maxWidth) {
   std::vector<Box> boxes;
-  for (const PartRun run : runsOfShape(parts, plan.cores.detail == Detail::Cells ? States::Ignored : States::Count)) {
+  for (const PartRun run :
+       runsOfShape(parts, plan.cores.detail == Detail::Cells ? States::Ignored : States::Compared)) {
     addRun(boxes, run, plan, maxWidth);
   }
   return boxes;

@@ -40,7 +40,7 @@ struct Box {
 
 /// Places everything: processors beside or below each other, in each its shared caches around the
 /// cores that share them. Up to 32 cores each core shows its own caches; on larger machines cores
-/// are small cells, and what they have in common is said once for each group.
+/// are small cells, and what they have in common stands once for each group.
 Box layOut(const Machine& machine);
 
 }  // namespace Corvcim

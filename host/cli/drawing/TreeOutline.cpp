@@ -2,7 +2,6 @@
 
 #include <utility>
 
-#include "host/cli/Quantities.h"
 #include "host/cli/StateNote.h"
 #include "host/cli/Text.h"
 #include "host/cli/drawing/PartLabels.h"

@@ -6,7 +6,6 @@
 
 #include "host/broker/Names.h"
 #include "host/cli/Operations.h"
-#include "host/cli/results/TextWriter.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Corvcim {

@@ -20,7 +20,7 @@ struct ExplainedProperty {
   Datum datum;                 ///< the inventory's value
   const Tarn::Inventory::Origin* origin = nullptr;  ///< of the datum, in the tree; nullptr where it has none
   std::string step;  ///< what the library did, in words; empty where it does not report the part
-  std::vector<Tarn::Inventory::Unread> unread;  ///< what might have told a datum that is not there
+  std::vector<Tarn::Inventory::Unread> unread;  ///< the files that might have had a datum that is not there
   std::vector<Tarn::Inventory::Disagreement> disagreements;
 };
 

@@ -1,7 +1,6 @@
 #include "host/cli/explain/ExplanationTable.h"
 
 #include <algorithm>
-#include <array>
 
 #include "host/ClassTable.h"
 
@@ -11,7 +10,7 @@ namespace {
 using Row = CodeTable::Row;
 using enum Step;
 
-// The codes of the libraries, told here once more: this program knows a library by its entry points alone, and
+// The codes of the libraries, listed here once more: this program knows a library by its entry points alone, and
 // explains by these tables also what another build of it answers. ExplanationTest compares them with
 // model/StateCodes.h, ExplainCommandTest with what the built libraries, the companion among them, answer.
 

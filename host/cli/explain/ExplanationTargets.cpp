@@ -107,7 +107,7 @@ std::vector<ExplanationTarget> explanationTargets(const Tree& tree, const std::s
   if (text.find('=') != std::string::npos) {
     return {targetOfPath(tree, text)};
   }
-  // A class, with or without a namespace before it and a key behind it.
+  // A class, with or without a namespace before it and a key after it.
   const std::size_t colon = text.find(':');
   const std::size_t dot = text.find('.');
   const std::size_t begin = colon == std::string::npos || colon > dot ? 0 : colon + 1;

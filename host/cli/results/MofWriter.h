@@ -11,7 +11,7 @@ namespace Corvcim {
 /// The instances as MOF: instance of CLASS { Name = value; ... };
 std::string instancesAsMof(std::span<const Instance> instances);
 
-/// The paths as MOF has them: as instances of which only the keys are told.
+/// The paths as MOF has them: as instances with their keys alone.
 std::string pathsAsMof(std::span<const ObjectPath> paths);
 
 }  // namespace Corvcim

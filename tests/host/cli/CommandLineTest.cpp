@@ -6,7 +6,6 @@
 #include <cctype>
 #include <nlohmann/json.hpp>
 #include <string>
-#include <vector>
 
 #include "platform/instrumentation/tree/JsonTree.h"
 #include "tests/host/cli/Expected.h"

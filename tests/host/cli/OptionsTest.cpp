@@ -14,7 +14,7 @@ Options parse(const std::vector<const char*>& arguments) {
   return parseOptions(arguments);
 }
 
-/// What is said against the arguments; empty if they are understood.
+/// The error that the arguments give; empty if they are understood.
 std::string complaint(const std::vector<const char*>& arguments) {
   try {
     parseOptions(arguments);
@@ -33,7 +33,7 @@ TEST(Options, NothingMeansTheOverviewOfThisMachine) {
   EXPECT_EQ(options.library + options.companion + options.inventory + options.language, "");
 }
 
-TEST(Options, LongOptionsTakeTheirValueAsAWordOrBehindAnEqualsSign) {
+TEST(Options, LongOptionsTakeTheirValueAsAWordOrAfterAnEqualsSign) {
   const Options options = parse({"--library", "a.so", "--companion=b.so", "--inventory", "json:x=y", "--language=de_AT",
                                  "--namespace=root/test", "--output", "text"});
 
@@ -53,7 +53,7 @@ TEST(Options, ShortOptionsTakeTheirValueAsAWordOrGlued) {
   EXPECT_EQ(options.format, Format::Json);
 }
 
-TEST(Options, MayStandBehindTheVerb) {
+TEST(Options, MayStandAfterTheVerb) {
   const Options options = parse({"ei", "HALDA_CPUMemory", "-o", "mof", "DeviceID"});
 
   EXPECT_EQ(options.verb->verb, Verb::EnumerateInstances);

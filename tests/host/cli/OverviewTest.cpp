@@ -162,7 +162,7 @@ TEST(InventoryText, ShowsEveryNodeWithItsProperties) {
             "        cpus         0\n");
 }
 
-TEST(InventoryText, ShowsWhereSourcesDisagreeBehindWhatWasNotRead) {
+TEST(InventoryText, ShowsWhereSourcesDisagreeAfterWhatWasNotRead) {
   const auto tree = Tarn::Inventory::TreeBuilder()
                         .system()
                         .unread({"/sys/a", "permission denied", "run as root"})

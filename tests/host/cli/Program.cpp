@@ -7,7 +7,6 @@
 #include <fstream>
 #include <sstream>
 #include <stdexcept>
-#include <utility>
 
 #include "platform/instrumentation/tree/JsonTree.h"
 

@@ -9,7 +9,7 @@
 
 namespace Corvcim::Testing {
 
-/// What a run of the program left behind.
+/// What a run of the program gave.
 struct Finished {
   int status = 0;  ///< the exit status; the signal's number plus 128 where one ended it
   std::string output;

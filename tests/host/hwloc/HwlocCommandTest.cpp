@@ -7,7 +7,6 @@
 #include <algorithm>
 #include <string>
 
-#include "platform/instrumentation/tree/JsonTree.h"
 #include "tests/host/cli/Program.h"
 #include "tests/host/hwloc/HwlocXml.h"
 

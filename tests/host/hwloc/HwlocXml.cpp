@@ -25,7 +25,7 @@ HwlocXml& HwlocXml::begin(std::string_view type, std::string_view number, std::s
   if (type == "Machine") {
     memory_ = R"(<object type="NUMANode" os_index="0" local_memory="1024")" + sets + "/>\n";
   } else {
-    // Behind the machine's remarks, before its other parts.
+    // After the machine's remarks, before its other parts.
     body_ += std::exchange(memory_, "");
   }
   body_ += "<object" + attribute("type", type) + attribute("os_index", number) + sets;

@@ -2,7 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include <map>
 #include <string>
 
 namespace Corvcim {
@@ -19,7 +18,7 @@ std::string namesOf(std::string_view property, std::uint64_t last) {
   return names;
 }
 
-TEST(ValueNames, States) {
+TEST(ValueNames, EveryCodeOfAStateHasItsName) {
   EXPECT_EQ(namesOf("EnabledState", 100),
             "0 Unknown\n1 Other\n2 Enabled\n3 Disabled\n4 Shutting Down\n5 Not Applicable\n6 Enabled but Offline\n"
             "7 In Test\n8 Deferred\n9 Quiesce\n10 Starting\n");
@@ -39,7 +38,7 @@ TEST(ValueNames, EveryOperationalStatusThatTheLibraryDeliversHasAName) {
   }
 }
 
-TEST(ValueNames, Caches) {
+TEST(ValueNames, EveryCodeOfACacheHasItsName) {
   EXPECT_EQ(namesOf("Level", 100), "0 Unknown\n1 Other\n2 Not Applicable\n3 Primary\n4 Secondary\n5 Tertiary\n");
   EXPECT_EQ(namesOf("CacheType", 100), "0 Unknown\n1 Other\n2 Instruction\n3 Data\n4 Unified\n");
   EXPECT_EQ(namesOf("WritePolicy", 100),
@@ -49,7 +48,7 @@ TEST(ValueNames, Caches) {
             "5 Fully Associative\n6 8-way Set-Associative\n7 16-way Set-Associative\n");
 }
 
-TEST(ValueNames, ProcessorFamilies) {
+TEST(ValueNames, FamiliesHaveTheirNames) {
   EXPECT_EQ(valueName("Family", 2), "Unknown");
   EXPECT_EQ(valueName("Family", 107), "Zen");
   EXPECT_EQ(valueName("Family", 179), "Xeon");
