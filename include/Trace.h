@@ -224,11 +224,11 @@ class EventLog {
   constexpr EventLog(const std::string& component, const char* file, int level)
       : component_(component), file_(file), level_(level) {}
 
-  void entering(const char* function = __builtin_FUNCTION(), unsigned int line = __builtin_LINE()) const {
+  void entering(unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) const {
     log(level_, {function, file_, line}, [&] { return trace(function, file_, line, ENTERING); });
   }
 
-  void exiting(const char* function = __builtin_FUNCTION(), unsigned int line = __builtin_LINE()) const {
+  void exiting(unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) const {
     log(level_, {function, file_, line}, [&] { return trace(function, file_, line, EXITING); });
   }
 
