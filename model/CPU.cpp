@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "ExceptionBarriers.h"
+#include "PrintablePath.h"
 
 namespace Tarn::CPUProvider {
 
@@ -64,10 +65,6 @@ class RecordFiller {
   const char* function_;
 };
 
-std::string printablePath(const Instrumentation& node) {
-  return node.convertPathToString(node.getPathToNode());
-}
-
 constexpr unsigned int statusUnknown = 0;
 constexpr unsigned int statusEmptySocket = 15;
 
@@ -99,18 +96,48 @@ void setFamilyAndName(const Instrumentation& node, Processor& processor, bool is
   }
 }
 
-void setStates(const Instrumentation& node, Processor& processor, const char* function) {
-  const RecordFiller<Processor> fill(node, processor, function);
+/// A field that the status of the node decides.
+template <class Record>
+struct StateField {
+  bool (Record::*set)(unsigned int status);
+  const char* failure;
+};
+
+constexpr StateField<Processor> processorStates[] = {
+    {&Processor::setCPUStatus, "Failed while setting CPU Status"},
+    {&Processor::setEnabledState, "Failed while setting CPU Enabled State"},
+    {&Processor::setOperationalStatus, "Failed while setting CPU OperationalStatus"},
+    {&Processor::setHealthState, "Failed while setting CPU Health State"},
+    {&Processor::setRequestedState, "Failed while setting CPU Requested State"},
+};
+
+constexpr StateField<Memory> memoryStates[] = {
+    {&Memory::setEnabledState, "Failed while setting Cache Enabled State"},
+    {&Memory::setOperationalStatus, "Failed while setting Cache OperationalStatus"},
+    {&Memory::setHealthState, "Failed while setting Cache Health State"},
+    {&Memory::setRequestedState, "Failed while setting Cache Requested State"},
+};
+
+constexpr StateField<ProcessorCore> coreStates[] = {
+    {&ProcessorCore::setCoreEnabledState, "Failed while setting Core enabled state"},
+    {&ProcessorCore::setEnabledState, "Failed while setting CPU Enabled State"},
+    {&ProcessorCore::setOperationalStatus, "Failed while setting CPU OperationalStatus"},
+    {&ProcessorCore::setHealthState, "Failed while setting CPU Health State"},
+    {&ProcessorCore::setRequestedState, "Failed while setting CPU Core RequestedState"},
+};
+
+/// Of an unknown status nothing is known but that no state can be requested.
+template <class Record, std::size_t count>
+void setStates(const Instrumentation& node, Record& record, const StateField<Record> (&fields)[count],
+               const char* function) {
   const unsigned int status = node.getNodeStatus();
   if (status == statusUnknown) {
-    processor.setRequestedState(0);
+    record.setRequestedState(0);
     return;
   }
-  fill.set(&Processor::setCPUStatus, status, "Failed while setting CPU Status");
-  fill.set(&Processor::setEnabledState, status, "Failed while setting CPU Enabled State");
-  fill.set(&Processor::setOperationalStatus, status, "Failed while setting CPU OperationalStatus");
-  fill.set(&Processor::setHealthState, status, "Failed while setting CPU Health State");
-  fill.set(&Processor::setRequestedState, status, "Failed while setting CPU Requested State");
+  for (const StateField<Record>& field : fields) {
+    report((record.*field.set)(status), field.failure, __builtin_LINE(), function);
+  }
 }
 
 void setUniqueId(const Instrumentation& node, Processor& processor, const char* function) {
@@ -140,7 +167,7 @@ void readProcessor(const Instrumentation& node, Processor& processor, const char
   fill.copy(PropCurrentClockSpeed, &Processor::setCurrentClockSpeed, "Failed while setting Current Clock Speed");
   fill.copy(PropMaxClockSpeed, &Processor::setMaxClockSpeed, "Failed while setting Maximum Clock Speed");
   fill.copy(PropExternalClockSpeed, &Processor::setExternalClockSpeed, "Failed while setting External Clock Speed");
-  setStates(node, processor, function);
+  setStates(node, processor, processorStates, function);
   fill.set(&Processor::setElementName, node.getNodeDescription(), "Failed while setting CPU Element Name");
   fill.copy(PropDataWidth, &Processor::setDataWidth, "Failed while setting CPU Data Width");
   if (!fill.copy(PropAddressWidth, &Processor::setAddressWidth, "Failed while setting CPU Address width")) {
@@ -165,16 +192,7 @@ void readMemory(const Instrumentation& node, Memory& memory, const char* functio
   fill.copy(PropCacheConsumableBlocks, &Memory::setConsumableBlocks, "Failed while setting Cache Consumable blocks");
   fill.copy(PropCacheNumberOfBlocks, &Memory::setNumberOfBlocks, "Failed while setting Cache Numbe of blocks");
 
-  const unsigned int status = node.getNodeStatus();
-  if (status == statusUnknown) {
-    memory.setRequestedState(0);
-  } else {
-    fill.set(&Memory::setEnabledState, status, "Failed while setting Cache Enabled State");
-    fill.set(&Memory::setOperationalStatus, status, "Failed while setting Cache OperationalStatus");
-    fill.set(&Memory::setHealthState, status, "Failed while setting Cache Health State");
-    fill.set(&Memory::setRequestedState, status, "Failed while setting Cache Requested State");
-  }
-
+  setStates(node, memory, memoryStates, function);
   fill.set(&Memory::setElementName, node.getNodeDescription(), "Failed while setting Cache Element Name");
   fill.copy(PropCacheAssociativity, &Memory::setCacheAssociativity, "Failed while setting Cache Associativity");
   fill.copy(PropCacheType, &Memory::setCacheType, "Failed while setting Cache Type");
@@ -188,17 +206,7 @@ void readCore(const Instrumentation& node, ProcessorCore& core, const char* func
   fill.set(&ProcessorCore::setInstanceID, printablePath(node), "Failed while setting Instance Id");
   fill.set(&ProcessorCore::setElementName, node.getNodeDescription(),
            "Failed while setting Processor Core Element Name");
-
-  const unsigned int status = node.getNodeStatus();
-  if (status == statusUnknown) {
-    core.setRequestedState(0);
-    return;
-  }
-  fill.set(&ProcessorCore::setCoreEnabledState, status, "Failed while setting Core enabled state");
-  fill.set(&ProcessorCore::setEnabledState, status, "Failed while setting CPU Enabled State");
-  fill.set(&ProcessorCore::setOperationalStatus, status, "Failed while setting CPU OperationalStatus");
-  fill.set(&ProcessorCore::setHealthState, status, "Failed while setting CPU Health State");
-  fill.set(&ProcessorCore::setRequestedState, status, "Failed while setting CPU Core RequestedState");
+  setStates(node, core, coreStates, function);
 }
 
 /// Appends a record and fills it where it stands; one that could not be read to its end is taken back.

@@ -4,16 +4,13 @@
 #include <algorithm>
 
 #include "ExceptionBarriers.h"
+#include "PrintablePath.h"
 
 namespace Tarn::CPUProvider {
 
 namespace {
 
 using namespace NodeLexicon;
-
-std::string printablePath(const Instrumentation& node) {
-  return node.convertPathToString(node.getPathToNode());
-}
 
 /// Moves the cursor to the node that an identifier names; false when there is none.
 bool selectIdentified(Instrumentation& node, const std::string& identifier) {
