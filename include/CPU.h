@@ -17,12 +17,16 @@ __attribute__((visibility("default"))) extern const std::string cpufamily[40];
 /// One processor package.
 class Processor {
  public:
-  /// The printable path of the node; getters of identifiers and element names return it without
-  /// blanks at the ends. Setting an empty text returns false.
+  // Getters of identifiers and element names return them without blanks at the ends. Setting an empty text
+  // returns false.
+
+  /// The printable path of the node.
   std::string getProcessorDeviceID() const;
   bool setProcessorDeviceID(std::string deviceID);
+  /// "NERITH:" and the printable path: what the processor's capabilities are known by.
   std::string getInstanceId() const;
   bool setInstanceId(std::string instanceId);
+  /// The description of the node.
   std::string getElementName() const;
   bool setElementName(std::string elementName);
 
@@ -120,6 +124,7 @@ class Processor {
 /// One core of a processor.
 class ProcessorCore {
  public:
+  /// The printable path of the node, and its description; texts as with processors.
   std::string getInstanceID() const;
   bool setInstanceID(std::string instanceID);
   std::string getElementName() const;
@@ -153,6 +158,7 @@ class ProcessorCore {
 /// One processor cache.
 class Memory {
  public:
+  /// The printable path of the node, and its description; texts as with processors.
   std::string getMemoryDeviceID() const;
   bool setMemoryDeviceID(std::string deviceID);
   std::string getElementName() const;
@@ -222,9 +228,11 @@ bool checkIfVirtual();
 /// Appends `in` to `out` without blanks and with letters in upper case (ASCII).
 void FormatUniqueId(std::string& in, std::string& out);
 
-// Relationships. Each appends the records related to the one with the given identifier and returns
-// 0, or 1 on failure. An identifier that names no node finds nothing. The records come from a full
-// collection, so they are always as the collections report them.
+// Relationships. Each appends the records related to the one with the given identifier, a printable path,
+// and returns 0, or 1 on failure. An identifier that names no node finds nothing: that is 1 for the
+// queries that begin at a core or a cache, which look for its processor first, and 0 for those that begin
+// at a processor. The records come from a full collection, so they are always as the collections report
+// them.
 
 unsigned short getCPUProcessorsFromCPUProcCore(std::string instanceID, std::vector<Processor>& matchedProcessors);
 unsigned short getCPUProcessorsFromCPUMemory(std::string deviceID, std::vector<Processor>& matchedProcessors);
