@@ -22,21 +22,28 @@ void indexRecords(const std::vector<Record>& records, std::string (Record::*iden
   }
 }
 
+// Fixed: log filters know these events by their lines.
+constexpr unsigned int factoryEntryLine = 54;
+constexpr unsigned int factoryExitLine = 84;
+constexpr unsigned int constructionEntryLine = 103;
+constexpr unsigned int constructionExitLine = 128;
+
 }  // namespace
 
 CPUObjFactory* CPUObjFactory::getFactoryInstance(bool isProc, bool isMem, bool isProcCore) {
-  factoryEvents.entering({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, 54);
+  factoryEvents.entering({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, factoryEntryLine);
   static CPUObjFactory factory(isProc, isMem, isProcCore);
   // Also on the first call: a kind whose collection failed in the constructor gets a second attempt.
   factory.collect(isProc && !_isProcPopulated, isMem && !_isMemPopulated, isProcCore && !_isProcCorePopulated);
-  factoryEvents.exiting({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, 84);
+  factoryEvents.exiting({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, factoryExitLine);
   return &factory;
 }
 
 CPUObjFactory::CPUObjFactory(bool isProc, bool isMem, bool isProcCore) {
-  factoryEvents.entering({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, 103);
+  factoryEvents.entering({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}},
+                         constructionEntryLine);
   collect(isProc, isMem, isProcCore);
-  factoryEvents.exiting({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, 128);
+  factoryEvents.exiting({{" isProc=", isProc}, {" isMem=", isMem}, {" isProcCore=", isProcCore}}, constructionExitLine);
 }
 
 CPUObjFactory::CPUObjFactory(const CPUObjFactory& /*other*/) {}

@@ -9,28 +9,28 @@ namespace {
 using Core = ProcessorCore;
 
 constexpr Property<Core> coreProperties[] = {
-    {"Caption", "Caption", localized, L"MSGID_CPU_PROC_CORE_CAPTION"},
-    {"Description", "Description", localized, L"MSGID_CPU_PROC_CORE_DESCRIPTION"},
-    {"ElementName", "ElementName", chars<&Core::getElementName>},
-    {"CoreEnabledState", "CoreEnabledState", uint16<&Core::getCoreEnabledState>},
-    {"EnabledState", "EnabledState", uint16<&Core::getEnabledState>},
-    {"RequestedState", "RequestedState", uint16<&Core::getRequestedState>},
-    {"HealthState", "HealthState", uint16<&Core::getHealthState>},
-    {"OperationalStatus", "OperationalStatus", uint16Array<&Core::getOperationalStatus>},
+    {"Caption", localized, L"MSGID_CPU_PROC_CORE_CAPTION"},
+    {"Description", localized, L"MSGID_CPU_PROC_CORE_DESCRIPTION"},
+    {"ElementName", chars<&Core::getElementName>},
+    {"CoreEnabledState", uint16<&Core::getCoreEnabledState>},
+    {"EnabledState", uint16<&Core::getEnabledState>},
+    {"RequestedState", uint16<&Core::getRequestedState>},
+    {"HealthState", uint16<&Core::getHealthState>},
+    {"OperationalStatus", uint16Array<&Core::getOperationalStatus>},
 };
 
 constexpr Property<Memory> memoryProperties[] = {
-    {"Caption", "Caption", localized, L"MSGID_CPU_MEMORY_CAPTION"},
-    {"Description", "Description", localized, L"MSGID_CPU_MEMORY_DESCRIPTION"},
-    {"ElementName", "ElementName", chars<&Memory::getElementName>},
-    {"Name", "Name", chars<&Memory::getCacheName>},
-    {"BlockSize", "BlockSize", uint64<&Memory::getBlockSize>},
-    {"NumberOfBlocks", "NumberOfBlocks", uint64<&Memory::getNumberOfBlocks>},
-    {"ConsumableBlocks", "ConsumableBlocks", uint64<&Memory::getConsumableBlocks>},
-    {"EnabledState", "EnabledState", uint16<&Memory::getEnabledState>},
-    {"HealthState", "HealthState", uint16<&Memory::getHealthState>},
-    {"RequestedState", "RequestedState", uint16<&Memory::getRequestedState>},
-    {"OperationalStatus", "OperationalStatus", uint16Array<&Memory::getOperationalStatus>},
+    {"Caption", localized, L"MSGID_CPU_MEMORY_CAPTION"},
+    {"Description", localized, L"MSGID_CPU_MEMORY_DESCRIPTION"},
+    {"ElementName", chars<&Memory::getElementName>},
+    {"Name", chars<&Memory::getCacheName>},
+    {"BlockSize", uint64<&Memory::getBlockSize>},
+    {"NumberOfBlocks", uint64<&Memory::getNumberOfBlocks>},
+    {"ConsumableBlocks", uint64<&Memory::getConsumableBlocks>},
+    {"EnabledState", uint16<&Memory::getEnabledState>},
+    {"HealthState", uint16<&Memory::getHealthState>},
+    {"RequestedState", uint16<&Memory::getRequestedState>},
+    {"OperationalStatus", uint16Array<&Memory::getOperationalStatus>},
 };
 
 constexpr InstanceClass<Core> coreInstances{

@@ -5,7 +5,6 @@
 #include <tarn/Common.h>
 #include <tarn/Locale.h>
 
-#include <algorithm>
 #include <span>
 #include <string>
 #include <string_view>
@@ -33,15 +32,14 @@ struct InstanceTarget {
   const char* function;  ///< that events are reported for
 };
 
-/// One property: the name by which a property list selects it, the name it is set under, and how its
-/// value gets from the record into the instance.
+/// One property: its name, and how its value gets from the record into the instance.
 template <class Record>
 struct Property {
-  const char* selection;
   const char* name;
   void (*set)(const InstanceTarget& target, const Property& property, Record& record);
   const wchar_t* messageId = nullptr;  ///< localized texts: the message
   const char* traceName = nullptr;     ///< the name of the variable that the value is traced as
+  const char* selection = name;        ///< the name by which a property list selects it
 };
 
 template <class Record>
@@ -155,14 +153,11 @@ template <class Record>
 CMPIInstance* makeInstance(const InstanceClass<Record>& instanceClass, const CMPIBroker* broker,
                            const CMPIObjectPath* ref, Record& record, const char** properties, bool isObjPath,
                            CMPIStatus* rc, const char* function = __builtin_FUNCTION()) {
-  CMPIObjectPath* path = CMNewObjectPath(broker, namespaceOf(ref, rc), instanceClass.name, nullptr);
+  const std::string systemName = getSystemName();
+  const CMPIObjectPath* path = newPath(broker, ref, instanceClass.name, systemName, rc, nullptr);
   if (isNull(path)) {
     return nullptr;
   }
-  const std::string systemName = getSystemName();
-  CMSetNameSpace(path, namespaceOf(ref, rc));
-  CMSetHostname(path, systemName.c_str());
-
   CMPIInstance* instance = CMNewInstance(broker, path, nullptr);
   if (isNull(instance)) {
     return instance;

@@ -1,6 +1,7 @@
 #include <CPUObjFactory.h>
 #include <CmpiObjects.h>
 
+#include "BuildRequest.h"
 #include "FactoryEvents.h"
 #include "ObjectKeys.h"
 
@@ -10,30 +11,9 @@ namespace {
 
 enum Result : unsigned short { Found = 0, NothingFound = 1, PathNotCreated = 2 };
 
-/// The builder that makes an instance of one class from a record.
-template <class Record>
-using Builder = CMPIInstance* (CPUObjFactory::*)(const CMPIBroker*, const CMPIObjectPath*, Record, const char**, bool,
-                                                 CMPIStatus*);
-
-/// What a request asks of the builder, for every record alike.
-struct InstanceRequest {
-  const CMPIBroker* broker;
-  const CMPIObjectPath* ref;
-  const char** properties;
-  bool isObjPath;
-  std::vector<CMPIInstance*>& instances;
-  CMPIStatus* rc;
-};
-
-template <class Record>
-void append(CPUObjFactory& factory, Builder<Record> build, const Record& record, const InstanceRequest& request) {
-  request.instances.push_back(
-      (factory.*build)(request.broker, request.ref, record, request.properties, request.isObjPath, request.rc));
-}
-
 template <class Record>
 void appendAll(CPUObjFactory& factory, const std::map<std::string, Record>& map, Builder<Record> build,
-               const InstanceRequest& request) {
+               const BuildRequest& request) {
   for (const auto& [identifier, record] : map) {
     append(factory, build, record, request);
   }
@@ -42,7 +22,7 @@ void appendAll(CPUObjFactory& factory, const std::map<std::string, Record>& map,
 /// All records of a map that must not be empty.
 template <class Record>
 unsigned short appendAllOfSome(CPUObjFactory& factory, const std::map<std::string, Record>& map, Builder<Record> build,
-                               const InstanceRequest& request, const char* function = __builtin_FUNCTION()) {
+                               const BuildRequest& request, const char* function = __builtin_FUNCTION()) {
   if (map.empty()) {
     factoryEvents.message(LevelError, "***No Instance found***", __builtin_LINE(), function);
     return NothingFound;
@@ -54,7 +34,7 @@ unsigned short appendAllOfSome(CPUObjFactory& factory, const std::map<std::strin
 /// The record of one key; `failure` also stands for a key that is missing in a filled map.
 template <class Record>
 unsigned short appendOne(CPUObjFactory& factory, const std::map<std::string, Record>& map, const std::string& key,
-                         Builder<Record> build, const InstanceRequest& request, const char* failure,
+                         Builder<Record> build, const BuildRequest& request, const char* failure,
                          const char* function = __builtin_FUNCTION()) {
   const auto entry = map.find(key);
   if (entry == map.end()) {
@@ -93,16 +73,14 @@ unsigned short appendPaths(const PathClass<Record>& pathClass, const std::map<st
     factoryEvents.message(LevelError, "***No ObjPaths found***", __builtin_LINE(), function);
     return NothingFound;
   }
+  const std::string systemName = getSystemName();
   for (const auto& [identifier, record] : map) {
-    CMPIObjectPath* path = CMNewObjectPath(broker, namespaceOf(ref, status), pathClass.name, nullptr);
+    CMPIObjectPath* path = newPath(broker, ref, pathClass.name, systemName, status, nullptr);
     if (isNull(path)) {
       setFailure(broker, status, "Create CMPIObjectPath failed.");
       factoryEvents.message(LevelError, pathClass.failure, __builtin_LINE(), function);
       return PathNotCreated;
     }
-    const std::string systemName = getSystemName();
-    CMSetNameSpace(path, namespaceOf(ref, status));
-    CMSetHostname(path, systemName.c_str());
     const ObjectKeys keys(pathClass.keyStyle, pathClass.name, (record.*pathClass.identifier)(), systemName);
     for (const ObjectKeys::Key& key : keys) {
       CMAddKey(path, key.name, key.value, CMPI_chars);

@@ -1,10 +1,10 @@
+#include <CPUClassNames.h>
 #include <CPUObjFactory.h>
 #include <CmpiObjects.h>
 
-#include <CPUClassNames.h>
-
 #include <string_view>
 
+#include "BuildRequest.h"
 #include "FactoryEvents.h"
 
 namespace Tarn::CPUProvider {
@@ -16,8 +16,7 @@ template <class Record>
 struct Relationship {
   const char* handleName;  ///< the handle's name in traces
   unsigned short (*query)(std::string, std::vector<Record>&);
-  CMPIInstance* (CPUObjFactory::*build)(const CMPIBroker*, const CMPIObjectPath*, Record, const char**, bool,
-                                        CMPIStatus*);
+  Builder<Record> build;
   const char* failure;
   const char* failureAsVariable = nullptr;  ///< where the failure is traced as a variable of this name
 };
@@ -41,36 +40,24 @@ constexpr Relationship<Processor> processorOfCore{"instanceID", getCPUProcessors
                                                   &CPUObjFactory::makeCPUProcInstance,
                                                   "***getCPUProcessorsFromCPUProcCore failed***"};
 
-/// A navigation function's arguments.
-struct Call {
-  const CMPIBroker* broker;
-  const CMPIObjectPath* ref;
-  CMPIString* key;
-  const char** properties;
-  bool isObjPath;
-  std::vector<CMPIInstance*>& instances;
-  CMPIStatus* rc;
-};
-
 template <class Record>
-unsigned short follow(CPUObjFactory& factory, const Relationship<Record>& relationship, const Call& call,
-                      const char* function = __builtin_FUNCTION()) {
-  const ParameterList parameters{{" broker=", call.broker},
-                                 {" ref=", call.ref},
-                                 {" key=", call.key},
-                                 {" properties=", call.properties},
-                                 {" isObjPath=", call.isObjPath},
-                                 {" instances=", &call.instances},
-                                 {" rc=", call.rc}};
+unsigned short follow(CPUObjFactory& factory, const Relationship<Record>& relationship, CMPIString* key,
+                      const BuildRequest& request, const char* function = __builtin_FUNCTION()) {
+  const ParameterList parameters{{" broker=", request.broker},
+                                 {" ref=", request.ref},
+                                 {" key=", key},
+                                 {" properties=", request.properties},
+                                 {" isObjPath=", request.isObjPath},
+                                 {" instances=", &request.instances},
+                                 {" rc=", request.rc}};
   factoryEvents.entering(parameters, __builtin_LINE(), function);
-  const std::string handle = charsOf(call.key, call.rc);
+  const std::string handle = charsOf(key, request.rc);
   factoryEvents.variable(relationship.handleName, handle.c_str(), __builtin_LINE(), function);
 
   std::vector<Record> records;
   if (relationship.query(handle, records) == 0) {
     for (const Record& record : records) {
-      call.instances.push_back(
-          (factory.*relationship.build)(call.broker, call.ref, record, call.properties, call.isObjPath, call.rc));
+      append(factory, relationship.build, record, request);
     }
   } else if (relationship.failureAsVariable != nullptr) {
     factoryEvents.variable(LevelError, relationship.failureAsVariable, relationship.failure, __builtin_LINE(),
@@ -103,6 +90,9 @@ constexpr Target targets[] = {
     {cpuProcessorClass, cpuConcreteComponentClass, "Target Class is cpuProcessorCoreClass", cpuProcessorCoreClass},
 };
 
+/// Fixed: log filters know this message by its line.
+constexpr unsigned int processorMapEmptyLine = 2044;
+
 constexpr Target noTarget{"", "", "Target Class is empty", ""};
 
 const Target& findTarget(std::string_view sourceClass, const char* association) {
@@ -121,7 +111,7 @@ const Target& findTarget(std::string_view sourceClass, const char* association) 
 unsigned short CPUObjFactory::getProcessorCoreRefByProcHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                               CMPIString* key, const char** properties, bool isObjPath,
                                                               std::vector<CMPIInstance*>& instances, CMPIStatus* rc) {
-  return follow(*this, coresOfProcessor, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, coresOfProcessor, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getCPUMemoryRefByProcessorCoreHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
@@ -129,32 +119,32 @@ unsigned short CPUObjFactory::getCPUMemoryRefByProcessorCoreHandle(const CMPIBro
                                                                    bool isObjPath,
                                                                    std::vector<CMPIInstance*>& instances,
                                                                    CMPIStatus* rc) {
-  return follow(*this, cachesOfCore, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, cachesOfCore, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getProcessorCoreRefByMemoryHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                                 CMPIString* key, const char** properties,
                                                                 bool isObjPath, std::vector<CMPIInstance*>& instances,
                                                                 CMPIStatus* rc) {
-  return follow(*this, coresOfCache, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, coresOfCache, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getCPUMemoryRefByProcessorHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                                CMPIString* key, const char** properties, bool isObjPath,
                                                                std::vector<CMPIInstance*>& instances, CMPIStatus* rc) {
-  return follow(*this, cachesOfProcessor, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, cachesOfProcessor, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getProcessorRefByMemoryHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                             CMPIString* key, const char** properties, bool isObjPath,
                                                             std::vector<CMPIInstance*>& instances, CMPIStatus* rc) {
-  return follow(*this, processorOfCache, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, processorOfCache, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getProcessorRefByProcCoreHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                               CMPIString* key, const char** properties, bool isObjPath,
                                                               std::vector<CMPIInstance*>& instances, CMPIStatus* rc) {
-  return follow(*this, processorOfCore, {broker, ref, key, properties, isObjPath, instances, rc});
+  return follow(*this, processorOfCore, key, {broker, ref, properties, isObjPath, instances, rc});
 }
 
 unsigned short CPUObjFactory::getProcessorCapRefByProcHandle(const CMPIBroker* broker, const CMPIObjectPath* ref,
@@ -169,7 +159,7 @@ unsigned short CPUObjFactory::getProcessorCapRefByProcHandle(const CMPIBroker* b
 
   const auto entry = _processorMap.find(deviceId);
   if (entry == _processorMap.end()) {
-    factoryEvents.message(LevelError, "Processor map empty", 2044);
+    factoryEvents.message(LevelError, "Processor map empty", processorMapEmptyLine);
     return 1;
   }
   const std::string instanceId = entry->second.getInstanceId();
@@ -257,10 +247,7 @@ CMPIObjectPath* CPUObjFactory::get_assoc_targetClass_ObjectPath(const CMPIBroker
 
   CMPIObjectPath* path = nullptr;
   if (!targetName.empty()) {
-    path = CMNewObjectPath(_broker, namespaceOf(ref), targetName.data(), rc);
-    if (!isNull(path)) {
-      stampPath(path, ref);
-    }
+    path = newPath(_broker, ref, targetName.data(), getSystemName(), nullptr, rc);
   }
   factoryEvents.exiting(parameters);
   return path;

@@ -8,6 +8,7 @@
 #include <tarn/Common.h>
 
 #include <algorithm>
+#include <string>
 #include <string_view>
 
 /// The few things that are said again and again about CMPI objects. A broker may answer NULL
@@ -53,9 +54,21 @@ inline bool equalIgnoringCase(std::string_view left, std::string_view right) {
 }
 
 /// Gives a path the namespace of another and this system's host name.
-inline void stampPath(CMPIObjectPath* path, const CMPIObjectPath* ref) {
-  CMSetNameSpace(path, namespaceOf(ref));
-  CMSetHostname(path, getSystemName().c_str());
+inline void stampPath(CMPIObjectPath* path, const CMPIObjectPath* ref, const std::string& systemName = getSystemName(),
+                      CMPIStatus* readStatus = nullptr) {
+  CMSetNameSpace(path, namespaceOf(ref, readStatus));
+  CMSetHostname(path, systemName.c_str());
+}
+
+/// A path of a class without keys, in the namespace of another and with this system's host name; what the broker
+/// answers when it has none. The two statuses are of reading the namespace and of making the path.
+inline CMPIObjectPath* newPath(const CMPIBroker* broker, const CMPIObjectPath* ref, const char* className,
+                               const std::string& systemName, CMPIStatus* readStatus, CMPIStatus* makeStatus) {
+  CMPIObjectPath* path = CMNewObjectPath(broker, namespaceOf(ref, readStatus), className, makeStatus);
+  if (!isNull(path)) {
+    stampPath(path, ref, systemName, readStatus);
+  }
+  return path;
 }
 
 /// Sets a failure with a message of the broker's making; without a broker there is no message.

@@ -1,7 +1,6 @@
 #ifndef TARN_ASSOCIATIONSTEPS_H
 #define TARN_ASSOCIATIONSTEPS_H
 
-#include <iterator>
 #include <span>
 #include <string_view>
 #include <type_traits>
@@ -70,11 +69,7 @@ inline CMPIObjectPath* pathOf(const CMPIInstance* element) {
 
 /// An empty path of the association class, in the namespace of `cop`; NULL when the broker has none.
 inline CMPIObjectPath* newAssociationPath(const Association& association, const CMPIObjectPath* cop) {
-  CMPIObjectPath* path = CMNewObjectPath(association.broker, namespaceOf(cop), association.className, nullptr);
-  if (!isNull(path)) {
-    stampPath(path, cop);
-  }
-  return path;
+  return newPath(association.broker, cop, association.className, getSystemName(), nullptr, nullptr);
 }
 
 inline void setEnds(const Association& association, CMPIInstance* instance, const CMPIObjectPath* first,

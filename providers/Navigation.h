@@ -1,6 +1,7 @@
 #ifndef TARN_NAVIGATION_H
 #define TARN_NAVIGATION_H
 
+#include <iterator>
 #include <optional>
 
 #include "AssociationSteps.h"
