@@ -1,7 +1,5 @@
 // Masking the firmware's table: it keeps its shape and what is wrong with it, and masking it twice changes nothing.
 
-#include <span>
-
 #include "fuzz/Target.h"
 #include "platform/instrumentation/smbios/Tables.h"
 #include "platform/instrumentation/snapshot/SmbiosMask.h"

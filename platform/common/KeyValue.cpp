@@ -2,8 +2,6 @@
 
 #include <cmpift.h>
 
-#include <type_traits>
-
 namespace Tarn::Common {
 namespace {
 

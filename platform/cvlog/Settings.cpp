@@ -3,7 +3,6 @@
 #include <array>
 #include <charconv>
 #include <cstdint>
-#include <functional>
 #include <limits>
 
 #include "platform/common/Ascii.h"

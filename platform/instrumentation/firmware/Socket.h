@@ -1,7 +1,6 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_FIRMWARE_SOCKET_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_FIRMWARE_SOCKET_H
 
-#include <memory>
 #include <string>
 #include <vector>
 

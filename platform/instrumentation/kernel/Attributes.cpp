@@ -1,6 +1,7 @@
 #include "platform/instrumentation/kernel/Attributes.h"
 
 #include <algorithm>
+#include <charconv>
 
 #include "platform/common/Ascii.h"
 

@@ -2,7 +2,6 @@
 #define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_ATTRIBUTES_H
 
 #include <array>
-#include <charconv>
 #include <optional>
 #include <string>
 #include <string_view>

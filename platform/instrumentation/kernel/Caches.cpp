@@ -2,8 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <cerrno>
-#include <charconv>
 #include <string>
 #include <tuple>
 

@@ -1,8 +1,6 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_KERNELPROCESSOR_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_KERNELPROCESSOR_H
 
-#include <optional>
-
 #include "platform/instrumentation/kernel/CpuIdentity.h"
 #include "platform/instrumentation/kernel/KernelView.h"
 #include "platform/instrumentation/tree/Facts.h"

@@ -1,7 +1,6 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_SYSTEMMODEL_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_SYSTEMMODEL_H
 
-#include <string>
 #include <string_view>
 
 #include "platform/instrumentation/kernel/Machine.h"

@@ -1,7 +1,6 @@
 #include "platform/instrumentation/kernel/Topology.h"
 
 #include <algorithm>
-#include <charconv>
 #include <string>
 #include <tuple>
 #include <utility>

@@ -18,7 +18,6 @@
 #include "platform/instrumentation/live/SocketAssignment.h"
 #include "platform/instrumentation/tree/Error.h"
 #include "platform/instrumentation/tree/Facts.h"
-#include "platform/instrumentation/tree/PropertyTable.h"
 #include "platform/instrumentation/tree/TreeBuilder.h"
 
 namespace Tarn::Inventory {

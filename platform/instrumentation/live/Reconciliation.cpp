@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <string_view>
 
 #include "platform/instrumentation/firmware/SocketMatching.h"
 #include "platform/instrumentation/kernel/CimFamily.h"

@@ -5,7 +5,6 @@
 
 #include "platform/instrumentation/firmware/SocketMatching.h"
 #include "platform/instrumentation/live/NodePaths.h"
-#include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Tarn::Inventory {
 

@@ -2,7 +2,6 @@
 #define CORVANE_PLATFORM_INSTRUMENTATION_SMBIOS_FIELD_H
 
 #include <cstddef>
-#include <cstdint>
 #include <optional>
 #include <string>
 

@@ -2,7 +2,6 @@
 #define CORVANE_PLATFORM_INSTRUMENTATION_SMBIOS_PROCESSOR_H
 
 #include <array>
-#include <cstddef>
 #include <cstdint>
 #include <string>
 

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <string>
-#include <utility>
 
 #include "platform/instrumentation/smbios/Hexadecimal.h"
 

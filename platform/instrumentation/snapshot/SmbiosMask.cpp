@@ -4,7 +4,6 @@
 #include <array>
 #include <cstdint>
 #include <set>
-#include <span>
 #include <variant>
 
 #include "platform/common/Ascii.h"

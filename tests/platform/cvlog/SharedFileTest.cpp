@@ -1,8 +1,7 @@
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <algorithm>
 #include <map>
 #include <sstream>
 #include <string>

@@ -6,7 +6,6 @@
 
 #include <array>
 #include <csignal>
-#include <string>
 
 #include "tests/platform/cvlog/LogDirectory.h"
 

@@ -1,8 +1,6 @@
 #include <gtest/gtest.h>
 #include <tarn/Instrumentation.h>
 
-#include <algorithm>
-
 #include "platform/instrumentation/ProcessTree.h"
 #include "platform/instrumentation/tree/TreeBuilder.h"
 

@@ -1,8 +1,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <cerrno>
-
 #include "tests/platform/instrumentation/KernelFiles.h"
 
 namespace Tarn::Inventory {

@@ -2,7 +2,6 @@
 #include <gtest/gtest.h>
 
 #include "platform/instrumentation/live/LiveSource.h"
-#include "platform/instrumentation/tree/PropertyTable.h"
 #include "tests/platform/instrumentation/live/XeonPackages.h"
 
 namespace Tarn::Inventory {

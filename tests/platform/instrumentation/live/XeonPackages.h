@@ -1,7 +1,6 @@
 #ifndef CORVANE_TESTS_PLATFORM_INSTRUMENTATION_LIVE_XEONPACKAGES_H
 #define CORVANE_TESTS_PLATFORM_INSTRUMENTATION_LIVE_XEONPACKAGES_H
 
-#include <optional>
 #include <string>
 
 #include "tests/platform/instrumentation/KernelFiles.h"
