@@ -1,5 +1,3 @@
-#include <cstddef>
-
 #include "tests/factory/FactoryTest.h"
 
 using namespace FactoryTests;

@@ -1,7 +1,5 @@
 #include <string>
 #include <type_traits>
-#include <utility>
-#include <vector>
 
 #include "tests/factory/FactoryTest.h"
 

@@ -6,7 +6,6 @@
 #include <cstring>
 #include <fstream>
 #include <iterator>
-#include <span>
 #include <stdexcept>
 
 namespace Library {

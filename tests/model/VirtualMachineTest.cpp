@@ -1,6 +1,5 @@
 #include <CPU.h>
 
-#include <string>
 #include <vector>
 
 #include "tests/model/ModelEvents.h"

@@ -2,8 +2,6 @@
 
 #include <CPUObjFactory.h>
 
-#include <algorithm>
-
 #include "tests/providers/AssociationRows.h"
 
 namespace {

@@ -3,8 +3,6 @@
 #include <tarn/Common.h>
 #include <tarn/Locale.h>
 
-#include <utility>
-
 namespace Scripted {
 
 Texts& texts() {

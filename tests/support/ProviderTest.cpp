@@ -2,8 +2,6 @@
 
 #include <CPUObjFactory.h>
 
-#include <utility>
-
 namespace Support {
 
 using Corvcim::ObjectPath;

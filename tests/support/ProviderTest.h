@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <string>
-#include <vector>
 
 #include "host/broker/Broker.h"
 #include "tests/seam/ScriptedTest.h"

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <numeric>
-#include <string_view>
 #include <utility>
 
 namespace Support {
