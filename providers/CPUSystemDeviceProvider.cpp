@@ -160,7 +160,7 @@ CMPIStatus answerFarEnds(const CMPIObjectPath* cop, const char* assocClass, cons
                          const char* function = __builtin_FUNCTION()) {
   events.providerEntry(line, function);
   Navigation navigation(association, factoryOfProcessors(), cop, line, function);
-  if (!navigation.hasTarget(assocClass, resultClass)) {
+  if (!navigation.lookUpTarget(assocClass, resultClass)) {
     events.providerExit(line, function);
     return succeeded();
   }

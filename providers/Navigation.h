@@ -43,14 +43,14 @@ struct Navigation {
       : association(through), factory(with), source(from), line(atLine), function(atFunction) {}
 
   /// Finds out which class is at the far end; false, silently, where the request leads nowhere.
-  bool hasTarget(const char* assocClass, const char* resultClass) {
+  bool lookUpTarget(const char* assocClass, const char* resultClass) {
     target = factory->get_assoc_targetClass_ObjectPath(association.broker, source, assocClass, resultClass, &status);
     return !isNull(target);
   }
 
   /// The same; says `absent` where the request leads nowhere.
   bool findTarget(const char* assocClass, const char* resultClass, const FailureTexts& absent) {
-    if (hasTarget(assocClass, resultClass)) {
+    if (lookUpTarget(assocClass, resultClass)) {
       return true;
     }
     fail(association, &status, absent, line, function);
@@ -59,7 +59,7 @@ struct Navigation {
 
   /// The same for references, which need a template as well.
   bool findTargetOfReferences(const FailureTexts& absent) {
-    const bool leadsSomewhere = hasTarget(association.className, nullptr);
+    const bool leadsSomewhere = lookUpTarget(association.className, nullptr);
     templatePath = newAssociationPath(association, source);
     if (leadsSomewhere && !isNull(templatePath)) {
       return true;
