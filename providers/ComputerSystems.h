@@ -29,7 +29,8 @@ bool forEachAnswer(const Association& association, const CMPIEnumeration* enumer
   constexpr int patience = 1000;
   int callsInVain = 0;
   while (callsInVain < patience && !isNull(enumeration) && CMHasNext(enumeration, nullptr) != 0) {
-    const CMPIData data = CMGetNext(enumeration, nullptr);
+    CMPIStatus unused = succeeded();  // what counts is whether there is an element
+    const CMPIData data = CMGetNext(enumeration, &unused);
     const bool isElement = hasValue(data) && !isNull(data.value.*kind);
     if (isElement && !handle(data.value.*kind)) {
       return false;

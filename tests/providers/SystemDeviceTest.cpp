@@ -1,7 +1,5 @@
 // What only the association of computer systems has: result classes, and another provider's answers.
 
-#include <cmpimacs.h>
-
 #include "tests/providers/AssociationRows.h"
 
 namespace {
@@ -306,110 +304,6 @@ TEST_F(SystemDevice, NothingIsLostToABrokerThatSetsAFailingStatusWithGoodElement
   }
   EXPECT_EQ(enumerateInstances(systemDevice).instances.size(), 6U);
   EXPECT_EQ(enumerateInstanceNames(systemDevice).paths.size(), 6U);
-}
-
-/// What the endless enumeration of a broker gives, and how often it was asked.
-struct Endless {
-  const CMPIBroker* broker = nullptr;
-  CMPIStatus status{CMPI_RC_OK, nullptr};  ///< of its calls
-  bool ofInstances = false;
-  unsigned int calls = 0;
-
-  /// The first system comes with the thousandth call and the second with the two thousandth: no call gives
-  /// another.
-  bool givesElement() const { return calls == 1000 || calls == 2000; }
-};
-
-Endless endless;
-
-CMPIData nextOfEndless(const CMPIEnumeration* /*enumeration*/, CMPIStatus* status) {
-  ++endless.calls;
-  if (status != nullptr) {
-    *status = endless.status;
-  }
-  CMPIData element{};
-  element.state = CMPI_nullValue;
-  element.value.uint64 = 1;  // no pointer: what is no value is not to be looked at
-  if (endless.givesElement()) {
-    CMPIObjectPath* path =
-        CMNewObjectPath(endless.broker, Support::testNameSpace.c_str(), systemClass.c_str(), nullptr);
-    element.state = CMPI_goodValue;
-    if (endless.ofInstances) {
-      element.value.inst = CMNewInstance(endless.broker, path, nullptr);
-    } else {
-      element.value.ref = path;
-    }
-  }
-  return element;
-}
-
-CMPIEnumeration* endlessEnumeration() {
-  static const CMPIEnumerationFT table = [] {
-    CMPIEnumerationFT functions{};
-    functions.getNext = nextOfEndless;
-    functions.hasNext = [](const CMPIEnumeration*, CMPIStatus*) { return CMPIBoolean{1}; };
-    return functions;
-  }();
-  static CMPIEnumeration enumeration{&endless, &table};
-  return &enumeration;
-}
-
-/// A broker that never comes to the end of an enumeration of systems.
-class EndlessEnumeration : public SystemDevice, public ::testing::WithParamInterface<CMPIrc> {
- protected:
-  EndlessEnumeration() : record_(*broker.handle()), services_(*record_.bft) {
-    services_.enumerateInstanceNames = [](const CMPIBroker*, const CMPIContext*, const CMPIObjectPath*,
-                                          CMPIStatus* status) {
-      *status = {CMPI_RC_OK, nullptr};
-      return endlessEnumeration();
-    };
-    services_.enumerateInstances = [](const CMPIBroker*, const CMPIContext*, const CMPIObjectPath*, const char**,
-                                      CMPIStatus* status) {
-      *status = {CMPI_RC_OK, nullptr};
-      return endlessEnumeration();
-    };
-    record_.bft = &services_;
-  }
-
-  Response askEndlessly(OperationKind kind, const ObjectPath& path) {
-    endless = {&record_, {GetParam(), nullptr}, kind == OperationKind::Associators, 0};
-    Corvcim::Operation operation{kind, path, {}, {}};
-    if (!Corvcim::isAssociationOperation(kind)) {
-      return broker.perform(provider().createInstanceMI(&record_, nullptr, nullptr), operation);
-    }
-    operation.filter.assocClass = systemDevice;
-    return broker.perform(provider().createAssociationMI(&record_, nullptr, nullptr), operation);
-  }
-
- private:
-  CMPIBroker record_;
-  CMPIBrokerFT services_;
-};
-
-std::string statusName(const ::testing::TestParamInfo<CMPIrc>& tested) {
-  return tested.param == CMPI_RC_OK ? "Succeeding" : "Failing";
-}
-
-INSTANTIATE_TEST_SUITE_P(OfEachKind, EndlessEnumeration, ::testing::Values(CMPI_RC_OK, CMPI_RC_ERR_FAILED), statusName);
-
-const std::string givenUp = "1000 calls in a row gave no computer system: the enumeration is given up";
-
-TEST_P(EndlessEnumeration, IsGivenUpAfterAThousandCallsInVain) {
-  for (const OperationKind kind : associationOperations) {
-    const Response response = askEndlessly(kind, processorPath("cpu0"));
-    EXPECT_EQ(results(response), 2U) << Corvcim::operationName(kind);
-    EXPECT_EQ(outcome(response), "CMPI_RC_OK no message not done");
-    EXPECT_EQ(endless.calls, 3000U);
-    Support::expectEvents(provider(), EventList(entering(kind, systemClass)).error(givenUp).exiting());
-  }
-}
-
-TEST_P(EndlessEnumeration, DoesNotFailTheEnumerationOfAssociations) {
-  const Response names = askEndlessly(OperationKind::EnumerateInstanceNames, Support::classPath(systemDevice));
-  EXPECT_EQ(names.paths.size(), 4U);
-  EXPECT_EQ(outcome(names), "CMPI_RC_OK no message done");
-  Support::expectEvents(provider(), EventList(provider(), "EnumInstanceNames").entering().error(givenUp).exiting());
-  EXPECT_EQ(askEndlessly(OperationKind::EnumerateInstances, Support::classPath(systemDevice)).instances.size(), 4U);
 }
 
 }  // namespace
