@@ -38,11 +38,14 @@ CMPIStatus answer(Operation operation) {
   }
 }
 
-/// A string key's text; NULL where the path has no such key or it is no string.
+/// A string key's text; NULL where the path has no such key or it is no string. Minimal brokers leave the type of
+/// a string open.
 const char* keyText(const CMPIObjectPath* path, const char* name) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
   const CMPIData key = CMGetKey(path, name, &status);
-  if (status.rc != CMPI_RC_OK || key.type != CMPI_string || isNull(key.value.string)) {
+  const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
+  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
+  if (status.rc != CMPI_RC_OK || !mayBeString || (key.state & noValue) != 0 || isNull(key.value.string)) {
     return nullptr;
   }
   return CMGetCharPtr(key.value.string);

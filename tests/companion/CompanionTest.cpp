@@ -10,6 +10,7 @@
 #include <thread>
 
 #include "host/broker/Broker.h"
+#include "host/broker/Objects.h"
 #include "host/broker/ProviderLibrary.h"
 #include "host/broker/Request.h"
 #include "platform/instrumentation/tree/JsonTree.h"
@@ -229,6 +230,25 @@ TEST_F(Companion, AKeyWithoutAStringIsMissing) {
       EXPECT_EQ(response.rc, CMPI_RC_ERR_INVALID_PARAMETER);
     }
   }
+}
+
+// Minimal brokers leave the type of a string open.
+TEST_F(Companion, AStringWithoutItsTypeIsAKey) {
+  Request request(broker_, "root/test");
+  CMPIObjectPathFT table = objectPathOperations;
+  table.getKey = [](const CMPIObjectPath* self, const char* name, CMPIStatus* status) {
+    CMPIData key = objectPathOperations.getKey(self, name, status);
+    key.type = CMPI_null;
+    return key;
+  };
+  CMPIObjectPath* path = request.objectPath(systemPath(Tarn::getSystemName()));
+  path->ft = &table;
+  CMPIInstanceMI* instances = mi();
+
+  const CMPIStatus status = instances->ft->getInstance(instances, request.context(), request.result(), path, nullptr);
+
+  EXPECT_EQ(status.rc, CMPI_RC_OK);
+  EXPECT_EQ(request.response(status).instances.size(), 1U);
 }
 
 /// A broker whose threads may end while they make an instance.
