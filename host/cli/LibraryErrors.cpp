@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <array>
 #include <string_view>
+#include <unordered_set>
 
 #include "host/cli/StandardStreams.h"
 #include "platform/common/Configuration.h"
@@ -47,9 +48,10 @@ void giveBack() {
 
 std::vector<std::string> differentLines(std::string_view text) {
   std::vector<std::string> lines;
+  std::unordered_set<std::string_view> seen;
   while (!text.empty()) {
     const std::string_view line = text.substr(0, text.find('\n'));
-    if (!line.empty() && std::ranges::find(lines, line) == lines.end()) {
+    if (!line.empty() && seen.insert(line).second) {
       lines.emplace_back(line);
     }
     text.remove_prefix(std::min(text.size(), line.size() + 1));
