@@ -11,6 +11,7 @@
 #include "platform/instrumentation/live/CoreNodes.h"
 #include "platform/instrumentation/live/NodePaths.h"
 #include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/PlainText.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 #include "platform/instrumentation/tree/TreeBuilder.h"
 
@@ -107,7 +108,7 @@ class Writer {
 
  private:
   void addSystem() {
-    const std::string_view model = firmwareRemark(machine_, {"DMIProductName", "PlatformModel"});
+    const std::string model = plainText(firmwareRemark(machine_, {"DMIProductName", "PlatformModel"}));
     tree_.system().description(model.empty() ? "Computer system" : model);
     addText(PropSystemModel, model);
     addText(PropSystemManufacturer, firmwareRemark(machine_, {"DMISysVendor"}));
@@ -208,8 +209,8 @@ class Writer {
   }
 
   void addText(Properties id, std::string_view value) {
-    if (!value.empty()) {
-      tree_.text(id, value);
+    if (const std::string text = plainText(value); !text.empty()) {
+      tree_.text(id, text);
     }
   }
 

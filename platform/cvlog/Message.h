@@ -24,7 +24,7 @@ Message ownMessage(int level, std::string_view file, std::string_view text,
                    std::string_view function = __builtin_FUNCTION(), int line = __builtin_LINE());
 
 /// The message as one line without its end:
-/// `2026-03-01T09:30:00.125Z error Corvane.CPUProvider getFactoryInstance CPUObjFactory.cpp:2044 the text`.
+/// `2026-03-01T09:30:00.125Z error Corvane.CPUProvider getProcessorCapRefByProcHandle CPUObjFactory.cpp:2044 the text`.
 /// The time is UTC. Only the text has blanks of its own. A byte that would break the line or act on a terminal is
 /// written as in C (`\n`, `\t`, `\x1b`), a backslash as two; every other byte stands for itself.
 std::string formatLine(const Message& message);

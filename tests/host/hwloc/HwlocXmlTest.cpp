@@ -117,6 +117,14 @@ TEST(HwlocXml, LineEndsInTextsMakeNoFields) {
   EXPECT_EQ(textAt(tree, "P0", PropStepping), "(none)");
 }
 
+TEST(HwlocXml, ControlCharactersOfTextsAreBlanks) {
+  const Tree tree = treeOf(oneCore({{"DMIProductName", "Power&#9;Box&#10;"}}, {{"CPUModel", "Some&#9;CPU"}}));
+
+  EXPECT_EQ(textAt(tree, "system", PropSystemModel), "Power Box");
+  EXPECT_EQ(nodeAt(tree, "system").description, "Power Box");
+  EXPECT_EQ(textAt(tree, "P0", PropProcessorName), "Some CPU");
+}
+
 TEST(HwlocXml, TheMachineIsNamedByItsFirmware) {
   const Tree tree = treeOf(oneCore({{"DMIProductName", "PowerBox 300"}, {"DMISysVendor", "Box Works"}}, {}));
 
