@@ -19,7 +19,7 @@ void addPlainEvents() {
   constexpr double limit = 0.8;
 
   addRow(
-      {"log event, entry of a function", limit}, [] { events.entering(function, line); },
+      {"log event, entry of a function", limit}, [] { events.entering(line, function); },
       [] { formatTwice("ENTERING: %s() in %s [Line: %d]", function, file, line); });
   addRow(
       {"log event, message", limit}, [] { events.message(Tarn::LevelInfo, "Target Class is cpuProcessorClass", line); },
