@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <string_view>
 #include <utility>
 
 #include "platform/common/FileDescriptor.h"
@@ -20,7 +21,12 @@ using Common::FileDescriptor;
 // More than any inventory is; what is larger is the wrong file.
 constexpr std::size_t largestFile = std::size_t{64} << 20;
 
-FileError readAll(int file, std::string& contents) {
+// The kernel gives an attribute of sysfs a page at a time, so what is shorter than the smallest page is the
+// whole of it. Elsewhere only the read that gives nothing is the end: /proc/cpuinfo comes in pieces of any size.
+constexpr std::string_view attributes = "sys/";
+constexpr ssize_t smallestPage = 4096;
+
+FileError readAll(int file, bool isAttribute, std::string& contents) {
   contents.clear();
   std::array<char, 16384> chunk;
   for (;;) {
@@ -32,6 +38,9 @@ FileError readAll(int file, std::string& contents) {
       contents.append(chunk.data(), static_cast<std::size_t>(got));
       if (contents.size() > largestFile) {
         return EFBIG;
+      }
+      if (isAttribute && got < smallestPage) {
+        return 0;
       }
     } else if (errno != EINTR) {
       return errno;
@@ -45,12 +54,12 @@ struct CloseDirectory {
 
 class RealFileSystem final : public FileSystem {
  public:
-  RealFileSystem(FileDescriptor directory, std::string name)
-      : directory_(std::move(directory)), name_(std::move(name)) {}
+  RealFileSystem(FileDescriptor directory, std::string name, bool isOfAttributes)
+      : directory_(std::move(directory)), name_(std::move(name)), isOfAttributes_(isOfAttributes) {}
 
   FileError read(const char* path, std::string& contents) override {
     const FileDescriptor file(open(path, O_RDONLY));
-    const FileError error = file ? readAll(file.number(), contents) : errno;
+    const FileError error = file ? readAll(file.number(), holdsAttribute(path), contents) : errno;
     if (error != 0) {
       contents.clear();
     }
@@ -79,7 +88,8 @@ class RealFileSystem final : public FileSystem {
   }
 
   std::unique_ptr<FileSystem> below(const char* directory) override {
-    return std::make_unique<RealFileSystem>(FileDescriptor(open(directory, O_PATH | O_DIRECTORY)), nameOf(directory));
+    return std::make_unique<RealFileSystem>(FileDescriptor(open(directory, O_PATH | O_DIRECTORY)), nameOf(directory),
+                                            holdsAttribute(directory));
   }
 
   std::string nameOf(std::string_view path) const override {
@@ -96,8 +106,12 @@ class RealFileSystem final : public FileSystem {
     return ::openat(directory_.number(), path, flags | O_CLOEXEC | O_NOCTTY | O_NONBLOCK);
   }
 
+  // Also of a captured root, whose regular files end with a short read, too.
+  bool holdsAttribute(std::string_view path) const { return isOfAttributes_ || path.starts_with(attributes); }
+
   FileDescriptor directory_;
   std::string name_;
+  bool isOfAttributes_;
 };
 
 }  // namespace
@@ -108,7 +122,7 @@ std::unique_ptr<FileSystem> openDirectory(const std::string& directory) {
     throw InventoryError("cannot read the inventory", directory, describeError(errno),
                          "name a directory that holds sys/ and proc/ of a machine");
   }
-  return std::make_unique<RealFileSystem>(std::move(descriptor), directory);
+  return std::make_unique<RealFileSystem>(std::move(descriptor), directory, false);
 }
 
 }  // namespace Tarn::Inventory

@@ -125,6 +125,21 @@ TEST(FileSystem, ReadsFilesLongerThanItsBuffer) {
   EXPECT_EQ(contents, text);
 }
 
+TEST(FileSystem, ReadsAttributesOfAnyNumberOfPages) {
+  const ScratchDirectory directory;
+  const auto files = openDirectory(directory.name());
+  std::string contents;
+  for (const std::size_t size : {0U, 1U, 4095U, 4096U, 4097U, 16384U, 20480U, 50000U}) {
+    const std::string text(size, 'x');
+    directory.write("sys/cpu/list", text);
+
+    EXPECT_EQ(files->read("sys/cpu/list", contents), 0);
+    EXPECT_EQ(contents, text);
+    EXPECT_EQ(openDirectory(directory.name())->below("sys/cpu")->read("list", contents), 0);
+    EXPECT_EQ(contents, text);
+  }
+}
+
 TEST(FileSystem, TellsWhyAFileCannotBeRead) {
   const ScratchDirectory directory;
   directory.write("a/file", "x");
