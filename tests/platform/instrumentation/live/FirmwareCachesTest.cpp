@@ -13,8 +13,6 @@ using Support::SmbiosEncoder;
 using Support::SmbiosProcessor;
 using testing::ElementsAre;
 
-const std::string cpuDirectory = "/sys/devices/system/cpu";
-
 /// A processor with one cache, over a kernel's L2 cache of 512 KiB.
 Tree withCache(KernelFiles files, const SmbiosCache& cache) {
   SmbiosEncoder tables;

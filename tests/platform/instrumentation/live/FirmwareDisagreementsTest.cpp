@@ -12,8 +12,6 @@ using Support::emptySocket;
 using Support::SmbiosProcessor;
 using testing::ElementsAre;
 
-const std::string cpuDirectory = "/sys/devices/system/cpu";
-
 TEST(FirmwareDisagreements, ADisabledProcessorThatTheKernelUsesIsADisagreement) {
   SmbiosProcessor disabled = xeon("CPU2");
   disabled.status = 2;

@@ -13,8 +13,6 @@ using Support::emptySocket;
 using Support::SmbiosProcessor;
 using testing::ElementsAre;
 
-const std::string cpuDirectory = "/sys/devices/system/cpu";
-
 TEST(FirmwareSockets, AlikeProcessorsGoBySocketHandleAndPackageNumber) {
   SmbiosProcessor second = xeon("A");
   second.frame.handle = 0x0050;
