@@ -44,6 +44,8 @@ function(corvane_product_objects name)
   file(GLOB sources CONFIGURE_DEPENDS
     ${PROJECT_SOURCE_DIR}/model/*.cpp ${PROJECT_SOURCE_DIR}/factory/*.cpp ${PROJECT_SOURCE_DIR}/providers/*.cpp)
   add_library(${name} OBJECT ${sources})
+  # Each provider file has its own statics of the same names, so these sources are compiled one by one.
+  set_target_properties(${name} PROPERTIES UNITY_BUILD OFF)
   target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
   target_link_libraries(${name} PRIVATE corvane_options PUBLIC cmpi)
   if(ARG_GUARD)

@@ -17,7 +17,7 @@ constexpr std::array signals = {SIGSEGV, SIGBUS, SIGILL, SIGFPE, SIGABRT};
 
 // What the handler may touch: made before, not changed while it can run.
 std::array<char, 512> message;
-std::size_t length = 0;
+std::size_t messageLength = 0;
 std::array<struct sigaction, signals.size()> previous;
 
 // A stack that has run out has no room for the handler.
@@ -26,22 +26,22 @@ stack_t previousStack;
 
 void append(std::string_view text) {
   constexpr std::size_t roomForLineEnd = 1;
-  length += text.copy(message.data() + length, message.size() - roomForLineEnd - length);
+  messageLength += text.copy(message.data() + messageLength, message.size() - roomForLineEnd - messageLength);
 }
 
 void report(int) {
   LibraryErrors::show();
-  writeToStandardError({message.data(), length});
+  writeToStandardError({message.data(), messageLength});
   _exit(EXIT_FAILURE);
 }
 
 }  // namespace
 
 CrashReport::CrashReport(std::string_view text) {
-  length = 0;
+  messageLength = 0;
   append("corvcim: ");
   append(text);
-  message[length++] = '\n';
+  message[messageLength++] = '\n';
   stack_t stack = {};
   stack.ss_sp = ownStack.data();
   stack.ss_size = ownStack.size();

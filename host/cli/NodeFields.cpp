@@ -16,7 +16,7 @@ using Tarn::Inventory::Tree;
 
 using Field = std::optional<FieldValue>;
 
-Field unlessEmpty(std::string text) {
+Field fieldUnlessEmpty(std::string text) {
   return text.empty() ? std::nullopt : Field(std::move(text));
 }
 
@@ -35,8 +35,8 @@ constexpr std::array nodeFields = {
                 return node.parent == noNode ? std::nullopt : Field(std::string(tree.node(node.parent).path()));
               }},
     NodeField{"status", [](const Tree&, const Node& node) -> Field { return node.status; }},
-    NodeField{"description", [](const Tree&, const Node& node) { return unlessEmpty(node.description); }},
-    NodeField{"cpus", [](const Tree&, const Node& node) { return unlessEmpty(node.cpus.toList()); }},
+    NodeField{"description", [](const Tree&, const Node& node) { return fieldUnlessEmpty(node.description); }},
+    NodeField{"cpus", [](const Tree&, const Node& node) { return fieldUnlessEmpty(node.cpus.toList()); }},
 };
 
 template <class Value>

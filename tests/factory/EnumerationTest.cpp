@@ -29,16 +29,6 @@ unsigned short enumerate(CPUObjFactory& factory, const CMPIBroker* broker, const
   return (factory.*Function)(broker, ref, properties, isObjPath, instances, rc);
 }
 
-void placeProcessor(const std::string& id) {
-  CPUObjFactory::_processorMap[id] = fullProcessor(id);
-}
-void placeCore(const std::string& id) {
-  CPUObjFactory::_cpuProcCoreMap[id] = fullCore(id);
-}
-void placeCache(const std::string& id) {
-  CPUObjFactory::_cpuMemoryMap[id] = fullCache(id);
-}
-
 const Enumeration enumerations[] = {
     {"getAllCPUProcCMPIInstances", "makeCPUProcInstance", enumerate<&CPUObjFactory::getAllCPUProcCMPIInstances>,
      placeProcessor, "", true},

@@ -88,6 +88,18 @@ FactoryTest::FactoryTest() {
   forgetTraces();
 }
 
+void placeProcessor(const std::string& id) {
+  CPUObjFactory::_processorMap[id] = fullProcessor(id);
+}
+
+void placeCore(const std::string& id) {
+  CPUObjFactory::_cpuProcCoreMap[id] = fullCore(id);
+}
+
+void placeCache(const std::string& id) {
+  CPUObjFactory::_cpuMemoryMap[id] = fullCache(id);
+}
+
 CPUObjFactory& FactoryTest::factory() {
   // Fetched once, so that no test's events begin with the fetching.
   static CPUObjFactory& theFactory = *CPUObjFactory::getFactoryInstance(false, false, false);

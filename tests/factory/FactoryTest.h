@@ -27,6 +27,11 @@ Processor fullProcessor(const std::string& deviceId);
 ProcessorCore fullCore(const std::string& instanceId);
 Memory fullCache(const std::string& deviceId);
 
+// A full record with this identifier into the factory's map, past any collection.
+void placeProcessor(const std::string& id);
+void placeCore(const std::string& id);
+void placeCache(const std::string& id);
+
 /// A factory that has collected nothing, and a request to a broker in which it works.
 class FactoryTest : public Scripted::ScriptedTest {
  protected:

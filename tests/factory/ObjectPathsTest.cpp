@@ -26,16 +26,6 @@ void PrintTo(const Listing& listing, std::ostream* stream) {
   *stream << listing.function;
 }
 
-void placeProcessor(const std::string& id) {
-  CPUObjFactory::_processorMap[id] = fullProcessor(id);
-}
-void placeCore(const std::string& id) {
-  CPUObjFactory::_cpuProcCoreMap[id] = fullCore(id);
-}
-void placeCache(const std::string& id) {
-  CPUObjFactory::_cpuMemoryMap[id] = fullCache(id);
-}
-
 const Listing listings[] = {
     {"getAllCPUProcCMPIObjPaths",
      "HALDA_CPUProcessor",

@@ -3,6 +3,8 @@
 
 #include <map>
 #include <optional>
+#include <string>
+#include <utility>
 #include <vector>
 
 /// What the tables of several records have in common: the codes to try, and the tables that records share.
@@ -14,6 +16,10 @@ inline const Table enabledState = {{0, 0}, {1, 2}, {12, 6}, {16, 3}};
 inline constexpr unsigned short otherEnabledState = 5;
 
 inline const Table operationalStatus = {{0, 0}, {1, 2}, {2, 8}, {3, 9}, {8, 15}, {10, 10}, {13, 13}, {17, 12}, {20, 5}};
+
+/// HealthState and the text with it, of cores and caches; any other code is 5, "OK".
+inline const std::map<unsigned int, std::pair<unsigned short, std::string>> partHealth = {
+    {0, {0, "Unknown"}}, {1, {5, "OK"}}, {21, {10, "Error"}}, {24, {25, "Error"}}};
 
 /// Every code up to well behind the last row of any table, and numbers that only look like a row once
 /// they are cut to 16 bits.

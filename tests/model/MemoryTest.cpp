@@ -14,9 +14,6 @@ using Tarn::CPUProvider::Memory;
 
 namespace {
 
-const std::map<unsigned int, std::pair<unsigned short, std::string>> health = {
-    {0, {0, "Unknown"}}, {1, {5, "OK"}}, {21, {10, "Error"}}, {24, {25, "Error"}}};
-
 // Codes that leave the field alone keep what the code `before` put there.
 struct CodeCase {
   const char* name;
@@ -125,8 +122,9 @@ TEST(Memory, HealthStateAndItsTextByNodeStatus) {
   for (const unsigned int code : codesToTry()) {
     Memory memory;
     EXPECT_TRUE(memory.setHealthState(code));
-    const auto row = health.find(code);
-    const auto expected = row != health.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
+    const auto row = CodeTables::partHealth.find(code);
+    const auto expected =
+        row != CodeTables::partHealth.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
     EXPECT_EQ(memory.getHealthState(), expected.first) << code;
     EXPECT_EQ(memory.getHealthString(), expected.second) << code;
   }

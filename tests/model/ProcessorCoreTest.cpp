@@ -13,12 +13,7 @@
 using CodeTables::codesToTry;
 using Tarn::CPUProvider::ProcessorCore;
 
-namespace {
-
-const std::map<unsigned int, std::pair<unsigned short, std::string>> health = {
-    {0, {0, "Unknown"}}, {1, {5, "OK"}}, {21, {10, "Error"}}, {24, {25, "Error"}}};
-
-}  // namespace
+namespace {}  // namespace
 
 TEST(ProcessorCore, IsAPlainValue) {
   EXPECT_FALSE(std::is_polymorphic_v<ProcessorCore>);
@@ -94,8 +89,9 @@ TEST(ProcessorCore, HealthStateAndItsTextByNodeStatus) {
   for (const unsigned int code : codesToTry()) {
     ProcessorCore core;
     EXPECT_TRUE(core.setHealthState(code));
-    const auto row = health.find(code);
-    const auto expected = row != health.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
+    const auto row = CodeTables::partHealth.find(code);
+    const auto expected =
+        row != CodeTables::partHealth.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
     EXPECT_EQ(core.getHealthState(), expected.first) << code;
     EXPECT_EQ(core.getHealthString(), expected.second) << code;
   }

@@ -13,7 +13,7 @@ using Tarn::CPUProvider::Processor;
 
 namespace {
 
-const std::map<unsigned int, std::pair<unsigned short, std::string>> health = {
+const std::map<unsigned int, std::pair<unsigned short, std::string>> processorHealth = {
     {0, {0, "UnKnown"}}, {21, {10, "Degraded"}}, {24, {25, "Error"}}};
 
 }  // namespace
@@ -59,8 +59,8 @@ TEST(ProcessorStates, HealthStateAndItsTextByNodeStatus) {
   for (const unsigned int code : codesToTry()) {
     Processor processor;
     EXPECT_TRUE(processor.setHealthState(code));
-    const auto row = health.find(code);
-    const auto expected = row != health.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
+    const auto row = processorHealth.find(code);
+    const auto expected = row != processorHealth.end() ? row->second : std::pair<unsigned short, std::string>(5, "OK");
     EXPECT_EQ(processor.getHealthState(), expected.first) << code;
     EXPECT_EQ(processor.getStatusString(), expected.second) << code;
   }

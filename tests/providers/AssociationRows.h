@@ -14,6 +14,12 @@
 /// walk this table for each behaviour.
 namespace Associations {
 
+// The classes that several tests name.
+inline const std::string processorCaches = "HALDA_CPUAssociatedCacheMemory";
+inline const std::string coreCaches = "HALDA_CPUCoreAssociatedCacheMemory";
+inline const std::string systemDevice = "HALDA_CPUSystemDevice";
+inline const std::string systemClass = "HALDA_ComputerSystem";
+
 using Corvcim::ObjectPath;
 using Paths = std::vector<ObjectPath>;
 using Pair = std::pair<ObjectPath, ObjectPath>;

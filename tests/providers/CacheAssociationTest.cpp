@@ -19,9 +19,6 @@ using Support::processorPath;
 using Support::withoutDone;
 using Tarn::CPUProvider::CPUObjFactory;
 
-const std::string processorCaches = "HALDA_CPUAssociatedCacheMemory";
-const std::string coreCaches = "HALDA_CPUCoreAssociatedCacheMemory";
-
 class CacheAssociation : public Support::ProviderTest {
  protected:
   CacheAssociation() { scriptMachine(); }

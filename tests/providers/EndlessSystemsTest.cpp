@@ -12,9 +12,6 @@ using Corvcim::Response;
 using Support::EventList;
 using Support::outcome;
 
-const std::string systemDevice = "HALDA_CPUSystemDevice";
-const std::string systemClass = "HALDA_ComputerSystem";
-
 /// What the endless enumeration of a broker gives, and how often it was asked.
 struct Endless {
   const CMPIBroker* broker = nullptr;

@@ -18,8 +18,6 @@ using Support::systemInstance;
 using Support::systemPath;
 using Support::withoutDone;
 
-const std::string systemDevice = "HALDA_CPUSystemDevice";
-const std::string systemClass = "HALDA_ComputerSystem";
 const std::string upCallFailed = "Call to CBEnumInstances of target Class Failed.";
 
 constexpr OperationKind associators[] = {OperationKind::Associators, OperationKind::AssociatorNames};

@@ -22,8 +22,6 @@ using Tarn::CPUProvider::Processor;
 
 using Paths = std::vector<ObjectPath>;
 
-const std::string processorCaches = "HALDA_CPUAssociatedCacheMemory";
-const std::string coreCaches = "HALDA_CPUCoreAssociatedCacheMemory";
 const std::string capabilities = "HALDA_CPUElementCapabilities";
 const std::string components = "HALDA_CPUConcreteComponent";
 

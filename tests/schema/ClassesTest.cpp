@@ -40,20 +40,14 @@ const Mof::Qualifier& qualifier(const Mof::Class& owner, std::string_view proper
   return *Mof::find(found->qualifiers, name);
 }
 
-std::string lowered(std::string_view text) {
-  std::string result(text);
-  std::ranges::transform(result, result.begin(), toLowerAscii);
-  return result;
-}
-
 using Lines = std::set<std::string>;
 
 // One line for each property with all that a broker goes by; names without their case.
 Lines fromTable(const ClassDefinition& definition) {
   Lines lines;
   for (const PropertyDefinition& each : definition.properties) {
-    lines.insert(std::string(each.key ? "key " : "") + typeName(each.type) + " " + lowered(each.name) + " " +
-                 lowered(each.referenceClass));
+    lines.insert(std::string(each.key ? "key " : "") + typeName(each.type) + " " + Mof::lowered(each.name) + " " +
+                 Mof::lowered(each.referenceClass));
   }
   return lines;
 }
@@ -62,7 +56,7 @@ Lines fromMof(const Mof::Class& definition) {
   Lines lines;
   for (const Mof::Property& each : definition.properties) {
     lines.insert(std::string(Mof::find(each.qualifiers, "Key") != nullptr ? "key " : "") + each.type + " " +
-                 lowered(each.name) + " " + lowered(each.referenceClass));
+                 Mof::lowered(each.name) + " " + Mof::lowered(each.referenceClass));
   }
   return lines;
 }

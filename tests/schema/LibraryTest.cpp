@@ -17,21 +17,13 @@ namespace {
 
 using Names = std::set<std::string>;
 
-std::string lowered(std::string_view text) {
-  std::string result(text);
-  for (char& letter : result) {
-    letter = toLowerAscii(letter);
-  }
-  return result;
-}
-
 // "class.property type" of everything that the MOF declares.
 Names declared() {
   Names names;
   for (const char* file : {"/schema/corvane-cpu.mof", "/schema/corvane-computersystem.mof"}) {
     for (const Mof::Class& each : Mof::readClasses(std::string(CORVANE_SOURCE_DIR) + file)) {
       for (const Mof::Property& property : each.properties) {
-        names.insert(each.name + "." + lowered(property.name) + " " + property.type);
+        names.insert(each.name + "." + Mof::lowered(property.name) + " " + property.type);
       }
     }
   }
@@ -48,7 +40,8 @@ Names set() {
     EXPECT_FALSE(answer.response.instances.empty()) << each.name;
     for (const Instance& instance : answer.response.instances) {
       for (const NamedValue& property : instance.properties) {
-        names.insert(std::string(each.name) + "." + lowered(property.name) + " " + typeName(property.value.type()));
+        names.insert(std::string(each.name) + "." + Mof::lowered(property.name) + " " +
+                     typeName(property.value.type()));
       }
     }
   }

@@ -174,4 +174,10 @@ const Qualifier* find(const std::vector<Qualifier>& qualifiers, std::string_view
   return found == qualifiers.end() ? nullptr : &*found;
 }
 
+std::string lowered(std::string_view text) {
+  std::string result(text);
+  std::ranges::transform(result, result.begin(), Corvcim::toLowerAscii);
+  return result;
+}
+
 }  // namespace Mof

@@ -34,6 +34,9 @@ std::vector<Class> readClasses(const std::string& file);
 /// The qualifier of this name, without regard to case; nullptr if there is none.
 const Qualifier* find(const std::vector<Qualifier>& qualifiers, std::string_view name);
 
+/// The text with ASCII letters in lower case: CIM names ignore case.
+std::string lowered(std::string_view text);
+
 }  // namespace Mof
 
 #endif

@@ -28,7 +28,7 @@ std::string_view fillOf(const OutlineItem& item) {
 }
 
 /// Text inside a quoted DOT string; there only quotes and backslashes need care.
-std::string escaped(const std::string& text) {
+std::string dotEscaped(const std::string& text) {
   std::string result;
   for (const char c : text) {
     if (c == '"' || c == '\\') {
@@ -56,9 +56,9 @@ class Graph {
  private:
   unsigned int add(const OutlineItem& item) {
     const unsigned int number = count_++;
-    text_ += "  n" + std::to_string(number) + " [label=\"" + escaped(item.label);
+    text_ += "  n" + std::to_string(number) + " [label=\"" + dotEscaped(item.label);
     for (const std::string& detail : item.details) {
-      text_ += "\\n" + escaped(detail);
+      text_ += "\\n" + dotEscaped(detail);
     }
     text_ += "\", fillcolor=\"";
     text_ += fillOf(item);

@@ -73,7 +73,7 @@ std::string_view className(TextStyle style) {
   return "note";
 }
 
-std::string escaped(std::string_view text) {
+std::string xmlEscaped(std::string_view text) {
   std::string result;
   for (const char c : text) {
     switch (c) {
@@ -106,8 +106,8 @@ class Picture {
   }
 
   void describe(const std::string& title, const std::string& description) {
-    svg_ += "  <title id=\"title\">" + escaped(title) + "</title>\n";
-    svg_ += "  <desc id=\"description\">" + escaped(description) + "</desc>\n";
+    svg_ += "  <title id=\"title\">" + xmlEscaped(title) + "</title>\n";
+    svg_ += "  <desc id=\"description\">" + xmlEscaped(description) + "</desc>\n";
     svg_ += styleSheet;
   }
 
@@ -116,7 +116,7 @@ class Picture {
     const int y = top + box.y;
     const bool hasTooltip = !box.tooltip.empty();
     if (hasTooltip) {
-      svg_ += "  <g><title>" + escaped(box.tooltip) + "</title>\n";
+      svg_ += "  <g><title>" + xmlEscaped(box.tooltip) + "</title>\n";
     }
     addRectangle(box, x, y);
     for (const Box& inner : box.inner) {
@@ -155,7 +155,7 @@ class Picture {
     svg_ += " class=\"";
     svg_ += className(line.style);
     svg_ += line.isCentred ? " centred\">" : "\">";
-    svg_ += escaped(line.text) + "</text>\n";
+    svg_ += xmlEscaped(line.text) + "</text>\n";
   }
 
   void addNumbers(std::string_view element, std::initializer_list<std::pair<std::string_view, int>> attributes) {

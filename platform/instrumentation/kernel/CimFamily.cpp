@@ -151,7 +151,7 @@ constexpr std::array rows = {
 constexpr auto keyOf(const FamilyRow& row) {
   return std::tuple(row.vendor, row.brand, row.family, row.model);
 }
-static_assert(std::ranges::is_sorted(rows, {}, keyOf));
+static_assert(std::ranges::is_sorted(rows, {}, [](const FamilyRow& row) { return keyOf(row); }));
 
 // "Intel(R) Core(TM) i7 CPU" and "Intel Core i7" are one brand; some names are filled up with blanks.
 std::string withoutMarks(std::string_view name) {

@@ -62,9 +62,10 @@ std::string label(const FirmwareCache& cache) {
 }
 
 /// One cache's node, each value with its field.
-class CacheNode {
+class FirmwareCacheNode {
  public:
-  CacheNode(TreeBuilder& tree, const FirmwareCache& cache) : tree_(tree), cache_(cache), structure_(*cache.structure) {}
+  FirmwareCacheNode(TreeBuilder& tree, const FirmwareCache& cache)
+      : tree_(tree), cache_(cache), structure_(*cache.structure) {}
 
   void add(const std::string& path, const Facts::Explain& offline) {
     tree_.cache(path);
@@ -237,7 +238,7 @@ void addFirmwareCaches(TreeBuilder& tree, const std::vector<FirmwareCache>& cach
     if (std::ranges::find(taken, path) != taken.end()) {
       path += '#' + handleText(cache.structure->structure);
     }
-    CacheNode(tree, cache).add(path, offline);
+    FirmwareCacheNode(tree, cache).add(path, offline);
     taken.push_back(std::move(path));
   }
 }

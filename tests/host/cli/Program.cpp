@@ -13,12 +13,6 @@
 namespace Corvcim::Testing {
 namespace {
 
-std::string contentsOf(const std::string& file) {
-  std::ostringstream contents;
-  contents << std::ifstream(file, std::ios::binary).rdbuf();
-  return contents.str();
-}
-
 std::string quotedForShell(const std::string& word) {
   std::string quoted = "'";
   for (const char c : word) {
@@ -28,6 +22,12 @@ std::string quotedForShell(const std::string& word) {
 }
 
 }  // namespace
+
+std::string contentsOf(const std::string& file) {
+  std::ostringstream contents;
+  contents << std::ifstream(file, std::ios::binary).rdbuf();
+  return contents.str();
+}
 
 Directory::Directory() {
   std::string name = std::filesystem::temp_directory_path() / "corvcim-test-XXXXXX";

@@ -37,6 +37,9 @@ class Directory {
   std::string path_;
 };
 
+/// The contents of a file; empty if it cannot be read.
+std::string contentsOf(const std::string& file);
+
 /// Runs the command with the shell, in an environment that says nothing about inventory or language.
 /// "$corvcim" is the built program.
 Finished shell(const std::string& command);

@@ -21,11 +21,6 @@ const std::string board =
     "[sys/devices/system/cpu/cpu0/topology]\nphysical_package_id: 0\ncore_id: 0\n"
     "[proc]\ncpuinfo:\n\tprocessor\t: 0\n\tSerial\t\t: 00000000a1b2c3d4\n";
 
-std::string contentsOf(const std::string& file) {
-  std::ifstream stream(file, std::ios::binary);
-  return {std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
-}
-
 class SnapshotCommand : public testing::Test {
  protected:
   Directory directory_;

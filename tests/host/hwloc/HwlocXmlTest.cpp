@@ -23,7 +23,7 @@ Tree treeOf(const HwlocXml& xml) {
   return treeOfXml(xml.text(), "machine.xml");
 }
 
-std::string complaint(const std::string& text) {
+std::string complaintAboutXml(const std::string& text) {
   try {
     treeOfXml(text, "machine.xml");
     return "";
@@ -266,11 +266,11 @@ TEST(HwlocXml, WhatIsNoTopologyIsRefused) {
       "2 or 1 writes it; HWLOC_XML_VERBOSE=1 lstopo -i FILE says what is wrong with it";
   const std::string whole = oneCore({}, {}).text();
 
-  EXPECT_EQ(complaint(whole), "");
-  EXPECT_EQ(complaint(""), expected);
-  EXPECT_EQ(complaint("no XML"), expected);
-  EXPECT_EQ(complaint("<?xml version=\"1.0\"?>\n<inventory/>\n"), expected);
-  EXPECT_EQ(complaint(whole.substr(0, whole.size() / 2)), expected);
+  EXPECT_EQ(complaintAboutXml(whole), "");
+  EXPECT_EQ(complaintAboutXml(""), expected);
+  EXPECT_EQ(complaintAboutXml("no XML"), expected);
+  EXPECT_EQ(complaintAboutXml("<?xml version=\"1.0\"?>\n<inventory/>\n"), expected);
+  EXPECT_EQ(complaintAboutXml(whole.substr(0, whole.size() / 2)), expected);
 }
 
 std::string listOf(const char* list) {
@@ -295,7 +295,7 @@ TEST(HwlocXml, SetsThatNoInventoryCanHoldAreRefused) {
   HwlocXml endless("0xf...f");
   endless.begin("Package", "0", "0xf...f").plainCore(0).end();
 
-  EXPECT_NE(complaint(endless.text()), "");
+  EXPECT_NE(complaintAboutXml(endless.text()), "");
 }
 
 TEST(HwlocXml, AFileThatIsNotThereIsNamed) {

@@ -63,10 +63,10 @@ TEST(Configuration, NamesEveryLineThatDoesNotCount) {
   expectSetting(configuration, "language", "", "corvane.conf:4");
 }
 
-class ConfigurationFile : public testing::Test {
+class ConfigurationFileOfTheProcess : public testing::Test {
  protected:
-  ConfigurationFile() { std::filesystem::create_directories(directory_); }
-  ~ConfigurationFile() override { std::filesystem::remove_all(directory_); }
+  ConfigurationFileOfTheProcess() { std::filesystem::create_directories(directory_); }
+  ~ConfigurationFileOfTheProcess() override { std::filesystem::remove_all(directory_); }
 
   [[nodiscard]] std::string path(const std::string& name) const { return directory_ + "/" + name; }
 
@@ -79,7 +79,7 @@ class ConfigurationFile : public testing::Test {
   std::string directory_ = testing::TempDir() + "configuration_" + std::to_string(getpid());
 };
 
-TEST_F(ConfigurationFile, IsReadAsAWhole) {
+TEST_F(ConfigurationFileOfTheProcess, IsReadAsAWhole) {
   std::string text;
   while (text.size() < 20'000) {
     text += "# a comment that makes the file longer than one block\n";
@@ -91,18 +91,18 @@ TEST_F(ConfigurationFile, IsReadAsAWhole) {
   EXPECT_THAT(configuration.problems(), IsEmpty());
 }
 
-TEST_F(ConfigurationFile, ThatIsMissingIsAProblem) {
+TEST_F(ConfigurationFileOfTheProcess, ThatIsMissingIsAProblem) {
   expectOnlyProblem(path("missing.conf"), "cannot be opened: No such file or directory");
 }
 
-TEST_F(ConfigurationFile, MustBeARegularFile) {
+TEST_F(ConfigurationFileOfTheProcess, MustBeARegularFile) {
   ASSERT_EQ(mkfifo(path("pipe").c_str(), 0600), 0);
   expectOnlyProblem(path("pipe"), "is not a regular file");
   expectOnlyProblem(directory_, "is not a regular file");
   expectOnlyProblem("/dev/zero", "is not a regular file");
 }
 
-TEST_F(ConfigurationFile, MustNotBeHuge) {
+TEST_F(ConfigurationFileOfTheProcess, MustNotBeHuge) {
   std::ofstream(path("huge.conf")) << std::string((1 << 20) + 1, '\n');
   expectOnlyProblem(path("huge.conf"), "is larger than a configuration file can be (1 MiB)");
 }

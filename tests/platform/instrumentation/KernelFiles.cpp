@@ -10,8 +10,6 @@ namespace Tarn::Inventory {
 
 namespace {
 
-const std::string cpuDirectory = "sys/devices/system/cpu/";
-
 std::string directoryOf(unsigned int cpu) {
   return cpuDirectory + "cpu" + std::to_string(cpu) + '/';
 }

@@ -11,6 +11,9 @@
 
 namespace Tarn::Inventory {
 
+/// Where the files of CPUs lie, as a FileSystem takes it.
+inline const std::string cpuDirectory = "sys/devices/system/cpu/";
+
 /// The files with which a kernel describes a machine, made up call by call. What a call does not name is
 /// not there, but for SMBIOS tables in which nothing stands, so that nothing is said of them.
 class KernelFiles {

@@ -16,8 +16,6 @@
 namespace Tarn::Inventory {
 namespace {
 
-const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
-
 class ProcessTree : public testing::Test {
  protected:
   ProcessTree() {

@@ -6,6 +6,9 @@
 
 namespace Tarn::Inventory {
 
+/// The captured machines of the tests.
+inline const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
+
 /// A directory that is gone after the test.
 class ScratchDirectory {
  public:

@@ -13,10 +13,10 @@ using testing::IsEmpty;
 const std::string header =
     "msgid \"\"\nmsgstr \"\"\n\"Language: fr\\n\"\n\"MIME-Version: 1.0\\n\"\n\"Content-Type: text/plain; charset=UTF-8\\n\"\n"
     "\"Content-Transfer-Encoding: 8bit\\n\"\n";
-const PoFile english = parsePoFile("msgid \"A\"\nmsgstr \"all %s\"\nmsgid \"B\"\nmsgstr \"both\"\n");
+const PoFile englishCatalogue = parsePoFile("msgid \"A\"\nmsgstr \"all %s\"\nmsgid \"B\"\nmsgstr \"both\"\n");
 
 std::vector<std::string> problemsOfFrench(const std::string& entries) {
-  return problemsOf(parsePoFile(header + entries), "fr", english);
+  return problemsOf(parsePoFile(header + entries), "fr", englishCatalogue);
 }
 
 constexpr const char* goodB = "#. both\nmsgid \"B\"\nmsgstr \"deux\"\n";
@@ -77,9 +77,9 @@ TEST(CatalogueProblems, AreBlanksAtTheEnds) {
 
 TEST(CatalogueProblems, AreHeadersOfAnotherLanguageOrEncoding) {
   const std::string entries = std::string("#. all %s\nmsgid \"A\"\nmsgstr \"tout %s\"\n") + goodB;
-  EXPECT_THAT(problemsOf(parsePoFile(header + entries), "de", english),
+  EXPECT_THAT(problemsOf(parsePoFile(header + entries), "de", englishCatalogue),
               ElementsAre("the header has no \"Language: de\""));
-  EXPECT_THAT(problemsOf(parsePoFile(entries), "fr", english),
+  EXPECT_THAT(problemsOf(parsePoFile(entries), "fr", englishCatalogue),
               ElementsAre("the header has no \"Content-Transfer-Encoding: 8bit\"",
                           "the header has no \"Content-Type: text/plain; charset=UTF-8\"",
                           "the header has no \"Language: fr\"", "the header has no \"MIME-Version: 1.0\""));

@@ -9,7 +9,7 @@
 namespace Tarn::Inventory {
 namespace {
 
-std::string refusalOf(const std::string& text) {
+std::string refusalOfArchive(const std::string& text) {
   try {
     readArchive(text, "root.txt");
   } catch (const InventoryError& error) {
@@ -81,37 +81,37 @@ TEST(Archive, NamesEachDirectoryOnce) {
 }
 
 TEST(Archive, RefusesWhatIsNone) {
-  EXPECT_EQ(refusalOf("[sys\n"),
+  EXPECT_EQ(refusalOfArchive("[sys\n"),
             "cannot read the captured files: root.txt, line 1: a directory without its closing bracket; "
             "write [sys/devices/system/cpu]");
-  EXPECT_EQ(refusalOf("# x\nonline: 0\n"),
+  EXPECT_EQ(refusalOfArchive("# x\nonline: 0\n"),
             "cannot read the captured files: root.txt, line 2: a file before the first directory; begin with a line "
             "such as [sys/devices/system/cpu]");
-  EXPECT_EQ(refusalOf("[a]\nonline\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\nonline\n"),
             "cannot read the captured files: root.txt, line 2: no file name with a colon after it; write name: "
             "contents");
-  EXPECT_EQ(refusalOf("[a]\nb: 1\nb: 1\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\nb: 1\nb: 1\n"),
             "cannot read the captured files: root.txt, line 3: a/b is there twice; remove one of the two");
-  EXPECT_EQ(refusalOf("[a]\n\tx\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\n\tx\n"),
             "cannot read the captured files: root.txt, line 2: a line of contents that belongs to no file; begin with "
             "a line name: above it");
-  EXPECT_EQ(refusalOf("[a]\nb! EOOPS\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\nb! EOOPS\n"),
             "cannot read the captured files: root.txt, line 2: unknown error EOOPS; use a name such as EACCES, EIO or "
             "ENOENT, or the error's number");
-  EXPECT_EQ(refusalOf("[a]\nb/c: 1\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\nb/c: 1\n"),
             "cannot read the captured files: root.txt, line 2: a file name with a slash; write the directory in "
             "brackets on a line above");
   for (const char* digits : {"0", "012", "0G", "AB", "01 02"}) {
-    EXPECT_EQ(refusalOf("[a]\nb#\n\t0102\n\t" + std::string(digits) + '\n'),
+    EXPECT_EQ(refusalOfArchive("[a]\nb#\n\t0102\n\t" + std::string(digits) + '\n'),
               "cannot read the captured files: root.txt, line 4: bytes that are not pairs of the digits 0 to 9 and a "
               "to f; write two digits for each byte");
   }
   for (const char* listing : {"./: one", "./# 00"}) {
-    EXPECT_EQ(refusalOf("[a]\n" + std::string(listing) + '\n'),
+    EXPECT_EQ(refusalOfArchive("[a]\n" + std::string(listing) + '\n'),
               "cannot read the captured files: root.txt, line 2: a directory's names beside its own; write them below, "
               "one on each line, after a tab");
   }
-  EXPECT_EQ(refusalOf("[a]\n./:\n./:\n"),
+  EXPECT_EQ(refusalOfArchive("[a]\n./:\n./:\n"),
             "cannot read the captured files: root.txt, line 3: a/./ is there twice; remove one of the two");
 }
 
@@ -179,7 +179,7 @@ TEST(Archive, HoldsEveryErrorByNameOrNumber) {
   }
   EXPECT_EQ(readArchive("[a]\nb! 38\n", "root.txt")["a/b"].error, 38);
   for (const char* none : {"", "0", "-1", "4096", "1x", "eacces"}) {
-    EXPECT_NE(refusalOf("[a]\nb! " + std::string(none) + '\n'), "accepted") << none;
+    EXPECT_NE(refusalOfArchive("[a]\nb! " + std::string(none) + '\n'), "accepted") << none;
   }
 }
 

@@ -34,14 +34,14 @@ TEST(SocketMatching, SaysByWhatAProcessorWasFound) {
             "the same signature, name, number of cores, number of threads");
 }
 
-struct Row {
+struct MatchingRow {
   const char* what;
   Identities sockets;
   Identities packages;
   std::vector<std::size_t> expected;
 };
 
-class MatchingByIdentity : public testing::TestWithParam<Row> {};
+class MatchingByIdentity : public testing::TestWithParam<MatchingRow> {};
 
 TEST_P(MatchingByIdentity, DoesNotFollowTheOrder) {
   const SocketMatching matching = matchSockets(GetParam().sockets, GetParam().packages);
@@ -53,25 +53,27 @@ TEST_P(MatchingByIdentity, DoesNotFollowTheOrder) {
 INSTANTIATE_TEST_SUITE_P(
     All, MatchingByIdentity,
     testing::Values(
-        Row{"signatures",
-            Identities{{.signature = "B"}, {.signature = "A"}},
-            Identities{{.signature = "A"}, {.signature = "B"}},
-            {1, 0}},
-        Row{"names", Identities{{.name = "b"}, {.name = "a"}}, Identities{{.name = "a"}, {.name = "b"}}, {1, 0}},
-        Row{"cores", Identities{{.cores = 16}, {.cores = 8}}, Identities{{.cores = 8}, {.cores = 16}}, {1, 0}},
-        Row{"threads", Identities{{.threads = 4}, {.threads = 2}}, Identities{{.threads = 2}, {.threads = 4}}, {1, 0}},
-        Row{"names where signatures are alike",
-            Identities{{.signature = "A", .name = "b"}, {.signature = "A", .name = "a"}},
-            Identities{{.signature = "A", .name = "a"}, {.signature = "A", .name = "b"}},
-            {1, 0}},
-        Row{"what is left over by the others",
-            Identities{{.name = "generic"}, {.name = "a"}},
-            Identities{{.name = "a"}, {.name = "b"}},
-            {1, 0}},
-        Row{"a signature that is not known",
-            Identities{{}, {.signature = "A"}},
-            Identities{{.signature = "A"}, {}},
-            {1, 0}}));
+        MatchingRow{"signatures",
+                    Identities{{.signature = "B"}, {.signature = "A"}},
+                    Identities{{.signature = "A"}, {.signature = "B"}},
+                    {1, 0}},
+        MatchingRow{
+            "names", Identities{{.name = "b"}, {.name = "a"}}, Identities{{.name = "a"}, {.name = "b"}}, {1, 0}},
+        MatchingRow{"cores", Identities{{.cores = 16}, {.cores = 8}}, Identities{{.cores = 8}, {.cores = 16}}, {1, 0}},
+        MatchingRow{
+            "threads", Identities{{.threads = 4}, {.threads = 2}}, Identities{{.threads = 2}, {.threads = 4}}, {1, 0}},
+        MatchingRow{"names where signatures are alike",
+                    Identities{{.signature = "A", .name = "b"}, {.signature = "A", .name = "a"}},
+                    Identities{{.signature = "A", .name = "a"}, {.signature = "A", .name = "b"}},
+                    {1, 0}},
+        MatchingRow{"what is left over by the others",
+                    Identities{{.name = "generic"}, {.name = "a"}},
+                    Identities{{.name = "a"}, {.name = "b"}},
+                    {1, 0}},
+        MatchingRow{"a signature that is not known",
+                    Identities{{}, {.signature = "A"}},
+                    Identities{{.signature = "A"}, {}},
+                    {1, 0}}));
 
 TEST(SocketMatching, WhatIdentityDoesNotTellApartGoesByOrder) {
   const ProcessorIdentity alike{.signature = "A", .name = "xeon"};

@@ -10,8 +10,6 @@ using namespace NodeLexicon;
 using testing::Contains;
 using Paths = std::vector<std::string>;
 
-const std::string cpuDirectory = "sys/devices/system/cpu/";
-
 // One package of cores with one thread each.
 KernelFiles cores(unsigned int count) {
   KernelFiles files;

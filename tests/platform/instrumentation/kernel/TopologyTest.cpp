@@ -10,8 +10,6 @@ using namespace NodeLexicon;
 using testing::Contains;
 using Paths = std::vector<std::string>;
 
-const std::string cpuDirectory = "sys/devices/system/cpu/";
-
 TEST(Topology, SparseCpuNumbers) {
   KernelFiles files;
   files.cpus("3,70,1000");

@@ -47,15 +47,15 @@ TEST(FirmwareCaches, OfAnotherSizeAreADisagreement) {
 
   EXPECT_EQ(numberAt(tree, "P0.L2.0", PropCacheNumberOfBlocks), 8192U) << "the kernel's";
   EXPECT_THAT(tree.disagreements(),
-              ElementsAre(Disagreement{"P0", "L2 size", "512 KiB", cpuDirectory + "/cpu0/cache/index0/size", "1024 KiB",
-                                       "SMBIOS type 7, handle 0x0010, offset 0x09"}));
+              ElementsAre(Disagreement{"P0", "L2 size", "512 KiB", originDirectory + "/cpu0/cache/index0/size",
+                                       "1024 KiB", "SMBIOS type 7, handle 0x0010, offset 0x09"}));
 }
 
 TEST(FirmwareCaches, ThatTheKernelDoesNotShowBesideOthersAreADisagreement) {
   const Tree tree = withCache(packages(1), {.level = 3, .installedKiB = 1024});
 
   EXPECT_THAT(pathsOf(tree, NodeCacheMemory), ElementsAre("P0.L2.0"));
-  EXPECT_THAT(tree.disagreements(), ElementsAre(Disagreement{"P0", "L3 size", "(none)", cpuDirectory + "/cpu0/cache",
+  EXPECT_THAT(tree.disagreements(), ElementsAre(Disagreement{"P0", "L3 size", "(none)", originDirectory + "/cpu0/cache",
                                                              "1024 KiB", "SMBIOS type 7, handle 0x0010, offset 0x09"}));
 }
 
@@ -64,7 +64,7 @@ TEST(FirmwareCaches, ThatAreOffAndUsedAreADisagreement) {
 
   EXPECT_EQ(statusAt(tree, "P0.L2.0"), Status::inUse);
   EXPECT_THAT(tree.disagreements(),
-              ElementsAre(Disagreement{"P0", "L2 status", "1", cpuDirectory + "/cpu0/cache/index0/shared_cpu_list",
+              ElementsAre(Disagreement{"P0", "L2 status", "1", originDirectory + "/cpu0/cache/index0/shared_cpu_list",
                                        "16", "SMBIOS type 7, handle 0x0010, offset 0x05"}));
 }
 
@@ -110,7 +110,7 @@ TEST(FirmwareCaches, OfAProcessorThatIsOfflineAreOffline) {
   ASSERT_EQ(statusAt(tree, "P1"), Status::offline);
   EXPECT_EQ(statusAt(tree, "P1.L1"), Status::offline);
   EXPECT_EQ(*tree.statusOrigin(tree.find("/P1.L1")),
-            (Origin{cpuDirectory + "/online", "0", "none of the processor's CPUs is online: offline, 12"}));
+            (Origin{originDirectory + "/online", "0", "none of the processor's CPUs is online: offline, 12"}));
   EXPECT_EQ(statusAt(tree, "P1.L2"), Status::disabled) << "whether the CPUs are online or not";
   EXPECT_EQ(*tree.statusOrigin(tree.find("/P1.L2")),
             (Origin{"SMBIOS type 7, handle 0x0012, offset 0x05", "01 01", "bit 7 is 0: the cache is off, 16"}));

@@ -20,7 +20,7 @@ TEST(FirmwareDisagreements, ADisabledProcessorThatTheKernelUsesIsADisagreement) 
 
   EXPECT_THAT(pathsOf(tree, NodeProcessor), ElementsAre("P0", "P1"));
   EXPECT_EQ(statusAt(tree, "P1"), Status::inUse);
-  EXPECT_THAT(tree.disagreements(), ElementsAre(Disagreement{"P1", "status", "1", cpuDirectory + "/online", "16",
+  EXPECT_THAT(tree.disagreements(), ElementsAre(Disagreement{"P1", "status", "1", originDirectory + "/online", "16",
                                                              "SMBIOS type 4, handle 0x0011, offset 0x18"}));
 }
 
@@ -30,7 +30,7 @@ TEST(FirmwareDisagreements, SocketsThatCannotBeToldApartAndAreTooManyStayOut) {
   EXPECT_THAT(pathsOf(tree, NodeProcessor), ElementsAre("P0"));
   EXPECT_EQ(textAt(tree, "P0", PropSocket), std::nullopt);
   EXPECT_THAT(tree.disagreements(),
-              ElementsAre(Disagreement{"system", "processors", "1: P0", cpuDirectory, "2: CPU1, CPU2",
+              ElementsAre(Disagreement{"system", "processors", "1: P0", originDirectory, "2: CPU1, CPU2",
                                        "SMBIOS type 4, handle 0x0010; SMBIOS type 4, handle 0x0011"}));
 }
 
@@ -38,7 +38,7 @@ TEST(FirmwareDisagreements, OnlyEmptySocketsContradictAProcessor) {
   const Tree tree = packages(1).firmware(tablesOf(emptySocket("CPU1"))).tree();
 
   EXPECT_THAT(tree.disagreements(),
-              ElementsAre(Disagreement{"system", "processors", "1: P0", cpuDirectory, "0", "SMBIOS"}));
+              ElementsAre(Disagreement{"system", "processors", "1: P0", originDirectory, "0", "SMBIOS"}));
 }
 
 TEST(FirmwareDisagreements, AnotherSignatureIsAnotherProcessor) {

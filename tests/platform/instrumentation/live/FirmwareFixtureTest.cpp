@@ -20,8 +20,6 @@
 namespace Tarn::Inventory {
 namespace {
 
-const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
-
 bool isUpdate() {
   return std::getenv("CORVANE_UPDATE_FIXTURES") != nullptr;
 }

@@ -74,8 +74,8 @@ TEST(FirmwareSockets, ADisabledProcessorThatTheKernelUsesIsThereOnce) {
   EXPECT_EQ(textAt(tree, "P0", PropSocket), "CPU2");
   EXPECT_THAT(tree.disagreements(),
               ElementsAre(Disagreement{"S:CPU1", "status", "1", "SMBIOS type 4, handle 0x0010, offset 0x18",
-                                       "(no such processor)", cpuDirectory},
-                          Disagreement{"P0", "status", "1", cpuDirectory + "/online", "16",
+                                       "(no such processor)", originDirectory},
+                          Disagreement{"P0", "status", "1", originDirectory + "/online", "16",
                                        "SMBIOS type 4, handle 0x0011, offset 0x18"}));
 }
 
@@ -114,7 +114,7 @@ TEST(FirmwareSockets, AProcessorThatTheKernelDoesNotSeeIsThereWhereItsIdentityTe
   EXPECT_EQ(statusAt(tree, "S:CPU1"), Status::inUse);
   EXPECT_THAT(tree.disagreements(),
               ElementsAre(Disagreement{"S:CPU1", "status", "1", "SMBIOS type 4, handle 0x0010, offset 0x18",
-                                       "(no such processor)", cpuDirectory}));
+                                       "(no such processor)", originDirectory}));
 }
 
 TEST(FirmwareSockets, CoprocessorsAreNoProcessors) {

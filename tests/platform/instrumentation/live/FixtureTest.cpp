@@ -13,8 +13,6 @@
 namespace Tarn::Inventory {
 namespace {
 
-const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
-
 class Fixture : public testing::TestWithParam<const char*> {
  protected:
   std::string file(const char* name) const { return fixtures + GetParam() + '/' + name; }

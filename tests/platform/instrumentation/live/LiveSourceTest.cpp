@@ -19,9 +19,6 @@ namespace {
 using namespace NodeLexicon;
 using testing::Contains;
 
-const std::string cpuDirectory = "sys/devices/system/cpu/";
-const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
-
 // Two packages of one core.
 KernelFiles twoPackages() {
   KernelFiles files;

@@ -10,8 +10,6 @@ using namespace NodeLexicon;
 using testing::Contains;
 using Paths = std::vector<std::string>;
 
-const std::string cpuDirectory = "sys/devices/system/cpu/";
-
 // Two packages of two cores with two threads; CPUs 0-3 are the first package.
 KernelFiles twoPackages() {
   KernelFiles files;

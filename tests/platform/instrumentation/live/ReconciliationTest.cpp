@@ -47,7 +47,7 @@ TEST(Reconciliation, WhereBothKnowTheKernelCountsAndADifferenceIsToldOf) {
   EXPECT_EQ(both.disagreements, (std::vector<Disagreement>{{"P0", "ProcessorCores", "8", "kernel", "16", "firmware"}}));
 }
 
-struct Row {
+struct ComparisonRow {
   const char* what;
   Properties id;
   Facts::Value kernel;
@@ -55,10 +55,10 @@ struct Row {
   bool differ;
 };
 
-class Compared : public testing::TestWithParam<Row> {};
+class Compared : public testing::TestWithParam<ComparisonRow> {};
 
 TEST_P(Compared, ByWhatTheValuesMean) {
-  const Row& row = GetParam();
+  const ComparisonRow& row = GetParam();
   const Reconciled both = reconciled({row.id, row.kernel, by("kernel")}, {row.id, row.firmware, by("firmware")});
 
   EXPECT_EQ(both.disagreements.size(), row.differ ? 1U : 0U) << row.what;
@@ -67,19 +67,22 @@ TEST_P(Compared, ByWhatTheValuesMean) {
 
 INSTANTIATE_TEST_SUITE_P(
     All, Compared,
-    testing::Values(
-        Row{"equal numbers", PropMaxClockSpeed, 3700U, 3700U, false},
-        Row{"other numbers", PropMaxClockSpeed, 3700U, 4000U, true}, Row{"widths", PropDataWidth, 64U, 32U, true},
-        Row{"threads", PropHardwareThreads, 16U, 8U, true},
-        Row{"the clock of the moment", PropCurrentClockSpeed, 800U, 3600U, false},
-        Row{"cores that can be taken offline", PropEnabledCores, 7U, 8U, false},
-        Row{"two spellings of a name", PropProcessorName, "Intel(R) Xeon(R) CPU", "INTEL XEON  CPU ", false},
-        Row{"two names", PropProcessorName, "Intel(R) Xeon(R) CPU", "Intel Core", true},
-        Row{"feature bits behind the signature", PropProcessorId, "A6 06 06 00", "A6 06 06 00 FF FB EB BF", false},
-        Row{"two signatures", PropProcessorId, "A6 06 06 00", "A7 06 06 00 FF FB EB BF", true},
-        Row{"two families", PropFamily, 179U, 198U, true}, Row{"the family other", PropFamily, 179U, 1U, false},
-        Row{"two models", PropSystemModel, "Box 1", "Box 2", true},
-        Row{"two makers", PropSystemManufacturer, "Boxes", "Bags", true}));
+    testing::Values(ComparisonRow{"equal numbers", PropMaxClockSpeed, 3700U, 3700U, false},
+                    ComparisonRow{"other numbers", PropMaxClockSpeed, 3700U, 4000U, true},
+                    ComparisonRow{"widths", PropDataWidth, 64U, 32U, true},
+                    ComparisonRow{"threads", PropHardwareThreads, 16U, 8U, true},
+                    ComparisonRow{"the clock of the moment", PropCurrentClockSpeed, 800U, 3600U, false},
+                    ComparisonRow{"cores that can be taken offline", PropEnabledCores, 7U, 8U, false},
+                    ComparisonRow{"two spellings of a name", PropProcessorName, "Intel(R) Xeon(R) CPU",
+                                  "INTEL XEON  CPU ", false},
+                    ComparisonRow{"two names", PropProcessorName, "Intel(R) Xeon(R) CPU", "Intel Core", true},
+                    ComparisonRow{"feature bits behind the signature", PropProcessorId, "A6 06 06 00",
+                                  "A6 06 06 00 FF FB EB BF", false},
+                    ComparisonRow{"two signatures", PropProcessorId, "A6 06 06 00", "A7 06 06 00 FF FB EB BF", true},
+                    ComparisonRow{"two families", PropFamily, 179U, 198U, true},
+                    ComparisonRow{"the family other", PropFamily, 179U, 1U, false},
+                    ComparisonRow{"two models", PropSystemModel, "Box 1", "Box 2", true},
+                    ComparisonRow{"two makers", PropSystemManufacturer, "Boxes", "Bags", true}));
 
 TEST(Reconciliation, AFamilyThatTheKernelsTableDoesNotKnowComesFromTheFirmware) {
   const Reconciled both = reconciled({PropFamily, 2U, by("kernel")}, {PropFamily, 198U, by("firmware")});

@@ -9,7 +9,7 @@
 namespace Tarn::Inventory {
 
 /// Where origins say that the files of CPUs lie.
-inline const std::string cpuDirectory = "/sys/devices/system/cpu";
+inline const std::string originDirectory = "/sys/devices/system/cpu";
 
 /// Packages of one core each, with one L2 cache of 512 KiB, as x86Block describes their CPUs.
 KernelFiles packages(unsigned int count);

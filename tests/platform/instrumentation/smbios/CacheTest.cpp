@@ -10,9 +10,9 @@ namespace {
 
 using Support::SmbiosCache;
 
-class Decoded {
+class DecodedCache {
  public:
-  explicit Decoded(const SmbiosCache& cache) : tables_(tableOf(cache)) {}
+  explicit DecodedCache(const SmbiosCache& cache) : tables_(tableOf(cache)) {}
 
   const Cache& operator*() const { return tables_->caches.at(0); }
   const Cache* operator->() const { return &**this; }
@@ -23,15 +23,15 @@ class Decoded {
 };
 
 TEST(SmbiosCache, HasEveryField) {
-  const Decoded cache(SmbiosCache{.frame = {.handle = 0x0A},
-                                  .level = 3,
-                                  .socketed = true,
-                                  .location = 1,
-                                  .mode = 2,
-                                  .maximumKiB = 4096,
-                                  .installedKiB = 2048,
-                                  .currentSram = 0x08,
-                                  .speed = 12});
+  const DecodedCache cache(SmbiosCache{.frame = {.handle = 0x0A},
+                                       .level = 3,
+                                       .socketed = true,
+                                       .location = 1,
+                                       .mode = 2,
+                                       .maximumKiB = 4096,
+                                       .installedKiB = 2048,
+                                       .currentSram = 0x08,
+                                       .speed = 12});
 
   EXPECT_EQ(valueOf(cache->socket), "L1 Cache");
   EXPECT_EQ(valueOf(cache->level), 3);
@@ -54,9 +54,9 @@ TEST(SmbiosCache, HasEveryField) {
 }
 
 TEST(SmbiosCache, ConfigurationIsReadBitByBit) {
-  const Decoded off(SmbiosCache{.enabled = false, .mode = 0});
-  const Decoded unknown(SmbiosCache{.level = 8, .location = 3, .mode = 3});
-  const Decoded reserved(SmbiosCache{.location = 2});
+  const DecodedCache off(SmbiosCache{.enabled = false, .mode = 0});
+  const DecodedCache unknown(SmbiosCache{.level = 8, .location = 3, .mode = 3});
+  const DecodedCache reserved(SmbiosCache{.location = 2});
 
   EXPECT_EQ(valueOf(off->level), 1);
   EXPECT_EQ(valueOf(off->enabled), 0);
@@ -87,7 +87,7 @@ TEST(SmbiosCache, SizeStandsInOneOfTwoFields) {
       {0x7FFFFFFFULL * 64, 0x17, "ffffffff"},
   };
   for (const Case& c : cases) {
-    const Decoded cache(SmbiosCache{.maximumKiB = c.kibibytes, .installedKiB = c.kibibytes});
+    const DecodedCache cache(SmbiosCache{.maximumKiB = c.kibibytes, .installedKiB = c.kibibytes});
 
     EXPECT_EQ(cache->installedSize.value, c.kibibytes);
     EXPECT_EQ(cache->installedSize.offset, c.offset) << c.kibibytes;
@@ -98,7 +98,7 @@ TEST(SmbiosCache, SizeStandsInOneOfTwoFields) {
 }
 
 TEST(SmbiosCache, ALargeSizeWithoutASecondFieldIsWhatTheFirstSays) {
-  const Decoded cache(SmbiosCache{.frame = {.length = 0x13}, .installedKiB = 4ULL << 20});
+  const DecodedCache cache(SmbiosCache{.frame = {.length = 0x13}, .installedKiB = 4ULL << 20});
 
   EXPECT_EQ(valueOf(cache->installedSize), 0x7FFF * 64);
   EXPECT_EQ(cache->installedSize.offset, 0x09U);
@@ -108,7 +108,7 @@ TEST(SmbiosCache, EveryAssociativityIsTold) {
   // By code: the number of ways, -1 where the code names none.
   const long long ways[] = {-1, -1, -1, 1, 2, 4, -1, 8, 16, 12, 24, 32, 48, 64, 20, -1};
   for (std::uint8_t code = 0; code < std::size(ways); ++code) {
-    const Decoded cache(SmbiosCache{.associativity = code});
+    const DecodedCache cache(SmbiosCache{.associativity = code});
 
     EXPECT_EQ(valueOf(cache->ways), ways[code]) << unsigned{code};
     EXPECT_EQ(valueOf(cache->associativity), code == 0 || code == 2 ? -1 : code) << unsigned{code};
@@ -119,7 +119,7 @@ TEST(SmbiosCache, TypesThatAreNotListedAreAbsent) {
   const std::optional<CacheType> types[] = {
       {}, CacheType::Other, {}, CacheType::Instruction, CacheType::Data, CacheType::Unified, {}};
   for (std::uint8_t code = 0; code < std::size(types); ++code) {
-    const Decoded cache(SmbiosCache{.type = code});
+    const DecodedCache cache(SmbiosCache{.type = code});
 
     EXPECT_EQ(cache->type.value, types[code]) << unsigned{code};
     EXPECT_EQ(std::to_integer<unsigned int>(cache->type.raw[0]), code);
@@ -127,7 +127,7 @@ TEST(SmbiosCache, TypesThatAreNotListedAreAbsent) {
 }
 
 TEST(SmbiosCache, CodesThatMeanUnknownAreAbsent) {
-  const Decoded cache(SmbiosCache{.supportedSram = 0x02, .currentSram = 0x22, .speed = 0, .errorCorrection = 2});
+  const DecodedCache cache(SmbiosCache{.supportedSram = 0x02, .currentSram = 0x22, .speed = 0, .errorCorrection = 2});
 
   EXPECT_FALSE(cache->supportedSram);
   EXPECT_FALSE(cache->currentSram);
@@ -138,7 +138,7 @@ TEST(SmbiosCache, CodesThatMeanUnknownAreAbsent) {
 TEST(SmbiosCache, HasExactlyTheFieldsThatItsLengthReaches) {
   const std::size_t ends[] = {0x05, 0x07, 0x09, 0x0B, 0x0D, 0x0F, 0x10, 0x11, 0x12, 0x13};
   for (std::size_t length = 4; length <= 0x20; ++length) {
-    const Decoded cache(SmbiosCache{.frame = {.length = static_cast<std::uint8_t>(length)}, .speed = 3});
+    const DecodedCache cache(SmbiosCache{.frame = {.length = static_cast<std::uint8_t>(length)}, .speed = 3});
     const Cache& c = *cache;
     const bool there[] = {!c.socket.raw.empty(),        !c.level.raw.empty(),           !c.maximumSize.raw.empty(),
                           !c.installedSize.raw.empty(), !c.supportedSram.raw.empty(),   !c.currentSram.raw.empty(),

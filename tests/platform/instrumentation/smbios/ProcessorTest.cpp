@@ -11,9 +11,9 @@ namespace {
 using Support::SmbiosProcessor;
 
 /// One processor, decoded, and what was wrong with it.
-class Decoded {
+class DecodedProcessor {
  public:
-  explicit Decoded(const SmbiosProcessor& processor) : tables_(tableOf(processor)) {}
+  explicit DecodedProcessor(const SmbiosProcessor& processor) : tables_(tableOf(processor)) {}
 
   const Processor& operator*() const { return tables_->processors.at(0); }
   const Processor* operator->() const { return &**this; }
@@ -24,7 +24,7 @@ class Decoded {
 };
 
 TEST(Processor, HasEveryField) {
-  const Decoded processor(SmbiosProcessor{.frame = {.handle = 0x43}, .threadsEnabled = 12});
+  const DecodedProcessor processor(SmbiosProcessor{.frame = {.handle = 0x43}, .threadsEnabled = 12});
 
   EXPECT_EQ(valueOf(processor->socket), "CPU 1");
   EXPECT_EQ(valueOf(processor->type), 3);
@@ -52,7 +52,7 @@ TEST(Processor, HasEveryField) {
 }
 
 TEST(Processor, SaysWhereEachFieldStands) {
-  const Decoded processor(SmbiosProcessor{.frame = {.handle = 0x43}});
+  const DecodedProcessor processor(SmbiosProcessor{.frame = {.handle = 0x43}});
 
   EXPECT_EQ(placeOf(processor->structure, processor->externalClock), "SMBIOS type 4, handle 0x0043, offset 0x12");
   EXPECT_EQ(hexOf(processor->externalClock.raw), "6400");
@@ -79,7 +79,7 @@ TEST(Processor, EveryStatusIsTold) {
       {7, ProcessorStatus::Other},
   };
   for (const Case& c : cases) {
-    const Decoded processor(SmbiosProcessor{.status = c.code});
+    const DecodedProcessor processor(SmbiosProcessor{.status = c.code});
 
     EXPECT_EQ(processor->status.value, c.status) << unsigned{c.code};
     EXPECT_EQ(valueOf(processor->populated), 1) << unsigned{c.code};
@@ -87,14 +87,14 @@ TEST(Processor, EveryStatusIsTold) {
 }
 
 TEST(Processor, IgnoresTheReservedBitsOfTheStatus) {
-  const Decoded processor(SmbiosProcessor{.populated = false, .status = 0xB9});
+  const DecodedProcessor processor(SmbiosProcessor{.populated = false, .status = 0xB9});
 
   EXPECT_EQ(*processor->status, ProcessorStatus::Enabled);
   EXPECT_EQ(valueOf(processor->populated), 0);
 }
 
 TEST(Processor, AnEmptySocketHasItsLabelOnly) {
-  const Decoded processor(Support::emptySocket("CPU 2"));
+  const DecodedProcessor processor(Support::emptySocket("CPU 2"));
 
   EXPECT_EQ(valueOf(processor->socket), "CPU 2");
   EXPECT_EQ(valueOf(processor->populated), 0);
@@ -128,7 +128,7 @@ TEST(Processor, FamilyStandsInOneOfTwoFields) {
       {0xFFFD, 0xFFFD, 0x28}, {0xFFFE, -1, 0x28},    {0xFFFF, -1, 0x28},
   };
   for (const Case& c : cases) {
-    const Decoded processor(SmbiosProcessor{.family = c.family});
+    const DecodedProcessor processor(SmbiosProcessor{.family = c.family});
 
     EXPECT_EQ(valueOf(processor->family), c.value) << c.family;
     EXPECT_EQ(processor->family.offset, c.offset) << c.family;
@@ -137,7 +137,7 @@ TEST(Processor, FamilyStandsInOneOfTwoFields) {
 }
 
 TEST(Processor, FamilyOfASecondFieldThatIsNotThereIsAProblem) {
-  const Decoded processor(SmbiosProcessor{.frame = {.length = 0x28}, .family = 0x0101});
+  const DecodedProcessor processor(SmbiosProcessor{.frame = {.length = 0x28}, .family = 0x0101});
 
   EXPECT_EQ(valueOf(processor->family), -1);
   EXPECT_EQ(hexOf(processor->family.raw), "fe");
@@ -155,7 +155,7 @@ TEST(Processor, CountsStandInOneOfTwoFields) {
   const Case cases[] = {{0, -1, 0x23},    {1, 1, 0x23},     {254, 254, 0x23},       {255, 255, 0x2A},
                         {256, 256, 0x2A}, {512, 512, 0x2A}, {0xFFFE, 0xFFFE, 0x2A}, {0xFFFF, -1, 0x2A}};
   for (const Case& c : cases) {
-    const Decoded processor(SmbiosProcessor{.cores = c.count, .coresEnabled = c.count, .threads = c.count});
+    const DecodedProcessor processor(SmbiosProcessor{.cores = c.count, .coresEnabled = c.count, .threads = c.count});
 
     EXPECT_EQ(valueOf(processor->cores), c.value) << c.count;
     EXPECT_EQ(valueOf(processor->coresEnabled), c.value) << c.count;
@@ -167,14 +167,14 @@ TEST(Processor, CountsStandInOneOfTwoFields) {
 }
 
 TEST(Processor, ACountOf255WithoutASecondFieldIsJustThat) {
-  const Decoded processor(SmbiosProcessor{.frame = {.length = 0x2A}, .cores = 255});
+  const DecodedProcessor processor(SmbiosProcessor{.frame = {.length = 0x2A}, .cores = 255});
 
   EXPECT_EQ(valueOf(processor->cores), 255);
   EXPECT_EQ(processor->cores.offset, 0x23U);
 }
 
 TEST(Processor, ASecondCountThatIsNotThereForAllThreeCountsForThoseItIsThereFor) {
-  const Decoded processor(
+  const DecodedProcessor processor(
       SmbiosProcessor{.frame = {.length = 0x2D}, .cores = 512, .coresEnabled = 511, .threads = 1024});
 
   EXPECT_EQ(valueOf(processor->cores), 512);
@@ -191,7 +191,7 @@ TEST(Processor, VoltageIsWhatItRunsAtOrWhatItsSocketCanDo) {
   const Case cases[] = {{0x00, -1, -1}, {0x80, -1, -1}, {0x92, 18, -1}, {0xFF, 127, -1},
                         {0x01, -1, 1},  {0x07, -1, 7},  {0x78, -1, -1}, {0x7A, -1, 2}};
   for (const Case& c : cases) {
-    const Decoded processor(SmbiosProcessor{.voltage = c.raw});
+    const DecodedProcessor processor(SmbiosProcessor{.voltage = c.raw});
 
     EXPECT_EQ(valueOf(processor->tenthsOfVolt), c.tenths) << unsigned{c.raw};
     EXPECT_EQ(valueOf(processor->voltageCapabilities), c.capabilities) << unsigned{c.raw};
@@ -199,8 +199,8 @@ TEST(Processor, VoltageIsWhatItRunsAtOrWhatItsSocketCanDo) {
 }
 
 TEST(Processor, CodesThatMeanUnknownAreAbsentAndUnlistedOnesAreKept) {
-  const Decoded unknown(SmbiosProcessor{.type = 2, .upgrade = 2, .characteristics = 0x02});
-  const Decoded unlisted(SmbiosProcessor{.type = 0xF0, .upgrade = 0xF1, .characteristics = 0xFC00});
+  const DecodedProcessor unknown(SmbiosProcessor{.type = 2, .upgrade = 2, .characteristics = 0x02});
+  const DecodedProcessor unlisted(SmbiosProcessor{.type = 0xF0, .upgrade = 0xF1, .characteristics = 0xFC00});
 
   EXPECT_EQ(valueOf(unknown->type), -1);
   EXPECT_EQ(valueOf(unknown->upgrade), -1);
@@ -230,7 +230,7 @@ TEST(Processor, HasExactlyTheFieldsThatItsLengthReaches) {
   const std::size_t ends[] = {0x05, 0x06, 0x07, 0x08, 0x10, 0x11, 0x12, 0x14, 0x16, 0x18, 0x19, 0x1A,
                               0x1C, 0x1E, 0x20, 0x21, 0x22, 0x23, 0x24, 0x25, 0x26, 0x28, 0x32};
   for (std::size_t length = 4; length <= 0x40; ++length) {
-    const Decoded processor(SmbiosProcessor{.frame = {.length = static_cast<std::uint8_t>(length)}});
+    const DecodedProcessor processor(SmbiosProcessor{.frame = {.length = static_cast<std::uint8_t>(length)}});
     const Processor& p = *processor;
     const bool there[] = {!p.socket.raw.empty(),
                           !p.type.raw.empty(),

@@ -15,8 +15,6 @@
 namespace Tarn::Inventory {
 namespace {
 
-const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
-
 std::string refusalOf(const std::function<void()>& action) {
   try {
     action();
