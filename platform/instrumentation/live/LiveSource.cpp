@@ -2,6 +2,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "platform/instrumentation/firmware/FirmwareTables.h"
@@ -9,6 +10,7 @@
 #include "platform/instrumentation/kernel/KernelProcessor.h"
 #include "platform/instrumentation/kernel/KernelView.h"
 #include "platform/instrumentation/kernel/Machine.h"
+#include "platform/instrumentation/kernel/NumaNodes.h"
 #include "platform/instrumentation/kernel/SystemModel.h"
 #include "platform/instrumentation/live/CacheNodes.h"
 #include "platform/instrumentation/live/CoreNodes.h"
@@ -53,6 +55,9 @@ class LiveReader {
     }
     for (const Socket* socket : assignment.standalone) {
       addSocket(*socket);
+    }
+    for (NumaNode& node : readNumaNodes(machine_)) {
+      tree_.numaNode(std::move(node));
     }
     for (const Unread& entry : machine_.unread().entries()) {
       tree_.unread(entry);

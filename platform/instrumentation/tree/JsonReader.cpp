@@ -49,7 +49,7 @@ class Reader {
 
   Tree read(const Json& document) {
     const Json::json_pointer top;
-    checkMembers(document, top, {"format", "version", "unread", "disagreements", "nodes"});
+    checkMembers(document, top, {"format", "version", "unread", "disagreements", "numaNodes", "nodes"});
     if (text(document, top, "format") != "corvane-inventory") {
       refuse(top / "format", "is not \"corvane-inventory\"");
     }
@@ -61,6 +61,9 @@ class Reader {
     }
     if (document.contains("disagreements")) {
       readDisagreements(array(document, top, "disagreements"), top / "disagreements");
+    }
+    if (document.contains("numaNodes")) {
+      readNumaNodes(array(document, top, "numaNodes"), top / "numaNodes");
     }
     readNodes(array(document, top, "nodes"), top / "nodes", std::nullopt);
     return builder_.build();
@@ -145,6 +148,14 @@ class Reader {
     }
   }
 
+  void readNumaNodes(const Json& nodes, const Pointer& where) {
+    for (std::size_t i = 0; i < nodes.size(); ++i) {
+      const Pointer at = where / i;
+      checkMembers(nodes[i], at, {"number", "cpus"});
+      explained(at, [&] { builder_.numaNode({number(nodes[i], at, "number"), cpus(nodes[i], at)}); });
+    }
+  }
+
   // Nodes below one of the type `parent`, or at the top.
   void readNodes(const Json& nodes, const Pointer& where, std::optional<NodeType> parent) {
     for (std::size_t i = 0; i < nodes.size(); ++i) {
@@ -168,7 +179,7 @@ class Reader {
       });
     }
     if (node.contains("cpus")) {
-      readCpus(text(node, where, "cpus"), where / "cpus");
+      builder_.cpus(cpus(node, where));
     }
     if (node.contains("properties")) {
       readProperties(node["properties"], where / "properties");
@@ -194,12 +205,12 @@ class Reader {
     return entry->type;
   }
 
-  void readCpus(const std::string& list, const Pointer& where) {
-    std::optional<CpuSet> cpus = CpuSet::fromList(list);
+  CpuSet cpus(const Json& object, const Pointer& where) const {
+    std::optional<CpuSet> cpus = CpuSet::fromList(text(object, where, "cpus"));
     if (!cpus) {
-      refuse(where, "is no list of CPU numbers such as \"0-3,8\"");
+      refuse(where / "cpus", "is no list of CPU numbers such as \"0-3,8\"");
     }
-    builder_.cpus(*std::move(cpus));
+    return *std::move(cpus);
   }
 
   void readProperties(const Json& properties, const Pointer& where) {

@@ -39,6 +39,12 @@ class Writer {
                         {"otherSource", entry.otherSource}});
       });
     }
+    if (!tree_.numaNodes().empty()) {
+      text_ += ",\n  \"numaNodes\": [";
+      writeEntries(tree_.numaNodes(), [](const NumaNode& node) {
+        return "{\"number\": " + std::to_string(node.number) + ", \"cpus\": " + jsonText(node.cpus.toList()) + '}';
+      });
+    }
     text_ += ",\n  \"nodes\": [";
     const auto size = static_cast<NodeIndex>(tree_.nodes().size());
     writeNodes(0, size, 1);

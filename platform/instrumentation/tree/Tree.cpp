@@ -38,7 +38,8 @@ const Origin* Tree::origin(NodeIndex node, NodeLexicon::Properties id) const {
 
 bool Tree::operator==(const Tree& other) const {
   const auto contents = [](const Tree& tree) {
-    return std::tie(tree.nodes_, tree.numbers_, tree.texts_, tree.lists_, tree.unread_, tree.disagreements_);
+    return std::tie(tree.nodes_, tree.numbers_, tree.texts_, tree.lists_, tree.numaNodes_, tree.unread_,
+                    tree.disagreements_);
   };
   return contents(*this) == contents(other);
 }

@@ -94,6 +94,13 @@ struct Disagreement {
   bool operator==(const Disagreement&) const = default;
 };
 
+/// Logical CPUs that share their memory, under the kernel's number for them.
+struct NumaNode {
+  unsigned int number = 0;
+  CpuSet cpus;
+  bool operator==(const NumaNode&) const = default;
+};
+
 /// The inventory: system, processors, and below each processor its cores and caches. Immutable once
 /// built (by TreeBuilder), so any number of threads may read it.
 class Tree {
@@ -118,6 +125,9 @@ class Tree {
   const std::vector<unsigned int>* list(const Node& node, NodeLexicon::Properties id) const {
     return lookUp(lists(node), id);
   }
+
+  /// By number; empty where the kernel reports none. Nodes without CPUs are left out.
+  std::span<const NumaNode> numaNodes() const { return numaNodes_; }
 
   std::span<const Unread> unread() const { return unread_; }
   std::span<const Disagreement> disagreements() const { return disagreements_; }
@@ -169,6 +179,7 @@ class Tree {
   std::vector<ListProperty> lists_;
   std::array<std::vector<NodeIndex>, nodeTypes> byType_;
   std::vector<NodeIndex> byPath_;  // sorted by path
+  std::vector<NumaNode> numaNodes_;
   std::vector<Unread> unread_;
   std::vector<Disagreement> disagreements_;
   std::vector<OriginEntry> origins_;  // sorted by node and number

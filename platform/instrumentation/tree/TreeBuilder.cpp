@@ -149,6 +149,18 @@ TreeBuilder& TreeBuilder::list(Properties id, std::vector<unsigned int> value) {
   return *this;
 }
 
+TreeBuilder& TreeBuilder::numaNode(NumaNode node) {
+  const std::string name = "NUMA node " + std::to_string(node.number);
+  if (!tree_.numaNodes_.empty() && tree_.numaNodes_.back().number >= node.number) {
+    throw std::invalid_argument(name + " is not above those before it");
+  }
+  if (node.cpus.empty()) {
+    throw std::invalid_argument(name + " has no CPUs");
+  }
+  tree_.numaNodes_.push_back(std::move(node));
+  return *this;
+}
+
 TreeBuilder& TreeBuilder::unread(const Unread& entry) {
   tree_.unread_.push_back({validUtf8(entry.file), validUtf8(entry.reason), validUtf8(entry.remedy)});
   return *this;

@@ -60,6 +60,9 @@ class TreeBuilder {
     return *this;
   }
 
+  /// Adds a NUMA node. Throws std::invalid_argument unless its number is above those before and it has CPUs.
+  TreeBuilder& numaNode(NumaNode node);
+
   /// Reports something that the source could not read.
   TreeBuilder& unread(const Unread& entry);
 

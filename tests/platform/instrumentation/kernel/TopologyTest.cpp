@@ -1,6 +1,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cerrno>
+
 #include "tests/platform/instrumentation/KernelFiles.h"
 
 namespace Tarn::Inventory {
@@ -23,6 +25,21 @@ TEST(Topology, SparseCpuNumbers) {
   EXPECT_EQ(pathsOf(tree, NodeProcessorCore), (Paths{"P0.C0", "P5.C9"}));
   EXPECT_EQ(nodeAt(tree, "P0.C0").cpus, (CpuSet{3, 1000}));
   EXPECT_EQ(numberAt(tree, "P0", PropHardwareThreads), 2U);
+}
+
+TEST(Topology, NumaNodesWithCpusAreListedByNumber) {
+  KernelFiles files;
+  files.cpus("0-3").cpu(0, {.package = 0, .core = 0, .siblings = "0"});
+  const std::string directory = "sys/devices/system/node/";
+  files.file(directory + "node10/cpulist", "2-3\n").file(directory + "node2/cpulist", "0-1\n");
+  files.file(directory + "node1/cpulist", "\n").file(directory + "node02/cpulist", "1\n");
+  files.file(directory + "has_cpu", "2,10\n").fail(directory + "node3/cpulist", EACCES);
+
+  const Tree tree = files.tree();
+
+  ASSERT_EQ(tree.numaNodes().size(), 2U);
+  EXPECT_EQ(tree.numaNodes()[0], (NumaNode{2, {0, 1}}));
+  EXPECT_EQ(tree.numaNodes()[1], (NumaNode{10, {2, 3}}));
 }
 
 TEST(Topology, OrderIsThatOfTheNumbersNotOfDiscovery) {

@@ -64,6 +64,20 @@ TEST(JsonReader, ReadsWhatCouldNotBeRead) {
   EXPECT_EQ(tree.unread()[0], (Unread{"f", "r", "m"}));
 }
 
+TEST(JsonReader, ReadsNumaNodesAsTheyAreWritten) {
+  const Tree tree = TreeBuilder().processor("P0").numaNode({0, {0, 1, 4}}).numaNode({3, {2}}).build();
+  const std::string text = writeJson(tree);
+
+  EXPECT_NE(text.find(R"("numaNodes": [
+    {"number": 0, "cpus": "0-1,4"},
+    {"number": 3, "cpus": "2"}
+  ])"),
+            std::string::npos)
+      << text;
+  EXPECT_EQ(readJson(text, "x"), tree);
+  EXPECT_NE(readJson(text, "x"), TreeBuilder().processor("P0").build());
+}
+
 TEST(JsonReader, TheOriginOfAValueIsItsPlaceInTheFile) {
   const std::string text = document(R"({"type": "processor", "path": "P0", "status": 12, "description": "CPU",
       "properties": {"Family": 179, "ProcessorName": "A \"B\"", "RequestedStatesSupported": [1, 2]}},
@@ -142,7 +156,13 @@ INSTANTIATE_TEST_SUITE_P(
         Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "disagreements": [{"path": "P0"}]})",
                ", /disagreements/0/property", "is missing"},
         Broken{R"({"format": "corvane-inventory", "version": 1, "nodes": [], "disagreements": [{"who": "P0"}]})",
-               ", /disagreements/0/who", "is not a member that is known here"}));
+               ", /disagreements/0/who", "is not a member that is known here"},
+        Broken{
+            R"({"format": "corvane-inventory", "version": 1, "nodes": [], "numaNodes": [{"number": 0, "cpus": ""}]})",
+            ", /numaNodes/0", "NUMA node 0 has no CPUs"},
+        Broken{
+            R"({"format": "corvane-inventory", "version": 1, "nodes": [], "numaNodes": [{"number": 0, "cpus": "x"}]})",
+            ", /numaNodes/0/cpus", "is no list of CPU numbers such as \"0-3,8\""}));
 
 INSTANTIATE_TEST_SUITE_P(
     Nodes, BrokenJson,

@@ -206,6 +206,14 @@ INSTANTIATE_TEST_SUITE_P(
                   b = TreeBuilder(Detail::WithOrigins);
                   b.processor("P0").status(1).cpus({0}).from([] { return Origin(); });
                 }},
+        Refusal{"NUMA node 1 is not above those before it",
+                [](TreeBuilder& b) {
+                  b.numaNode({1, {0}}).numaNode({1, {1}});
+                }},
+        Refusal{"NUMA node 2 has no CPUs",
+                [](TreeBuilder& b) {
+                  b.numaNode({2, {}});
+                }},
         Refusal{"inventory: there is no node yet to describe", [](TreeBuilder& b) { b.status(1); }}));
 
 }  // namespace
