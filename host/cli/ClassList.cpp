@@ -1,12 +1,15 @@
 #include "host/cli/ClassList.h"
 
 #include <algorithm>
-#include <string_view>
+#include <array>
+#include <stdexcept>
+#include <vector>
 
 #include "host/ClassTable.h"
 #include "host/broker/Value.h"
 #include "host/cli/Text.h"
-#include "host/cli/results/JsonBuilder.h"
+#include "host/cli/results/Json.h"
+#include "host/cli/results/ValueNames.h"
 
 namespace Corvcim {
 namespace {
@@ -39,37 +42,29 @@ std::string classesAsText() {
   return text;
 }
 
-void writeProperty(JsonBuilder& json, const PropertyDefinition& property) {
-  json.beginObject();
-  json.member("name", property.name);
-  json.member("type", typeName(property.type));
-  json.key("key");
-  json.boolean(property.key);
+OrderedJson propertyAsJson(const PropertyDefinition& property) {
+  OrderedJson json = {{"name", property.name}, {"type", typeName(property.type)}, {"key", property.key}};
   if (!property.referenceClass.empty()) {
-    json.member("referenceClass", property.referenceClass);
+    json["referenceClass"] = property.referenceClass;
   }
-  json.endObject();
+  if (const std::string_view unit = unitName(property.name); !unit.empty()) {
+    json["unit"] = unit;
+  }
+  for (const CodeName& value : codesOf(property.name)) {
+    json["values"][std::to_string(value.code)] = value.name;
+  }
+  return json;
 }
 
-std::string classesAsJson() {
-  JsonBuilder json;
-  json.beginArray();
-  for (const ClassDefinition& definition : classDefinitions()) {
-    json.beginObject();
-    json.member("class", definition.name);
-    json.member("parent", definition.parent);
-    json.key("association");
-    json.boolean(definition.association);
-    json.key("properties");
-    json.beginArray();
-    for (const PropertyDefinition& property : definition.properties) {
-      writeProperty(json, property);
-    }
-    json.endArray();
-    json.endObject();
+OrderedJson classAsJson(const ClassDefinition& definition) {
+  OrderedJson properties = OrderedJson::array();
+  for (const PropertyDefinition& property : definition.properties) {
+    properties.push_back(propertyAsJson(property));
   }
-  json.endArray();
-  return json.take();
+  return {{"class", definition.name},
+          {"parent", definition.parent},
+          {"association", definition.association},
+          {"properties", std::move(properties)}};
 }
 
 std::string declarationOf(const PropertyDefinition& property) {
@@ -84,30 +79,92 @@ std::string declarationOf(const PropertyDefinition& property) {
   return "  " + std::string(property.key ? "[Key] " : "") + type + ' ' + name + ";\n";
 }
 
-std::string classesAsMof() {
-  std::string mof;
-  for (const ClassDefinition& definition : classDefinitions()) {
-    mof.append(mof.empty() ? "" : "\n").append(definition.association ? "[Association]\n" : "");
-    mof.append("class ").append(definition.name).append(" : ").append(definition.parent).append(" {\n");
-    for (const PropertyDefinition& property : definition.properties) {
-      mof += declarationOf(property);
-    }
-    mof += "};\n";
+std::string classAsMof(const ClassDefinition& definition) {
+  std::string mof(definition.association ? "[Association]\n" : "");
+  mof.append("class ").append(definition.name).append(" : ").append(definition.parent).append(" {\n");
+  for (const PropertyDefinition& property : definition.properties) {
+    mof += declarationOf(property);
   }
-  return mof;
+  return mof + "};\n";
+}
+
+/// "2 Enabled, 3 Disabled" on lines of at most 80 columns.
+std::string codeLines(std::span<const CodeName> codes) {
+  constexpr std::size_t longestLine = 80;
+  std::string text;
+  std::string line;
+  for (const CodeName& code : codes) {
+    std::string entry = std::to_string(code.code).append(" ").append(code.name);
+    entry += &code == &codes.back() ? "" : ",";
+    if (!line.empty() && line.size() + 1 + entry.size() > longestLine) {
+      text += line + '\n';
+      line.clear();
+    }
+    line += (line.empty() ? "      " : " ") + entry;
+  }
+  return line.empty() ? text : text + line + '\n';
+}
+
+std::string classAsText(const ClassDefinition& definition) {
+  using Row = std::array<std::string, 3>;
+  std::vector<Row> rows;
+  std::array<std::size_t, 2> widths = {};
+  for (const PropertyDefinition& property : definition.properties) {
+    std::string remark(property.key ? "key" : unitName(property.name));
+    if (!property.referenceClass.empty()) {
+      remark.append(", refers to ").append(property.referenceClass);
+    }
+    rows.push_back({std::string(property.name), typeName(property.type), remark});
+    for (std::size_t i = 0; i < widths.size(); ++i) {
+      widths[i] = std::max(widths[i], rows.back()[i].size());
+    }
+  }
+  std::string text = std::string(definition.name).append(": ").append(definition.parent);
+  text += definition.association ? ", an association\n" : "\n";
+  for (const auto& [name, type, remark] : rows) {
+    text += "  " + padRight(name, widths[0]) + "  " +
+            (remark.empty() ? type : padRight(type, widths[1]) + "  " + remark) + '\n' + codeLines(codesOf(name));
+  }
+  return text;
+}
+
+using Classes = std::vector<const ClassDefinition*>;
+
+/// What each class has in the format, with an empty line in between.
+std::string joined(const Classes& classes, std::string (*write)(const ClassDefinition& definition)) {
+  std::string text;
+  for (const ClassDefinition* definition : classes) {
+    text += (text.empty() ? "" : "\n") + write(*definition);
+  }
+  return text;
+}
+
+std::string classesAsJson(const Classes& classes) {
+  return jsonListDocument(classes, [](const ClassDefinition* definition) { return classAsJson(*definition); });
 }
 
 }  // namespace
 
 std::string writeClassList(Format format) {
-  switch (format) {
-    case Format::Mof:
-      return classesAsMof();
-    case Format::Json:
-      return classesAsJson();
-    default:
-      return classesAsText();
+  Classes all;
+  for (const ClassDefinition& definition : classDefinitions()) {
+    all.push_back(&definition);
   }
+  return format == Format::Mof    ? joined(all, classAsMof)
+         : format == Format::Json ? classesAsJson(all)
+                                  : classesAsText();
+}
+
+std::string writeClass(Format format, std::string_view name) {
+  const Classes classes = classesServing(name);
+  if (classes.empty()) {
+    throw std::runtime_error("classes: no class " + quotedText(name) +
+                             " is served here; 'corvcim classes' lists those that are");
+  }
+  if (format == Format::Json) {
+    return classes.size() == 1 ? jsonDocument(classAsJson(*classes.front())) : classesAsJson(classes);
+  }
+  return joined(classes, format == Format::Mof ? classAsMof : classAsText);
 }
 
 }  // namespace Corvcim

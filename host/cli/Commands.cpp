@@ -11,6 +11,7 @@
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"
 #include "host/cli/CrashReport.h"
+#include "host/cli/Health.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
 #include "host/cli/LibraryErrors.h"
@@ -20,6 +21,7 @@
 #include "host/cli/diff/DiffCommand.h"
 #include "host/cli/drawing/Machine.h"
 #include "host/cli/drawing/TreeDot.h"
+#include "host/cli/drawing/TreeJson.h"
 #include "host/cli/drawing/TreeSvg.h"
 #include "host/cli/drawing/TreeText.h"
 #include "host/cli/explain/ExplainCommand.h"
@@ -35,8 +37,7 @@ void setEnvironment(const Options& options) {
   if (!options.inventory.empty()) {
     setenv("CORVANE_INVENTORY", options.inventory.c_str(), 1);
   }
-  const bool isForPrograms = options.format == Format::Mof || options.format == Format::Json;
-  if (isForPrograms) {
+  if (isForPrograms(options.format)) {
     setenv("CORVANE_LANGUAGE", "en", 1);
   } else if (!options.language.empty()) {
     setenv("CORVANE_LANGUAGE", options.language.c_str(), 1);
@@ -65,19 +66,28 @@ std::string treeOutput(Format format, std::size_t width) {
       return drawTreeSvg(machine);
     case Format::Dot:
       return drawTreeDot(machine);
+    case Format::Json:
+      return drawTreeJson(machine);
     default:
       return drawTreeText(machine, width);
   }
 }
 
+std::string classOutput(const Options& options) {
+  return options.operands.empty() ? writeClassList(options.format) : writeClass(options.format, options.operand(0));
+}
+
 Outcome askLibraries(const Options& options) {
+  if (options.verb->verb == Verb::Health) {
+    return checkHealth(options);
+  }
   const LibraryFiles files = libraryFiles(options);
   if (options.verb->verb == Verb::Explain) {
     return explainValues(files, options);
   }
   if (options.verb->verb == Verb::Overview) {
     Dispatcher dispatcher(files);
-    return showOverview(dispatcher, options.nameSpace);
+    return showOverview(dispatcher, options.nameSpace, options.format);
   }
   return performOperation(files, options);
 }
@@ -100,7 +110,7 @@ Outcome runCommand(const Options& options, std::size_t width) {
   setEnvironment(options);
   switch (options.verb->verb) {
     case Verb::Classes:
-      return {writeClassList(options.format), {}};
+      return {classOutput(options), {}};
     case Verb::Inventory:
       return {inventoryOutput(options), {}};
     case Verb::Snapshot:

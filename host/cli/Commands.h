@@ -2,6 +2,7 @@
 #define HOST_CLI_COMMANDS_H
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,7 @@ struct Outcome {
   std::vector<std::string> errors;
   bool differs = false;                ///< two inventories were compared, and are not the same
   std::vector<std::string> remarks{};  ///< further lines for standard error; nothing has failed by them
+  std::optional<int> status{};         ///< the exit status, if it says more than success or failure
 };
 
 /// Runs the command. Sets CORVANE_INVENTORY and CORVANE_LANGUAGE in this process as the options ask.

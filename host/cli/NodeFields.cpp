@@ -79,33 +79,16 @@ std::optional<FieldValue> readField(const Tree& tree, const Node& node, std::str
   return entry == nullptr ? std::nullopt : readProperty(tree, node, *entry);
 }
 
-void writeFieldValue(JsonBuilder& json, const std::optional<FieldValue>& value) {
-  if (!value) {
-    json.null();
-  } else if (const auto* const number = std::get_if<unsigned int>(&*value)) {
-    json.number(std::uint64_t{*number});
-  } else if (const auto* const text = std::get_if<std::string>(&*value)) {
-    json.text(*text);
-  } else {
-    json.beginArray();
-    for (const unsigned int element : std::get<std::vector<unsigned int>>(*value)) {
-      json.number(std::uint64_t{element});
-    }
-    json.endArray();
-  }
+OrderedJson fieldAsJson(const std::optional<FieldValue>& value) {
+  return value ? std::visit([](const auto& content) { return OrderedJson(content); }, *value) : OrderedJson();
 }
 
-void writeUnreadMember(JsonBuilder& json, std::string_view name, std::span<const Tarn::Inventory::Unread> entries) {
-  json.key(name);
-  json.beginArray();
+OrderedJson unreadAsJson(std::span<const Tarn::Inventory::Unread> entries) {
+  OrderedJson list = OrderedJson::array();
   for (const Tarn::Inventory::Unread& entry : entries) {
-    json.beginObject();
-    json.member("file", entry.file);
-    json.member("reason", entry.reason);
-    json.member("remedy", entry.remedy);
-    json.endObject();
+    list.push_back({{"file", entry.file}, {"reason", entry.reason}, {"remedy", entry.remedy}});
   }
-  json.endArray();
+  return list;
 }
 
 }  // namespace Corvcim

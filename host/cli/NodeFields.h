@@ -8,7 +8,7 @@
 #include <variant>
 #include <vector>
 
-#include "host/cli/results/JsonBuilder.h"
+#include "host/cli/results/Json.h"
 #include "platform/instrumentation/tree/Tree.h"
 
 namespace Corvcim {
@@ -24,10 +24,10 @@ std::optional<FieldValue> readField(const Tarn::Inventory::Tree& tree, const Tar
                                     std::string_view name);
 
 /// The value in JSON; null for nothing.
-void writeFieldValue(JsonBuilder& json, const std::optional<FieldValue>& value);
+OrderedJson fieldAsJson(const std::optional<FieldValue>& value);
 
-/// A member that lists what could not be read.
-void writeUnreadMember(JsonBuilder& json, std::string_view name, std::span<const Tarn::Inventory::Unread> entries);
+/// What could not be read, as a list of objects.
+OrderedJson unreadAsJson(std::span<const Tarn::Inventory::Unread> entries);
 
 }  // namespace Corvcim
 

@@ -9,6 +9,7 @@
 #include "host/broker/Names.h"
 #include "host/cli/DirectEnumeration.h"
 #include "host/cli/results/ResultWriter.h"
+#include "host/cli/results/TableWriter.h"
 #include "platform/instrumentation/ProcessTree.h"
 
 namespace Corvcim {
@@ -77,7 +78,14 @@ Operation operationOf(const Options& options) {
   return operation;
 }
 
-std::string write(Format format, const Operation& operation, const Response& response) {
+std::string write(const Options& options, const Operation& operation, const Response& response) {
+  const Format format = options.format;
+  if (hasColumns(format)) {
+    const std::optional<std::vector<std::string>> columns =
+        options.hasPropertyList ? std::optional(options.properties) : std::nullopt;
+    const std::vector<Instance> rows = givesPaths(operation.kind) ? keysOf(response.paths) : response.instances;
+    return format == Format::Csv ? rowsAsCsv(rows, columns) : rowsAsTable(rows, columns);
+  }
   if (givesPaths(operation.kind)) {
     return writePaths(format, response.paths);
   }
@@ -158,7 +166,7 @@ Outcome performOperation(const LibraryFiles& files, const Options& options) {
     const Operation operation = operationOf(options);
     const Answer answer = ask(files, operation);
     if (answer.response.ok()) {
-      outcome.output = write(options.format, operation, answer.response);
+      outcome.output = write(options, operation, answer.response);
     }
     const std::optional<std::string> unreadable = unreadInventory(answer.response);
     outcome.errors = describeFailures(operation, answer, unreadable);

@@ -13,6 +13,11 @@ std::string quoted(std::string_view text) {
   return "'" + std::string(text) + "'";
 }
 
+/// Preferred to std::quoted, which argument-dependent lookup finds.
+std::string quoted(const std::string& text) {
+  return quoted(std::string_view(text));
+}
+
 [[noreturn]] void fail(const std::string& text) {
   throw UsageError(text + "; see 'corvcim --help'");
 }
@@ -34,6 +39,8 @@ constexpr Scope oneInventory = {[](const VerbSyntax& verb) { return verb.verb !=
                                 "A and B say which inventories"};
 constexpr Scope onlyInventory = {[](const VerbSyntax& verb) { return verb.verb == Verb::Inventory; },
                                  "it belongs to inventory"};
+constexpr Scope columnVerbs = {[](const VerbSyntax& verb) { return std::ranges::any_of(verb.formats, hasColumns); },
+                               "its output has no columns"};
 constexpr Scope onlyDiff = {[](const VerbSyntax& verb) { return verb.verb == Verb::Diff; }, "it belongs to diff"};
 
 constexpr Scope onlySnapshot = {[](const VerbSyntax& verb) { return verb.verb == Verb::Snapshot; },
@@ -49,10 +56,9 @@ struct Option {
 };
 
 void setFormat(Options& options, const std::string& name) {
-  constexpr Format all[] = {Format::Text, Format::Mof, Format::Json, Format::Svg, Format::Dot};
-  const auto* const found = std::ranges::find(all, std::string_view(name), formatName);
-  if (found == std::end(all)) {
-    fail("unknown output format " + quoted(name) + ": it can be " + formatList(all));
+  const auto* const found = std::ranges::find(allFormats, std::string_view(name), formatName);
+  if (found == std::end(allFormats)) {
+    fail("unknown output format " + quoted(name) + ": it can be " + formatList(allFormats));
   }
   options.format = *found;
 }
@@ -85,6 +91,12 @@ void checkSource(std::string_view said, std::string_view source) {
   }
 }
 
+/// A list of properties, as it stands after the operand of ei.
+void setColumns(Options& options, const std::string& list) {
+  options.hasPropertyList = true;
+  options.properties = splitAtCommas(list);
+}
+
 void setInventory(Options& options, const std::string& source) {
   checkSource("--inventory", source);
   options.inventory = source;
@@ -97,6 +109,7 @@ constexpr Option optionTable[] = {
     {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
     {"--namespace", "-n", true, everyVerb, setNameSpace},
     {"--output", "-o", true, everyVerb, setFormat},
+    {"--columns", "", true, columnVerbs, setColumns},
     {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.convertFrom = value; }},
     {"--ignore", "", true, onlyDiff,
      [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
@@ -177,8 +190,10 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
       checkSource("diff", source);
     }
   } else if (count >= 2) {
-    options.hasPropertyList = true;
-    options.properties = splitAtCommas(operands[2]);
+    if (options.hasPropertyList) {
+      fail(*verb, "'--columns' and " + quoted(operands[2]) + " both name the columns");
+    }
+    setColumns(options, operands[2]);
   }
 }
 
@@ -199,11 +214,15 @@ void checkCombination(const Options& options, const std::vector<Given>& given) {
       fail(name + " takes no option " + quoted(spelling) + ": " + std::string(option->scope.explanation));
     }
   }
+  const auto isColumns = [](const Given& each) { return each.option->apply == setColumns; };
+  if (std::ranges::any_of(given, isColumns) && !hasColumns(options.format)) {
+    fail("'--columns' is for '-o table' and '-o csv'");
+  }
   if (!options.convertFrom.empty() && !options.inventory.empty()) {
     fail("'--from' and '--inventory' both name a source");
   }
-  if (!options.language.empty() && (options.format == Format::Mof || options.format == Format::Json)) {
-    fail("'--language' is for text: mof and json are the same in every language");
+  if (!options.language.empty() && isForPrograms(options.format)) {
+    fail("'--language' is for text: csv, mof and json are the same in every language");
   }
   if (std::ranges::find(verb.formats, options.format) == verb.formats.end()) {
     fail(name + " has no output format " + quoted(formatName(options.format)) + ": it can be " +

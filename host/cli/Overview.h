@@ -1,7 +1,6 @@
 #ifndef HOST_CLI_OVERVIEW_H
 #define HOST_CLI_OVERVIEW_H
 
-#include <span>
 #include <string>
 
 #include "host/cli/Commands.h"
@@ -11,10 +10,15 @@
 namespace Corvcim {
 
 /// One screen about the processors, from what the providers tell, and what could not be read.
-Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace);
+Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace, Format format);
 
-/// The screen itself. Processors that differ in nothing but their identity share one paragraph.
-std::string writeOverview(const OverviewData& data, std::span<const Tarn::Inventory::Unread> unread);
+/// The screen itself. Processors that differ in nothing but their identity share one paragraph, those in the worst
+/// state come first. What the library does not report comes from the inventory: states of parts, empty sockets, what
+/// the kernel says of a virtual machine's processors, and what could not be read.
+std::string writeOverview(const OverviewData& data, const Tarn::Inventory::Tree& tree);
+
+/// The same for programs, each processor by itself: codes and numbers in base units, null for what is not known.
+std::string writeOverviewAsJson(const OverviewData& data, const Tarn::Inventory::Tree& tree);
 
 }  // namespace Corvcim
 

@@ -1,6 +1,10 @@
 #include "host/cli/Text.h"
 
+#include <wchar.h>
+
 #include <algorithm>
+#include <array>
+#include <iterator>
 
 #include "platform/common/Hex.h"
 #include "platform/instrumentation/tree/Utf8.h"
@@ -12,14 +16,62 @@ unsigned byteAt(std::string_view text, std::size_t index) {
   return static_cast<unsigned char>(text[index]);
 }
 
-bool isContinuation(unsigned byte) {
-  return (byte & 0xC0U) == 0x80U;
-}
-
 /// The length of the character at the start of valid UTF-8.
 std::size_t characterLength(std::string_view text) {
   const unsigned first = byteAt(text, 0);
   return first >= 0xF0U ? 4 : first >= 0xE0U ? 3 : first >= 0xC0U ? 2 : 1;
+}
+
+Charset outputCharset = Charset::Utf8;
+
+char32_t codePoint(std::string_view character) {
+  constexpr std::array<unsigned, 5> leadBits = {0, 0x7FU, 0x1FU, 0x0FU, 0x07U};
+  char32_t code = byteAt(character, 0) & leadBits[character.size()];
+  for (std::size_t i = 1; i < character.size(); ++i) {
+    code = (code << 6U) | (byteAt(character, i) & 0x3FU);
+  }
+  return code;
+}
+
+std::size_t widthOf(std::string_view character) {
+  if (character.size() == 1 || outputCharset == Charset::Ascii) {
+    return 1;
+  }
+  const int width = wcwidth(static_cast<wchar_t>(codePoint(character)));
+  return width < 0 ? 1 : static_cast<std::size_t>(width);
+}
+
+/// Calls `use` with one character of valid UTF-8 after the other.
+template <class Use>
+void forEachCharacter(std::string_view text, Use use) {
+  while (!text.empty()) {
+    const std::string_view character = text.substr(0, characterLength(text));
+    use(character);
+    text.remove_prefix(character.size());
+  }
+}
+
+struct Substitute {
+  std::string_view character;
+  char ascii;
+};
+constexpr std::array<Substitute, 7> substitutes = {
+    {{"·", '-'}, {"×", 'x'}, {"…", '~'}, {"─", '-'}, {"│", '|'}, {"└", '`'}, {"├", '|'}}};
+
+void appendInCharset(std::string& text, std::string_view character) {
+  if (character.size() == 1 || outputCharset == Charset::Utf8) {
+    text += character;
+    return;
+  }
+  const auto* const substitute = std::ranges::find(substitutes, character, &Substitute::character);
+  if (substitute != substitutes.end()) {
+    text += substitute->ascii;
+  } else {
+    constexpr char32_t basicPlane = 0x10000;
+    const char32_t code = codePoint(character);
+    text += code < basicPlane ? "\\u" : "\\U";
+    text += Tarn::Common::hexText(code, code < basicPlane ? 4 : 8, Tarn::Common::hexCapitals);
+  }
 }
 
 void appendEscape(std::string& text, unsigned byte) {
@@ -50,29 +102,37 @@ std::string toValidUtf8(std::string_view text) {
   return Tarn::Inventory::validUtf8(text);
 }
 
-std::string toPrintable(std::string_view text) {
-  const std::string valid = toValidUtf8(text);
-  std::string_view rest = valid;
+void useCharset(Charset charset) {
+  outputCharset = charset;
+}
+
+std::string inCharset(std::string_view text) {
   std::string result;
-  result.reserve(valid.size());
-  while (!rest.empty()) {
-    const std::string_view character = rest.substr(0, characterLength(rest));
+  result.reserve(text.size());
+  forEachCharacter(toValidUtf8(text), [&](std::string_view character) { appendInCharset(result, character); });
+  return result;
+}
+
+std::string toPrintable(std::string_view text) {
+  std::string result;
+  result.reserve(text.size());
+  forEachCharacter(toValidUtf8(text), [&](std::string_view character) {
     const unsigned first = byteAt(character, 0);
     if (isC1Control(character)) {
       appendEscape(result, byteAt(character, 1));
     } else if (first < 0x20U || first == 0x7FU) {
       appendEscape(result, first);
     } else {
-      result += character;
+      appendInCharset(result, character);
     }
-    rest.remove_prefix(character.size());
-  }
+  });
   return result;
 }
 
 std::size_t columns(std::string_view text) {
-  return static_cast<std::size_t>(
-      std::ranges::count_if(text, [](char c) { return !isContinuation(static_cast<unsigned char>(c)); }));
+  std::size_t count = 0;
+  forEachCharacter(text, [&](std::string_view character) { count += widthOf(character); });
+  return count;
 }
 
 std::string padRight(std::string text, std::size_t width) {
@@ -87,13 +147,18 @@ std::string shorten(const std::string& text, std::size_t width) {
   if (columns(text) <= width) {
     return text;
   }
-  std::size_t end = 0;
-  std::size_t taken = 0;
-  while (taken + 1 < width && end < text.size()) {
-    end += characterLength(std::string_view(text).substr(end));
-    ++taken;
+  if (width == 0) {
+    return "";
   }
-  return width == 0 ? "" : text.substr(0, end) + "…";
+  std::string shortened;
+  std::size_t taken = 1;  // by the mark
+  bool isFull = false;
+  forEachCharacter(text, [&](std::string_view character) {
+    taken += widthOf(character);
+    isFull = isFull || taken > width;
+    shortened += isFull ? std::string_view() : character;
+  });
+  return shortened + "…";
 }
 
 std::string numberListText(const std::vector<unsigned int>& numbers) {

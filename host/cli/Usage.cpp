@@ -19,7 +19,8 @@ constexpr std::string_view optionHelp =
     "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc), snapshot:FILE,\n"
     "                          json:FILE, or smbios:FILE (a dump of the firmware's tables),\n"
     "                          alone or over another: smbios:FILE+live\n"
-    "  -o, --output FORMAT     text, mof or json; for tree: text, svg or dot\n"
+    "  -o, --output FORMAT     text, table, csv, mof or json; for tree: text, json, svg or dot\n"
+    "      --columns PROP,...  the columns of a table or of csv, in this order\n"
     "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
     "  -l, --library FILE      the provider library\n"
     "      --companion FILE    the library with HALDA_ComputerSystem\n"
@@ -42,11 +43,13 @@ constexpr std::string_view associationHelp =
 constexpr std::string_view ending =
     "\n"
     "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong;\n"
-    "of diff: 0 no differences, 1 differences, 2 trouble.\n"
+    "of diff: 0 no differences, 1 differences, 2 trouble; of health: 0 OK, 1 degraded,\n"
+    "2 failed, 3 unknown.\n"
     "\n"
     "Examples:\n"
     "  corvcim ei HALDA_CPUProcessor DeviceID,Name,MaxClockSpeed\n"
     "  corvcim -o json ei root/cimv2:HALDA_CPUMemory\n"
+    "  corvcim -o csv ei HALDA_CPUProcessor DeviceID,Name,HealthState\n"
     "  corvcim tree -o svg > machine.svg\n";
 
 }  // namespace

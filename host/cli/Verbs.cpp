@@ -4,9 +4,10 @@ namespace Corvcim {
 namespace {
 
 constexpr Format textOnly[] = {Format::Text};
-constexpr Format dataFormats[] = {Format::Text, Format::Mof, Format::Json};
+constexpr Format classFormats[] = {Format::Text, Format::Mof, Format::Json};
+constexpr Format dataFormats[] = {Format::Text, Format::Table, Format::Csv, Format::Mof, Format::Json};
 constexpr Format plainFormats[] = {Format::Text, Format::Json};
-constexpr Format drawingFormats[] = {Format::Text, Format::Svg, Format::Dot};
+constexpr Format drawingFormats[] = {Format::Text, Format::Json, Format::Svg, Format::Dot};
 
 constexpr std::string_view pathDetails =
     "PATH is an object path such as\n"
@@ -53,14 +54,28 @@ constexpr std::string_view snapshotDetails =
     "machine are masked, and the file's first lines say which; --unmasked keeps them.\n"
     "Run it as root: only root may read the firmware's tables.\n";
 
+constexpr std::string_view healthDetails =
+    "One line for each processor: OK, DEGRADED, UNKNOWN or FAILED, its path, and why.\n"
+    "\n"
+    "FAILED    its health is a failure\n"
+    "UNKNOWN   its state or health is not known, or it cannot be asked\n"
+    "DEGRADED  its health is degraded, it is not in use, not all of its cores are\n"
+    "          enabled, or a core or cache of it has failed or is degraded\n"
+    "\n"
+    "Exit status: 0 all OK, 1 the worst is DEGRADED, 2 FAILED, 3 UNKNOWN. Mistakes on\n"
+    "the command line and errors of the program are UNKNOWN.\n";
+
 constexpr VerbSyntax overview = {
-    .name = "", .verb = Verb::Overview, .summary = "one screen about the processors", .formats = textOnly};
+    .name = "", .verb = Verb::Overview, .summary = "one screen about the processors", .formats = plainFormats};
 
 constexpr VerbSyntax syntaxes[] = {
     {.name = "classes",
      .verb = Verb::Classes,
-     .summary = "the classes that can be asked, with their keys",
-     .formats = dataFormats},
+     .operands = "[CLASS]",
+     .maximumOperands = 1,
+     .summary = "the classes that can be asked, or all about one",
+     .formats = classFormats,
+     .details = "Of CLASS: its properties with their types, keys, units and value names.\n"},
     {.name = "ei",
      .verb = Verb::EnumerateInstances,
      .operands = "CLASS [PROPERTY,...]",
@@ -153,6 +168,17 @@ constexpr VerbSyntax syntaxes[] = {
      .summary = "system, processors, cores and caches as a drawing",
      .formats = drawingFormats,
      .details = "Caches stand above the cores that share them, as the inventory tells it.\n"},
+    {.name = "health",
+     .verb = Verb::Health,
+     .summary = "the state of each processor, the worst first, for monitoring",
+     .formats = textOnly,
+     .details = healthDetails},
+    {.name = "help",
+     .verb = Verb::Help,
+     .operands = "[VERB]",
+     .maximumOperands = 1,
+     .summary = "the help of a verb",
+     .formats = textOnly},
 };
 
 }  // namespace
@@ -183,6 +209,10 @@ std::string_view formatName(Format format) {
   switch (format) {
     case Format::Text:
       return "text";
+    case Format::Table:
+      return "table";
+    case Format::Csv:
+      return "csv";
     case Format::Mof:
       return "mof";
     case Format::Json:

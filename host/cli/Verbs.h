@@ -21,10 +21,25 @@ enum class Verb {
   Snapshot,
   Diff,
   Explain,
-  Tree
+  Tree,
+  Health,
+  Help
 };
 
-enum class Format { Text, Mof, Json, Svg, Dot };
+enum class Format { Text, Table, Csv, Mof, Json, Svg, Dot };
+
+inline constexpr Format allFormats[] = {Format::Text, Format::Table, Format::Csv, Format::Mof,
+                                        Format::Json, Format::Svg,   Format::Dot};
+
+/// Whether programs read the format: always in English and in UTF-8.
+constexpr bool isForPrograms(Format format) {
+  return format == Format::Csv || format == Format::Mof || format == Format::Json;
+}
+
+/// Whether the format has columns, which a list of properties can choose.
+constexpr bool hasColumns(Format format) {
+  return format == Format::Table || format == Format::Csv;
+}
 
 /// What the command line may say after one verb, and what its help says.
 struct VerbSyntax {

@@ -42,12 +42,12 @@ _corvcim_description() {
 _corvcim_formats() {
   local formats
   formats=$("${COMP_WORDS[0]}" "$verb" --help 2>/dev/null | sed -n '/^Output: /{s///;s/\.$//;s/,//g;s/ or / /;p;}')
-  _corvcim_offer "${formats:-text mof json svg dot}"
+  _corvcim_offer "${formats:-text table csv mof json svg dot}"
 }
 
 _corvcim() {
   local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]} word verb=
-  local verbs="classes ei ein gi ai ain ri rin inventory explain snapshot diff tree"
+  local verbs="classes ei ein gi ai ain ri rin inventory explain snapshot diff tree health help"
   local options="--inventory --output --namespace --library --companion --language --help --version"
 
   for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
@@ -73,20 +73,21 @@ _corvcim() {
 
   if [[ $current == -* ]]; then
     case $verb in
-      ai | ain) options+=" -ac -arc -ar -arr" ;;
-      ri | rin) options+=" -ac -arc -ar" ;;
+      ei | ein | gi) options+=" --columns" ;;
+      ai | ain) options+=" --columns -ac -arc -ar -arr" ;;
+      ri | rin) options+=" --columns -ac -arc -ar" ;;
       diff) options+=" --ignore" ;;
       snapshot) options+=" --unmasked" ;;
       inventory) options+=" --from" ;;
     esac
     _corvcim_offer "$options"
-  elif [[ -z $verb ]]; then
+  elif [[ -z $verb || $verb == help ]]; then
     _corvcim_offer "$verbs"
   elif [[ $verb == diff ]]; then
     _corvcim_inventory
   elif [[ $verb == snapshot ]]; then
     _corvcim_files "$current"
-  elif [[ $verb == @(ei|ein|gi|ai|ain|ri|rin|explain) ]]; then
+  elif [[ $verb == @(classes|ei|ein|gi|ai|ain|ri|rin|explain) ]]; then
     _corvcim_classes
   fi
 }

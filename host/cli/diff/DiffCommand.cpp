@@ -5,7 +5,7 @@
 #include "host/cli/InventoryText.h"
 #include "host/cli/diff/DiffText.h"
 #include "host/cli/diff/InventoryDiff.h"
-#include "host/cli/results/JsonBuilder.h"
+#include "host/cli/results/Json.h"
 #include "platform/instrumentation/Source.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
@@ -72,47 +72,33 @@ std::string asText(const Difference& difference) {
   return text;
 }
 
-void writeChange(JsonBuilder& json, const Difference& difference, const NodeChange& change) {
+OrderedJson changeAsJson(const Difference& difference, const NodeChange& change) {
   const auto& node = change.isRemoved() ? difference.before.node(change.before) : difference.after.node(change.after);
-  json.beginObject();
-  json.member("path", change.path);
-  json.member("type", Tarn::Inventory::nodeTypeName(node.type));
-  json.member("change", change.isRemoved() ? "removed" : change.isAdded() ? "added" : "changed");
-  json.key("fields");
-  json.beginObject();
+  OrderedJson fields = OrderedJson::object();
   for (const FieldChange& field : change.fields) {
-    json.key(field.name);
-    json.beginObject();
-    json.key("a");
-    writeFieldValue(json, field.before);
-    json.key("b");
-    writeFieldValue(json, field.after);
-    json.endObject();
+    fields[std::string(field.name)] = {{"a", fieldAsJson(field.before)}, {"b", fieldAsJson(field.after)}};
   }
-  json.endObject();
-  json.endObject();
+  return {{"path", change.path},
+          {"type", Tarn::Inventory::nodeTypeName(node.type)},
+          {"change", change.isRemoved() ? "removed"
+                     : change.isAdded() ? "added"
+                                        : "changed"},
+          {"fields", std::move(fields)}};
 }
 
 std::string asJson(const Difference& difference) {
-  JsonBuilder json;
-  json.beginObject();
-  json.member("format", "corvane-inventory-diff");
-  json.key("version");
-  json.number(std::uint64_t{1});
-  json.member("a", difference.options.operand(0));
-  json.member("b", difference.options.operand(1));
-  json.key("equal");
-  json.boolean(difference.changes.empty());
-  json.key("changes");
-  json.beginArray();
+  OrderedJson changes = OrderedJson::array();
   for (const NodeChange& change : difference.changes) {
-    writeChange(json, difference, change);
+    changes.push_back(changeAsJson(difference, change));
   }
-  json.endArray();
-  writeUnreadMember(json, "unreadInA", unreadInOne(difference.before, difference.after));
-  writeUnreadMember(json, "unreadInB", unreadInOne(difference.after, difference.before));
-  json.endObject();
-  return json.take();
+  return jsonDocument({{"format", "corvane-inventory-diff"},
+                       {"version", 1},
+                       {"a", difference.options.operand(0)},
+                       {"b", difference.options.operand(1)},
+                       {"equal", difference.changes.empty()},
+                       {"changes", std::move(changes)},
+                       {"unreadInA", unreadAsJson(unreadInOne(difference.before, difference.after))},
+                       {"unreadInB", unreadAsJson(unreadInOne(difference.after, difference.before))}});
 }
 
 }  // namespace

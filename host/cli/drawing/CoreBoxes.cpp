@@ -27,8 +27,8 @@ bool isInUse(unsigned int status) {
 }
 
 std::string describe(const MachinePart& core) {
-  std::string text = "core " + core.corePath;
-  for (const std::string& fact : {cpuListText(core.cpus), labelsOf(core.caches), stateNote(core.status)}) {
+  std::string text = coreLabel(core);
+  for (const std::string& fact : {cpuListText(core.cpus), core.numa, labelsOf(core.caches), stateNote(core.status)}) {
     text += fact.empty() ? "" : " · " + fact;
   }
   return text;
@@ -60,7 +60,7 @@ Box smallCore(const MachinePart& core, int width) {
 /// One cell that stands for all the cores.
 Box summaryCell(std::span<const MachinePart> cores) {
   Box box(Box::Style::Core);
-  const std::string label = counted(cores.size(), "core");
+  const std::string label = coreCountLabel(cores.size(), cores.front());
   const std::string range = cores.front().corePath + " to " + cores.back().corePath;
   box.isInUse = isInUse(cores.front().status);
   box.width = std::max(textWidth(TextStyle::Label, label), textWidth(TextStyle::Note, range)) + 2 * boxPadding;
@@ -80,7 +80,7 @@ int smallCellWidth(const MachinePart& core) {
 int fullCellWidth(const MachinePart& core) {
   constexpr int narrowest = 76;
   constexpr int widestNote = 130;
-  int width = std::max({narrowest, textWidth(TextStyle::Label, "core " + core.corePath),
+  int width = std::max({narrowest, textWidth(TextStyle::Label, coreLabel(core)),
                         std::min(textWidth(TextStyle::Note, noteOf(core)), widestNote)});
   for (const CacheUnit& cache : core.caches) {
     width = std::max(width, textWidth(TextStyle::Label, labelsOf(std::span(&cache, 1))));
@@ -93,9 +93,12 @@ int levelOf(const CacheUnit& cache) {
 }
 
 std::string traitsOf(const MachinePart& core) {
-  const std::string threads = core.cpus.empty() ? "" : counted(core.cpus.count(), "thread");
-  const std::string caches = labelsOf(core.caches);
-  return threads + (threads.empty() || caches.empty() ? "" : " · ") + caches;
+  std::string traits;
+  for (const std::string& trait : {core.coreKind, core.cpus.empty() ? "" : counted(core.cpus.count(), "thread"),
+                                   labelsOf(core.caches), core.numa}) {
+    traits += trait.empty() ? "" : (traits.empty() ? "" : " · ") + trait;
+  }
+  return traits;
 }
 
 }  // namespace
@@ -138,7 +141,7 @@ Box fullCore(const MachinePart& core, const CorePlan& plan) {
     top += barHeight;
     box.inner.push_back(std::move(bar));
   }
-  addCentredLine(box, TextStyle::Label, top + 19, "core " + core.corePath);
+  addCentredLine(box, TextStyle::Label, top + 19, coreLabel(core));
   addCentredLine(box, TextStyle::Note, top + 35, noteOf(core));
   box.height = top + 44;
   return box;

@@ -83,6 +83,39 @@ void sortByCpu(std::vector<MachinePart>& parts) {
   std::ranges::stable_sort(parts, {}, [](const MachinePart& part) { return part.cpus.first(); });
 }
 
+/// "P-core" for "Performance core 4", "Cortex-A72 core" for "Cortex-A72 core 1"; empty for "Core 4".
+std::string coreKindIn(std::string_view description) {
+  constexpr std::string_view word = " core ";
+  const std::size_t end = description.find(word);
+  if (end == std::string_view::npos) {
+    return "";
+  }
+  const std::string_view kind = description.substr(0, end);
+  return kind == "Performance" ? "P-core" : kind == "Efficient" ? "E-core" : toPrintable(kind) + " core";
+}
+
+std::vector<unsigned int> numaNodesOf(const Tree& tree, const CpuSet& cpus) {
+  std::vector<unsigned int> numbers;
+  if (tree.numaNodes().size() > 1) {
+    for (const Tarn::Inventory::NumaNode& node : tree.numaNodes()) {
+      if (node.cpus.intersects(cpus)) {
+        numbers.push_back(node.number);
+      }
+    }
+  }
+  return numbers;
+}
+
+/// Labels the parts that lie in other nodes than the part around them, and puts those of one node together.
+void labelNuma(const Tree& tree, std::vector<MachinePart>& parts, const std::vector<unsigned int>& around) {
+  for (MachinePart& part : parts) {
+    part.numaNodes = numaNodesOf(tree, part.cpus);
+    part.numa = part.numaNodes == around ? "" : numaText(part.numaNodes);
+    labelNuma(tree, part.parts, part.numaNodes);
+  }
+  std::ranges::stable_sort(parts, {}, &MachinePart::numaNodes);
+}
+
 /// Nests rows and cores by who lies within whom. `rows` are sorted from the outside in.
 class Nesting {
  public:
@@ -203,15 +236,22 @@ MachineProcessor readProcessor(const Tree& tree, NodeIndex index) {
       core.corePath = part.path();
       core.status = part.status;
       core.cpus = part.cpus;
+      core.coreKind = coreKindIn(part.description);
       cores.push_back(std::move(core));
     }
   }
   processor.coreCount = cores.size();
   readParts(processor, std::move(caches), std::move(cores));
+  processor.numaNodes = numaNodesOf(tree, node.cpus);
+  labelNuma(tree, processor.parts, processor.numaNodes);
   return processor;
 }
 
 }  // namespace
+
+std::string numaText(const std::vector<unsigned int>& nodes) {
+  return nodes.empty() ? "" : (nodes.size() == 1 ? "NUMA node " : "NUMA nodes ") + numberListText(nodes);
+}
 
 std::size_t Machine::coreCount() const {
   std::size_t count = 0;

@@ -25,10 +25,13 @@ struct MachinePart {
   std::vector<CacheUnit> caches;   ///< outermost first; of a shared level: those of the same cores
   std::vector<MachinePart> parts;  ///< what shares the caches; empty for a core
   std::string corePath;            ///< of a core
-  unsigned int status = 0;         ///< of a core, as the inventory tells it
-  Tarn::Inventory::CpuSet cpus;    ///< logical CPUs; empty where unknown
-  std::size_t coreCount = 1;       ///< cores in this part
-  std::size_t level = 0;           ///< of shared caches: levels below, 1 for those that only cores share
+  std::string coreKind;            ///< of a core, where the processor has several kinds: "P-core", "Cortex-A72 core"
+  std::vector<unsigned int> numaNodes;  ///< of the CPUs; empty where the machine has fewer than two
+  std::string numa;                     ///< "NUMA node 1"; empty where the part around this one says so
+  unsigned int status = 0;              ///< of a core, as the inventory tells it
+  Tarn::Inventory::CpuSet cpus;         ///< logical CPUs; empty where unknown
+  std::size_t coreCount = 1;            ///< cores in this part
+  std::size_t level = 0;                ///< of shared caches: levels below, 1 for those that only cores share
 
   bool isCore() const { return parts.empty(); }
 };
@@ -39,9 +42,10 @@ struct MachineProcessor {
   unsigned int status = 0;
   unsigned int maxClock = 0;  ///< MHz; 0 where unknown
   std::size_t coreCount = 0;
-  std::size_t threadCount = 0;         ///< 0 where unknown
-  std::vector<MachinePart> parts;      ///< empty for an empty socket
-  std::vector<CacheUnit> otherCaches;  ///< those of which the inventory does not say who shares them
+  std::size_t threadCount = 0;          ///< 0 where unknown
+  std::vector<unsigned int> numaNodes;  ///< of the CPUs; empty where the machine has fewer than two
+  std::vector<MachinePart> parts;       ///< empty for an empty socket
+  std::vector<CacheUnit> otherCaches;   ///< those of which the inventory does not say who shares them
 };
 
 /// System, processors, shared caches and cores, nested as the inventory tells who shares what. The
@@ -53,6 +57,9 @@ struct Machine {
 
   std::size_t coreCount() const;
 };
+
+/// "NUMA node 1", "NUMA nodes 0, 1"; empty for none.
+std::string numaText(const std::vector<unsigned int>& nodes);
 
 /// The machine of the tree, under that name.
 Machine readMachine(const Tarn::Inventory::Tree& tree, std::string_view systemName);

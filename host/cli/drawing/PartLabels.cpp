@@ -12,6 +12,14 @@ std::string labelOf(const CacheUnit& cache) {
   return cache.size == 0 ? cache.name : cache.name + ' ' + formatBytes(cache.size);
 }
 
+std::string coreLabel(const MachinePart& core) {
+  return (core.coreKind.empty() ? "core" : core.coreKind) + ' ' + core.corePath;
+}
+
+std::string coreCountLabel(std::size_t count, const MachinePart& first) {
+  return counted(count, first.coreKind.empty() ? "core" : first.coreKind);
+}
+
 std::string cpuListText(const Tarn::Inventory::CpuSet& cpus) {
   if (cpus.empty()) {
     return "";
@@ -46,6 +54,9 @@ std::vector<std::string> factsOf(const MachineProcessor& processor) {
   }
   if (processor.maxClock != 0) {
     facts.push_back("up to " + formatMegahertz(processor.maxClock));
+  }
+  if (!processor.numaNodes.empty()) {
+    facts.push_back(numaText(processor.numaNodes));
   }
   if (std::string note = stateNote(processor.status); !note.empty()) {
     facts.push_back(std::move(note));

@@ -12,6 +12,12 @@ namespace Corvcim {
 /// "L2 2 MiB".
 std::string labelOf(const CacheUnit& cache);
 
+/// "core P0.C1", "P-core P0.C1".
+std::string coreLabel(const MachinePart& core);
+
+/// "8 cores", "8 P-cores".
+std::string coreCountLabel(std::size_t count, const MachinePart& first);
+
 /// "CPU 3", "CPUs 0-3,8"; empty for no CPU.
 std::string cpuListText(const Tarn::Inventory::CpuSet& cpus);
 

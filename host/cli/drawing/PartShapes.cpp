@@ -18,8 +18,8 @@ void collectCores(std::span<const MachinePart> parts, std::vector<const MachineP
 }  // namespace
 
 bool hasSameShape(const MachinePart& left, const MachinePart& right, States states) {
-  return left.caches == right.caches && (states == States::Ignored || left.status == right.status) &&
-         left.cpus.count() == right.cpus.count() &&
+  return left.caches == right.caches && left.coreKind == right.coreKind && left.numa == right.numa &&
+         (states == States::Ignored || left.status == right.status) && left.cpus.count() == right.cpus.count() &&
          std::ranges::equal(left.parts, right.parts, [states](const MachinePart& one, const MachinePart& other) {
            return hasSameShape(one, other, states);
          });

@@ -28,7 +28,8 @@ Box sharedCache(const MachinePart& part, std::size_t count, const Plan& plan, in
   Box box(Box::Style::SharedCache);
   const int room = maxWidth - 2 * boxPadding;
   const std::string label = (count == 1 ? "" : std::to_string(count) + " × ") + labelsOf(part.caches);
-  const std::string note = (count == 1 ? "shared by " : "each shared by ") + counted(part.coreCount, "core");
+  const std::string note = (count == 1 ? "shared by " : "each shared by ") + counted(part.coreCount, "core") +
+                           (part.numa.empty() ? "" : " · " + part.numa);
   const int labelWidth = textWidth(TextStyle::Label, label);
   box.width = std::min(labelWidth + textWidth(TextStyle::Note, note) + 5 * boxPadding, maxWidth);
   arrange(box, partBoxes(part.parts, plan, room), {boxPadding, barHeight + boxPadding}, room);

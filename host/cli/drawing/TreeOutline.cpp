@@ -28,8 +28,9 @@ void addState(OutlineItem& item, unsigned int status) {
 }
 
 OutlineItem coreItem(const MachinePart& core) {
-  OutlineItem item = {Kind::Core, "core " + core.corePath, {}, true, {}};
+  OutlineItem item = {Kind::Core, coreLabel(core), {}, true, {}};
   addDetail(item, cpuListText(core.cpus));
+  addDetail(item, core.numa);
   addDetail(item, labelsOf(core.caches));
   addState(item, core.status);
   return item;
@@ -54,9 +55,10 @@ CpuSet cpusOf(PartRun run) {
 
 OutlineItem coreRunItem(PartRun run) {
   const MachinePart& first = run.front();
-  const std::string label = counted(run.size(), "core") + ' ' + first.corePath + " to " + run.back().corePath;
+  const std::string label = coreCountLabel(run.size(), first) + ' ' + first.corePath + " to " + run.back().corePath;
   OutlineItem item = {Kind::Core, label, {}, true, {}};
   addDetail(item, cpuListText(cpusOf(run)));
+  addDetail(item, first.numa);
   addDetail(item, eachHas(first));
   addState(item, first.status);
   return item;
@@ -65,20 +67,23 @@ OutlineItem coreRunItem(PartRun run) {
 std::vector<OutlineItem> partItems(std::span<const MachinePart> parts, bool isCompact);
 
 OutlineItem sharedItem(const MachinePart& part, bool isCompact) {
-  return {Kind::Cache,
-          labelsOf(part.caches),
-          {"shared by " + counted(part.coreCount, "core")},
-          true,
-          partItems(part.parts, isCompact)};
+  OutlineItem item = {Kind::Cache, labelsOf(part.caches), {}, true, partItems(part.parts, isCompact)};
+  addDetail(item, "shared by " + counted(part.coreCount, "core"));
+  addDetail(item, part.numa);
+  return item;
 }
 
 OutlineItem sharedRunItem(PartRun run, bool isCompact) {
   const MachinePart& first = run.front();
-  return {Kind::Cache,
-          std::to_string(run.size()) + " × " + labelsOf(first.caches),
-          {"each shared by " + counted(first.coreCount, "core"), "the first:"},
-          true,
-          partItems(first.parts, isCompact)};
+  OutlineItem item = {Kind::Cache,
+                      std::to_string(run.size()) + " × " + labelsOf(first.caches),
+                      {},
+                      true,
+                      partItems(first.parts, isCompact)};
+  addDetail(item, "each shared by " + counted(first.coreCount, "core"));
+  addDetail(item, first.numa);
+  addDetail(item, "the first:");
+  return item;
 }
 
 std::vector<OutlineItem> partItems(std::span<const MachinePart> parts, bool isCompact) {

@@ -3,21 +3,12 @@
 #include <string_view>
 #include <utility>
 
+#include "host/cli/drawing/BoxGrid.h"
 #include "host/cli/drawing/SvgLayout.h"
 #include "host/cli/drawing/TreeText.h"
 
 namespace Corvcim {
 namespace {
-
-constexpr std::string_view styleSheet =
-    "  <style>\n"
-    "    text { font-family: Helvetica, Arial, 'Liberation Sans', 'DejaVu Sans', sans-serif; fill: #1c2733; }\n"
-    "    .title { font-size: 20px; font-weight: bold; }\n"
-    "    .heading { font-size: 15px; font-weight: bold; }\n"
-    "    .label { font-size: 12px; }\n"
-    "    .note { font-size: 11px; fill: #4a5763; }\n"
-    "    .centred { text-anchor: middle; }\n"
-    "  </style>\n";
 
 struct Look {
   std::string_view fill;
@@ -59,19 +50,7 @@ Look lookOf(const Box& box) {
   return {"none", "none", 0};
 }
 
-std::string_view className(TextStyle style) {
-  switch (style) {
-    case TextStyle::Title:
-      return "title";
-    case TextStyle::Heading:
-      return "heading";
-    case TextStyle::Label:
-      return "label";
-    case TextStyle::Note:
-      return "note";
-  }
-  return "note";
-}
+constexpr std::string_view noteFill = "#4a5763";
 
 std::string xmlEscaped(std::string_view text) {
   std::string result;
@@ -101,14 +80,14 @@ class Picture {
   explicit Picture(const Box& page) {
     const std::string width = std::to_string(page.width);
     const std::string height = std::to_string(page.height);
-    svg_ = R"(<svg xmlns="http://www.w3.org/2000/svg" role="img" aria-labelledby="title description" width=")" + width +
-           "\" height=\"" + height + "\" viewBox=\"0 0 " + width + ' ' + height + "\">\n";
+    svg_ = R"(<svg xmlns="http://www.w3.org/2000/svg" role="img" width=")" + width + "\" height=\"" + height +
+           "\" viewBox=\"0 0 " + width + ' ' + height +
+           "\" font-family=\"Helvetica, Arial, 'Liberation Sans', 'DejaVu Sans', sans-serif\" fill=\"#1c2733\">\n";
   }
 
   void describe(const std::string& title, const std::string& description) {
-    svg_ += "  <title id=\"title\">" + xmlEscaped(title) + "</title>\n";
-    svg_ += "  <desc id=\"description\">" + xmlEscaped(description) + "</desc>\n";
-    svg_ += styleSheet;
+    svg_ += "  <title>" + xmlEscaped(title) + "</title>\n";
+    svg_ += "  <desc>" + xmlEscaped(description) + "</desc>\n";
   }
 
   void add(const Box& box, int left, int top) {
@@ -152,9 +131,17 @@ class Picture {
 
   void addText(const TextLine& line, int x, int y) {
     addNumbers("  <text", {{"x", x + line.x}, {"y", y + line.y}});
-    svg_ += " class=\"";
-    svg_ += className(line.style);
-    svg_ += line.isCentred ? " centred\">" : "\">";
+    addAttribute("font-size", std::to_string(fontSize(line.style)));
+    if (line.style == TextStyle::Title || line.style == TextStyle::Heading) {
+      addAttribute("font-weight", "bold");
+    }
+    if (line.style == TextStyle::Note) {
+      addAttribute("fill", noteFill);
+    }
+    if (line.isCentred) {
+      addAttribute("text-anchor", "middle");
+    }
+    svg_ += '>';
     svg_ += xmlEscaped(line.text) + "</text>\n";
   }
 

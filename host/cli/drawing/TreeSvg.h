@@ -8,7 +8,8 @@
 namespace Corvcim {
 
 /// The machine as a picture: SVG that needs nothing beside itself, on a light ground, with a title
-/// and a description for people who cannot see it.
+/// and a description for people who cannot see it. It has no ids and no style sheet, so that it changes nothing of a
+/// page that it is put into.
 std::string drawTreeSvg(const Machine& machine);
 
 }  // namespace Corvcim

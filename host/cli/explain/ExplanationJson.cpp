@@ -1,5 +1,4 @@
 #include "host/cli/explain/ExplanationWriters.h"
-#include "host/cli/results/JsonBuilder.h"
 #include "host/cli/results/JsonWriter.h"
 #include "host/cli/results/LocalPaths.h"
 
@@ -9,97 +8,59 @@ namespace {
 using Tarn::Inventory::Disagreement;
 using Tarn::Inventory::Tree;
 
-void writeDisagreements(JsonBuilder& json, std::span<const Disagreement> entries) {
-  json.key("disagreements");
-  json.beginArray();
+OrderedJson disagreementsAsJson(std::span<const Disagreement> entries) {
+  OrderedJson list = OrderedJson::array();
   for (const Disagreement& entry : entries) {
-    json.beginObject();
-    json.member("path", entry.path);
-    json.member("property", entry.property);
-    json.member("chosen", entry.chosen);
-    json.member("chosenSource", entry.chosenSource);
-    json.member("other", entry.other);
-    json.member("otherSource", entry.otherSource);
-    json.endObject();
+    list.push_back({{"path", entry.path},
+                    {"property", entry.property},
+                    {"chosen", entry.chosen},
+                    {"chosenSource", entry.chosenSource},
+                    {"other", entry.other},
+                    {"otherSource", entry.otherSource}});
   }
-  json.endArray();
+  return list;
 }
 
-void writeOrigin(JsonBuilder& json, const Tarn::Inventory::Origin* origin) {
-  json.key("origin");
-  if (origin == nullptr) {
-    json.null();
-    return;
-  }
-  json.beginObject();
-  json.member("source", origin->source);
-  json.member("raw", origin->raw);
-  json.member("rule", origin->rule);
-  json.endObject();
+OrderedJson originAsJson(const Tarn::Inventory::Origin* origin) {
+  return origin == nullptr ? OrderedJson()
+                           : OrderedJson({{"source", origin->source}, {"raw", origin->raw}, {"rule", origin->rule}});
 }
 
-void writeProperty(JsonBuilder& json, const ExplainedProperty& property) {
-  json.beginObject();
-  json.member("name", property.source->property);
-  json.key("value");
-  writeValue(json, property.value.value_or(Value()));
-  json.key("field");
-  if (property.source->field.empty()) {
-    json.null();
-  } else {
-    json.text(property.source->field);
-  }
-  json.key("datum");
-  writeFieldValue(json, property.datum.value);
-  writeOrigin(json, property.origin);
-  json.member("library", property.step);
-  writeDisagreements(json, property.disagreements);
-  writeUnreadMember(json, "unread", property.unread);
-  json.endObject();
+OrderedJson propertyAsJson(const ExplainedProperty& property) {
+  return {{"name", property.source->property},
+          {"value", valueAsJson(property.value.value_or(Value()))},
+          {"field", textOrNull(property.source->field)},
+          {"datum", fieldAsJson(property.datum.value)},
+          {"origin", originAsJson(property.origin)},
+          {"library", property.step},
+          {"disagreements", disagreementsAsJson(property.disagreements)},
+          {"unread", unreadAsJson(property.unread)}};
 }
 
-void writeInstance(JsonBuilder& json, const Tree& tree, const ExplainedInstance& instance) {
-  json.beginObject();
-  json.member("class", instance.className);
-  json.member("part", tree.node(instance.node).path());
-  json.key("path");
-  if (instance.path) {
-    json.text(withoutHosts(*instance.path).text());
-  } else {
-    json.null();
-  }
-  json.key("notReported");
-  if (instance.notReported.empty()) {
-    json.null();
-  } else {
-    json.text(instance.notReported);
-  }
-  json.key("properties");
-  json.beginArray();
+OrderedJson instanceAsJson(const Tree& tree, const ExplainedInstance& instance) {
+  OrderedJson properties = OrderedJson::array();
   for (const ExplainedProperty& property : instance.properties) {
-    writeProperty(json, property);
+    properties.push_back(propertyAsJson(property));
   }
-  json.endArray();
-  json.endObject();
+  return {{"class", instance.className},
+          {"part", tree.node(instance.node).path()},
+          {"path", instance.path ? OrderedJson(withoutHosts(*instance.path).text()) : OrderedJson()},
+          {"notReported", textOrNull(instance.notReported)},
+          {"properties", std::move(properties)}};
 }
 
 }  // namespace
 
 std::string writeExplanationsAsJson(const Tree& tree, std::span<const ExplainedInstance> instances,
                                     std::string_view source) {
-  JsonBuilder json;
-  json.beginObject();
-  json.member("inventory", source);
-  json.key("instances");
-  json.beginArray();
+  OrderedJson list = OrderedJson::array();
   for (const ExplainedInstance& instance : instances) {
-    writeInstance(json, tree, instance);
+    list.push_back(instanceAsJson(tree, instance));
   }
-  json.endArray();
-  writeDisagreements(json, tree.disagreements());
-  writeUnreadMember(json, "unread", tree.unread());
-  json.endObject();
-  return json.take();
+  return jsonDocument({{"inventory", source},
+                       {"instances", std::move(list)},
+                       {"disagreements", disagreementsAsJson(tree.disagreements())},
+                       {"unread", unreadAsJson(tree.unread())}});
 }
 
 }  // namespace Corvcim

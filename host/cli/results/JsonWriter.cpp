@@ -5,19 +5,17 @@
 
 #include "host/ClassTable.h"
 #include "host/broker/Names.h"
-#include "host/cli/results/JsonBuilder.h"
 #include "host/cli/results/LocalPaths.h"
 
 namespace Corvcim {
 namespace {
 
-void writeInstance(JsonBuilder& json, const Instance& instance, const PropertyList& selection);
-
-void writeValues(JsonBuilder& json, const std::vector<NamedValue>& values) {
+OrderedJson valuesAsJson(const std::vector<NamedValue>& values) {
+  OrderedJson json = OrderedJson::object();
   for (const NamedValue& each : values) {
-    json.key(each.name);
-    writeValue(json, each.value);
+    json[each.name] = valueAsJson(each.value);
   }
+  return json;
 }
 
 bool isSelected(const PropertyList& selection, const PropertyDefinition& property) {
@@ -25,110 +23,83 @@ bool isSelected(const PropertyList& selection, const PropertyDefinition& propert
          std::ranges::any_of(*selection, [&](const std::string& name) { return sameName(name, property.name); });
 }
 
-void writeUnknownProperties(JsonBuilder& json, const Instance& instance, const PropertyList& selection) {
+void addUnknownProperties(OrderedJson& json, const Instance& instance, const PropertyList& selection) {
   const ClassDefinition* definition = findClass(instance.path.className);
   if (definition == nullptr) {
     return;
   }
   for (const PropertyDefinition& property : definition->properties) {
     if (instance.property(property.name) == nullptr && isSelected(selection, property)) {
-      json.key(property.name);
-      json.null();
+      json[std::string(property.name)] = nullptr;
     }
   }
 }
 
-void writeNames(JsonBuilder& json, const ObjectPath& path) {
-  json.member("class", path.className);
-  json.member("namespace", path.nameSpace);
-  json.member("path", withoutHosts(path).text());
+OrderedJson namesOf(const ObjectPath& path) {
+  return {{"class", path.className}, {"namespace", path.nameSpace}, {"path", withoutHosts(path).text()}};
 }
 
-void writeInstance(JsonBuilder& json, const Instance& instance, const PropertyList& selection) {
-  json.beginObject();
-  writeNames(json, instance.path);
-  json.key("properties");
-  json.beginObject();
-  writeValues(json, instance.properties);
-  writeUnknownProperties(json, instance, selection);
-  json.endObject();
-  json.endObject();
+OrderedJson jsonOf(const Instance& instance, const PropertyList& selection) {
+  OrderedJson json = namesOf(instance.path);
+  json["properties"] = valuesAsJson(instance.properties);
+  addUnknownProperties(json["properties"], instance, selection);
+  return json;
+}
+
+OrderedJson listAsJson(const std::vector<Value>& elements) {
+  OrderedJson json = OrderedJson::array();
+  for (const Value& element : elements) {
+    json.push_back(valueAsJson(element));
+  }
+  return json;
 }
 
 }  // namespace
 
-void writeValue(JsonBuilder& json, const Value& value) {
+OrderedJson valueAsJson(const Value& value) {
   if (value.isNull()) {
-    json.null();
-    return;
+    return nullptr;
   }
   if (value.isArray()) {
-    json.beginArray();
-    for (const Value& element : value.elements()) {
-      writeValue(json, element);
-    }
-    json.endArray();
-    return;
+    return listAsJson(value.elements());
   }
   switch (value.type()) {
     case CMPI_boolean:
-      json.boolean(value.asBoolean());
-      return;
+      return value.asBoolean();
     case CMPI_real32:
     case CMPI_real64:
-      json.number(value.asReal());
-      return;
+      return value.asReal();
     case CMPI_ref:
-      json.text(withoutHosts(value.asReference()).text());
-      return;
+      return withoutHosts(value.asReference()).text();
     case CMPI_instance:
-      writeInstance(json, value.asInstance(), std::nullopt);
-      return;
+      return jsonOf(value.asInstance(), std::nullopt);
     case CMPI_string:
     case CMPI_dateTime:
-      json.text(value.asString());
-      return;
+      return value.asString();
     case CMPI_sint8:
     case CMPI_sint16:
     case CMPI_sint32:
     case CMPI_sint64:
-      json.number(value.asSigned());
-      return;
+      return value.asSigned();
     default:
-      json.number(value.asUnsigned());
+      return value.asUnsigned();
   }
 }
 
 std::string instancesAsJson(std::span<const Instance> instances, const PropertyList& selection) {
-  JsonBuilder json;
-  json.beginArray();
-  for (const Instance& instance : instances) {
-    writeInstance(json, instance, selection);
-  }
-  json.endArray();
-  return json.take();
+  return jsonListDocument(instances, [&](const Instance& instance) { return jsonOf(instance, selection); });
 }
 
 std::string instanceAsJson(const Instance& instance, const PropertyList& selection) {
-  JsonBuilder json;
-  writeInstance(json, instance, selection);
-  return json.take();
+  return jsonDocument(jsonOf(instance, selection));
 }
 
 std::string pathsAsJson(std::span<const ObjectPath> paths) {
-  JsonBuilder json;
-  json.beginArray();
-  for (const ObjectPath& path : paths) {
-    json.beginObject();
-    writeNames(json, path);
-    json.key("keys");
-    json.beginObject();
-    writeValues(json, path.keys);
-    json.endObject();
-    json.endObject();
-  }
-  json.endArray();
-  return json.take();
+  return jsonListDocument(paths, [](const ObjectPath& path) {
+    OrderedJson json = namesOf(path);
+    json["keys"] = valuesAsJson(path.keys);
+    return json;
+  });
 }
 
 }  // namespace Corvcim

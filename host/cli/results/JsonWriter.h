@@ -6,7 +6,7 @@
 
 #include "host/broker/Instance.h"
 #include "host/broker/Operation.h"
-#include "host/cli/results/JsonBuilder.h"
+#include "host/cli/results/Json.h"
 
 namespace Corvcim {
 
@@ -19,8 +19,8 @@ std::string instanceAsJson(const Instance& instance, const PropertyList& selecti
 /// Each path is an object with "class", "namespace", "path" and "keys".
 std::string pathsAsJson(std::span<const ObjectPath> paths);
 
-/// One value.
-void writeValue(JsonBuilder& json, const Value& value);
+/// One value; null for what JSON does not have: infinities and NaN.
+OrderedJson valueAsJson(const Value& value);
 
 }  // namespace Corvcim
 

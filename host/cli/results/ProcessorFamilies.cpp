@@ -1,19 +1,11 @@
 // Names of the CIM processor family codes, as management clients show them.
 
-#include <algorithm>
-#include <iterator>
-
 #include "host/cli/results/ValueNames.h"
 
 namespace Corvcim {
 namespace {
 
-struct Family {
-  std::uint16_t code;
-  std::string_view name;
-};
-
-constexpr Family families[] = {
+constexpr CodeName families[] = {
     {1, "Other"},
     {2, "Unknown"},
     {3, "8086"},
@@ -235,9 +227,8 @@ constexpr Family families[] = {
 
 }  // namespace
 
-std::string_view processorFamilyName(std::uint64_t code) {
-  const auto* const found = std::ranges::lower_bound(families, code, {}, &Family::code);
-  return found != std::end(families) && found->code == code ? found->name : std::string_view();
+std::span<const CodeName> processorFamilies() {
+  return families;
 }
 
 }  // namespace Corvcim

@@ -8,6 +8,7 @@
 #include <string>
 
 #include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/host/cli/Expected.h"
 #include "tests/host/cli/Machines.h"
 #include "tests/host/cli/Program.h"
@@ -167,14 +168,14 @@ TEST(Corvcim, ShowsVersionAndHelp) {
   EXPECT_EQ(corvcim({"ein", "--help"}), success("Usage: corvcim [OPTION...] ein CLASS\n"
                                                 "\n"
                                                 "Shows the paths of every instance.\n"
-                                                "Output: text, mof or json.\n"
+                                                "Output: text, table, csv, mof or json.\n"
                                                 "\n"
                                                 "CLASS is a class name, with or without a namespace before it "
                                                 "(root/cimv2:HALDA_CPUMemory).\n"));
 }
 
 TEST(Corvcim, InventoryReadsBackAsTheSameTree) {
-  for (const auto& machine : {twoCoreMachine(), dualSocketServer(), smallBoard(), strangeTexts()}) {
+  for (const auto& machine : {twoCoreMachine(), dualSocketServer(), numaServer(), smallBoard(), strangeTexts()}) {
     const Finished run = corvcimOn(machine, {"inventory", "-o", "json"});
 
     EXPECT_EQ(run.errors, "");
@@ -183,36 +184,109 @@ TEST(Corvcim, InventoryReadsBackAsTheSameTree) {
 }
 
 TEST(Corvcim, OverviewComesThroughTheProviders) {
-  EXPECT_EQ(corvcimOn(smallBoard(), {}), success(host() + ": BoardBox\n"
-                                                          "\n"
-                                                          "Processor P0\n"
-                                                          "  Model   Board CPU 4\n"
-                                                          "  Family  Xeon, stepping 8\n"
-                                                          "  State   Enabled, health OK\n"
-                                                          "  Cores   4 cores, all enabled, 4 threads\n"
-                                                          "  Clocks  2 GHz now, 1.5 GHz at most\n"
-                                                          "  Caches  4 × L1d 32 KiB, 4 × L1i 48 KiB, L2 1 MiB, cache\n"
-                                                          "  Widths  64 data bits, 64 address bits\n"
-                                                          "\n"
-                                                          "Not read:\n"
-                                                          "  /sys/firmware/dmi/tables/DMI: permission denied\n"
-                                                          "    run as root to read it\n"));
+  EXPECT_EQ(corvcimOn(smallBoard(), {}),
+            success(host() + ": BoardBox\n"
+                             "2 sockets (1 in use, 1 empty socket): 4 cores, 3 enabled, 4 threads\n"
+                             "\n"
+                             "Processor P0\n"
+                             "  Model   Board CPU 4\n"
+                             "  Family  Xeon, stepping 8\n"
+                             "  State   Enabled, health OK\n"
+                             "  Cores   4 cores, 3 enabled, 4 threads\n"
+                             "  Clocks  2 GHz now, 1.5 GHz at most\n"
+                             "  Caches  4 × L1d 32 KiB, 4 × L1i 48 KiB, L2 1 MiB, cache\n"
+                             "  Widths  64 data bits, 64 address bits\n"
+                             "\n"
+                             "Not reported to clients: P1 (empty socket)\n"
+                             "\n"
+                             "Not read:\n"
+                             "  /sys/firmware/dmi/tables/DMI: permission denied\n"
+                             "    run as root to read it\n"));
 }
 
-TEST(Corvcim, OverviewOfAVirtualMachineSaysWhyThereIsNoName) {
+TEST(Corvcim, OverviewOfAVirtualMachineSaysWhatTheKernelReports) {
   EXPECT_EQ(corvcimOn(virtualMachine(), {}),
             success(host() + ": Virtual Machine\n"
                              "\n"
                              "Processor P0\n"
-                             "  Model   Unknown\n"
-                             "  Family  Unknown, stepping 8\n"
+                             "  Model   Unknown to clients; the kernel reports Host CPU\n"
+                             "  Family  Unknown to clients; the kernel reports Xeon, stepping 8\n"
                              "  State   Enabled, health OK\n"
                              "  Cores   1 core, 1 enabled, 1 thread\n"
                              "  Clocks  2 GHz now\n"
                              "  Caches  not known\n"
-                             "  Widths  64 data bits, 64 address bits\n"
-                             "\n"
-                             "A virtual machine: its processors' model and family are not reported.\n"));
+                             "  Widths  64 data bits, 64 address bits\n"));
+}
+
+TEST(Corvcim, OverviewAsJsonHasEveryProcessor) {
+  const Finished run = corvcimOn(dualSocketServer(), {"-o", "json"});
+  const nlohmann::json overview = nlohmann::json::parse(run.output);
+
+  EXPECT_EQ(run.errors, "");
+  EXPECT_EQ(overview["system"]["name"], host());
+  EXPECT_EQ(overview["cores"], 128);
+  EXPECT_EQ(overview["processors"].size(), 2U);
+  EXPECT_EQ(overview["processors"][1]["path"], "P1");
+  EXPECT_EQ(overview["processors"][1]["caches"].dump(),
+            R"([{"count":64,"name":"L1d","size":32768},{"count":64,"name":"L1i","size":32768},)"
+            R"({"count":64,"name":"L2","size":524288},{"count":8,"name":"L3","size":33554432}])");
+}
+
+TEST(Corvcim, HealthIsALineForEachProcessorAndAStatus) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"health"}), success("OK P0: 2 cores, all enabled, 2 threads\n"));
+  EXPECT_EQ(corvcimOn(smallBoard(), {"health"}), (Finished{1, "DEGRADED P0: 4 cores, 3 enabled, 4 threads\n", ""}));
+
+  Tarn::Inventory::TreeBuilder builder;
+  builder.processor("P0").processor("P1").status(Tarn::Inventory::Status::failed);
+  EXPECT_EQ(corvcimOn(builder.build(), {"health"}),
+            (Finished{2, "FAILED P1: failed; health Critical Failure\nOK P0\n", ""}));
+}
+
+TEST(Corvcim, HealthIsUnknownWhereTheProgramFails) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"health", "-l", "/nowhere/provider.so"}),
+            (Finished{3,
+                      "UNKNOWN: HALDA_CPUProcessor: CIM_ERR_FAILED: cannot load provider library: "
+                      "/nowhere/provider.so: cannot open shared object file: No such file or directory\n",
+                      ""}));
+  EXPECT_EQ(corvcim({"health", "-i", "root:/nowhere"}),
+            (Finished{3,
+                      "UNKNOWN: cannot read the inventory: /nowhere: no such file or directory; name a captured root "
+                      "directory, or a file of captured files\n",
+                      ""}));
+  EXPECT_EQ(corvcim({"health", "P0"}),
+            (Finished{3, "UNKNOWN: health: unexpected argument 'P0'; usage: corvcim [OPTION...] health\n",
+                      "corvcim: health: unexpected argument 'P0'; usage: corvcim [OPTION...] health\n"}));
+}
+
+TEST(Corvcim, AsciiLocalesGetAscii) {
+  const Directory directory;
+  const std::string file = directory.write("machine.json", Tarn::Inventory::writeJson(strangeTexts()));
+  const std::string run = "export LC_ALL=C CORVANE_INVENTORY=json:" + file + "; \"$corvcim\" ";
+
+  EXPECT_EQ(shell(run + "tree"), success(host() + ": A<b>&\"c\"\\n\\x1B[31m\n"
+                                                  "`- processor P0: say \"hi\" \\ <there>\\x07 \\u00E9\\n; 1 core; "
+                                                  "1 thread; up to 1 GHz\n"
+                                                  "   `- core P0.C0: CPU 0\n"));
+  EXPECT_EQ(shell(run + "-o table ei HALDA_CPUProcessor Name,DeviceID"),
+            success("Name                             DeviceID\n"
+                    "say \"hi\" \\ <there>\\x07 \\u00E9\\n  P0\n"));
+  EXPECT_EQ(shell(run + "gi é"), failed("gi \\u00E9: this is a class, and gi takes the path of an instance; ein lists "
+                                        "the paths of a class"));
+  EXPECT_NE(shell(run + "inventory -o json").output.find("é"), std::string::npos);
+  EXPECT_NE(shell(run + "tree -o svg").output.find("é"), std::string::npos);
+}
+
+TEST(Corvcim, TablesAndCsvHaveTheColumnsThatWereAskedFor) {
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "table", "ei", "HALDA_CPUProcessor", "MaxClockSpeed,deviceid,UniqueId"}),
+            success("MaxClockSpeed  DeviceID  UniqueId\n"
+                    "2300 MHz       P0        0FA9\n"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "csv", "ei", "HALDA_CPUProcessorCore", "--columns", "HealthState"}),
+            success("HealthState\r\n5\r\n5\r\n"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "csv", "ein", "HALDA_CPUProcessorCore"}),
+            success("InstanceID\r\nP0.C0\r\nP0.C1\r\n"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "csv", "ain", "-ac", "HALDA_CPUConcreteComponent", "--columns",
+                                         "InstanceID", processorPath("P0")}),
+            success("InstanceID\r\nP0.C0\r\nP0.C1\r\n"));
 }
 
 TEST(Corvcim, OverviewOfABigMachineFitsAScreen) {
@@ -231,6 +305,9 @@ TEST(Corvcim, DrawsTheTree) {
                              "      ├─ core P0.C0: CPU 0; L2 2 MiB, L1d 48 KiB, L1i 32 KiB\n"
                              "      └─ core P0.C1: CPU 1; L2 2 MiB, L1d 48 KiB, L1i 32 KiB\n"));
   EXPECT_TRUE(corvcimOn(twoCoreMachine(), {"tree", "-o", "svg"}).output.starts_with("<svg "));
+  EXPECT_EQ(nlohmann::json::parse(
+                corvcimOn(twoCoreMachine(), {"tree", "-o", "json"}).output)["processors"][0]["parts"][0]["cores"],
+            2);
   EXPECT_TRUE(corvcimOn(twoCoreMachine(), {"tree", "-o", "dot"}).output.starts_with("digraph corvcim {\n"));
 }
 
@@ -243,6 +320,44 @@ TEST(Corvcim, ListsTheClasses) {
   EXPECT_EQ(classes.size(), 10U);
   EXPECT_EQ(classes[5]["properties"][0].dump(),
             R"({"key":true,"name":"GroupComponent","referenceClass":"HALDA_ComputerSystem","type":"ref"})");
+}
+
+TEST(Corvcim, ShowsOneClassWithTypesKeysUnitsAndValueNames) {
+  EXPECT_EQ(corvcim({"classes", "halda_cpuprocessorcapabilities"}),
+            success("HALDA_CPUProcessorCapabilities: CIM_ProcessorCapabilities\n"
+                    "  InstanceID                string    key\n"
+                    "  Caption                   string\n"
+                    "  Description               string\n"
+                    "  NumberOfProcessorCores    uint16\n"
+                    "  NumberOfHardwareThreads   uint16\n"
+                    "  RequestedStatesSupported  uint16[]\n"
+                    "      0 Unknown, 2 Enabled, 3 Disabled, 4 Shut Down, 5 No Change, 6 Offline,\n"
+                    "      7 Test, 8 Deferred, 9 Quiesce, 10 Reboot, 11 Reset, 12 Not Applicable\n"
+                    "  ElementNameEditSupported  boolean\n"));
+  EXPECT_EQ(corvcim({"classes", "CIM_ConcreteComponent"}),
+            success("HALDA_CPUConcreteComponent: CIM_ConcreteComponent, an association\n"
+                    "  GroupComponent  ref  key, refers to HALDA_CPUProcessor\n"
+                    "  PartComponent   ref  key, refers to HALDA_CPUProcessorCore\n"));
+  const nlohmann::json processor =
+      nlohmann::json::parse(corvcim({"classes", "HALDA_CPUProcessor", "-o", "json"}).output);
+  EXPECT_EQ(processor["class"], "HALDA_CPUProcessor");
+  for (const auto& property : processor["properties"]) {
+    if (property["name"] == "MaxClockSpeed") {
+      EXPECT_EQ(property.dump(), R"({"key":false,"name":"MaxClockSpeed","type":"uint32","unit":"MHz"})");
+    }
+    if (property["name"] == "HealthState") {
+      EXPECT_EQ(property["values"]["25"], "Critical Failure");
+    }
+  }
+  EXPECT_EQ(corvcim({"classes", "HALDA_Disk"}),
+            failed("classes: no class \"HALDA_Disk\" is served here; 'corvcim classes' lists those that are"));
+}
+
+TEST(Corvcim, HelpOfAVerbIsThatAfterIt) {
+  EXPECT_EQ(corvcim({"help"}), corvcim({"--help"}));
+  EXPECT_EQ(corvcim({"help", "ein"}), corvcim({"ein", "--help"}));
+  EXPECT_EQ(corvcim({"help", "enumerate"}),
+            (Finished{2, "", "corvcim: help: unknown verb 'enumerate'; see 'corvcim --help'\n"}));
 }
 
 TEST(Corvcim, DeclaresTheClassesAsMof) {

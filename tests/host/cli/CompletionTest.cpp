@@ -18,9 +18,9 @@ std::string offered(const std::string& words) {
 }
 
 TEST(Completion, OffersTheFormatsThatTheVerbTakes) {
-  EXPECT_EQ(offered("-o ''"), "text mof json svg dot\n");
-  EXPECT_EQ(offered("ei HALDA_CPUMemory -o ''"), "text mof json\n");
-  EXPECT_EQ(offered("tree --output ''"), "text svg dot\n");
+  EXPECT_EQ(offered("-o ''"), "text table csv mof json svg dot\n");
+  EXPECT_EQ(offered("ei HALDA_CPUMemory -o ''"), "text table csv mof json\n");
+  EXPECT_EQ(offered("tree --output ''"), "text json svg dot\n");
   EXPECT_EQ(offered("inventory -o ''"), "text json\n");
   EXPECT_EQ(offered("snapshot -o ''"), "text\n");
   EXPECT_EQ(offered("classes -o m"), "mof\n");
@@ -29,6 +29,12 @@ TEST(Completion, OffersTheFormatsThatTheVerbTakes) {
 TEST(Completion, OffersTheRoleOfTheResultWhereThereIsOne) {
   EXPECT_NE(offered("ain -").find(" -ar -arr\n"), std::string::npos);
   EXPECT_NE(offered("rin -").find(" -ar\n"), std::string::npos);
+}
+
+TEST(Completion, OffersVerbsToHelpAndColumnsToTables) {
+  EXPECT_EQ(offered("help cl"), "classes\n");
+  EXPECT_NE(offered("ei HALDA_CPUMemory --").find(" --columns"), std::string::npos);
+  EXPECT_EQ(offered("tree --").find(" --columns"), std::string::npos);
 }
 
 TEST(Completion, OffersEveryVerbOfTheHelp) {

@@ -115,14 +115,33 @@ Tree dualSocketServer() {
   return builder.build();
 }
 
+Tree numaServer() {
+  TreeBuilder builder;
+  builder.system().text(PropSystemModel, "RackBox 1U");
+  for (unsigned int socket = 0; socket < 2; ++socket) {
+    const std::string prefix = "P" + std::to_string(socket);
+    addProcessor(builder, prefix, {"Server CPU 4", 4, 4, 3000});
+    builder.cpus(range(4 * socket, 4));
+    for (unsigned int i = 0; i < 4; ++i) {
+      builder.core(prefix + ".C" + std::to_string(i)).cpus({4 * socket + i});
+    }
+    for (unsigned int i = 0; i < 2; ++i) {
+      addCache(builder, prefix + ".L3." + std::to_string(i), 3, Unified, 8192, {4 * socket + i, 4 * socket + i + 2});
+    }
+  }
+  builder.numaNode({0, {0, 2}}).numaNode({1, {1, 3}}).numaNode({2, range(4, 4)});
+  return builder.build();
+}
+
 Tree hybridLaptop() {
   TreeBuilder builder;
   builder.system().text(PropSystemModel, "LapBook 14");
   addProcessor(builder, "P0", {"Mobile CPU 6", 6, 8, 4700});
-  builder.core("P0.C0").cpus({0, 1});
-  builder.core("P0.C4").cpus({2, 3});
+  builder.core("P0.C0").description("Performance core 0").cpus({0, 1});
+  builder.core("P0.C4").description("Performance core 4").cpus({2, 3});
   for (unsigned int i = 0; i < 4; ++i) {
-    builder.core("P0.C" + std::to_string(8 + i)).cpus({4 + i});
+    const std::string number = std::to_string(8 + i);
+    builder.core("P0.C" + number).description("Efficient core " + number).cpus({4 + i});
   }
   for (unsigned int i = 0; i < 2; ++i) {
     const std::string number = std::to_string(4 * i);

@@ -13,6 +13,9 @@ Tarn::Inventory::Tree twoCoreMachine();
 /// Two processors with 64 cores and 128 threads each; every 8 cores share an L3.
 Tarn::Inventory::Tree dualSocketServer();
 
+/// Two processors with four cores; the first lies in the NUMA nodes 0 and 1, of which each has an L3, the second in 2.
+Tarn::Inventory::Tree numaServer();
+
 /// Two big cores with two threads each, and four small ones that share an L2.
 Tarn::Inventory::Tree hybridLaptop();
 

@@ -93,6 +93,19 @@ TEST(Options, ReferencesTakeTheAssociationClassByEitherOption) {
             "rin: no option '-arr': a reference has no far end; usage: corvcim [OPTION...] rin PATH");
 }
 
+TEST(Options, ColumnsAreAListOfPropertiesForTablesAndCsv) {
+  const Options options = parse({"ein", "HALDA_CPUMemory", "-o", "csv", "--columns", "DeviceID,SystemName"});
+
+  EXPECT_TRUE(options.hasPropertyList);
+  EXPECT_THAT(options.properties, ElementsAre("DeviceID", "SystemName"));
+  EXPECT_EQ(complaint({"ei", "A", "--columns", "B"}),
+            "'--columns' is for '-o table' and '-o csv'; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"tree", "--columns", "B"}),
+            "tree takes no option '--columns': its output has no columns; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"ei", "A", "B", "-o", "table", "--columns", "C"}),
+            "ei: '--columns' and 'B' both name the columns; usage: corvcim [OPTION...] ei CLASS [PROPERTY,...]");
+}
+
 TEST(Options, TwoDashesEndThem) {
   EXPECT_EQ(parse({"ein", "--", "-strange"}).operand(0), "-strange");
 }
@@ -111,7 +124,7 @@ TEST(Options, UnknownWordsAreNamed) {
   EXPECT_EQ(complaint({"--colour"}), "unknown option '--colour'; see 'corvcim --help'");
   EXPECT_EQ(complaint({"-x"}), "unknown option '-x'; see 'corvcim --help'");
   EXPECT_EQ(complaint({"-o", "xml", "classes"}),
-            "unknown output format 'xml': it can be text, mof, json, svg or dot; see 'corvcim --help'");
+            "unknown output format 'xml': it can be text, table, csv, mof, json, svg or dot; see 'corvcim --help'");
 }
 
 TEST(Options, MissingAndSurplusWordsAreNamed) {
@@ -126,11 +139,11 @@ TEST(Options, MissingAndSurplusWordsAreNamed) {
 
 TEST(Options, FormatsBelongToVerbs) {
   EXPECT_EQ(complaint({"ei", "A", "-o", "svg"}),
-            "ei has no output format 'svg': it can be text, mof or json; see 'corvcim --help'");
-  EXPECT_EQ(complaint({"tree", "-o", "json"}),
-            "tree has no output format 'json': it can be text, svg or dot; see 'corvcim --help'");
-  EXPECT_EQ(complaint({"-o", "json"}),
-            "the overview has no output format 'json': it can be text; see 'corvcim --help'");
+            "ei has no output format 'svg': it can be text, table, csv, mof or json; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"tree", "-o", "mof"}),
+            "tree has no output format 'mof': it can be text, json, svg or dot; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-o", "csv"}),
+            "the overview has no output format 'csv': it can be text or json; see 'corvcim --help'");
 }
 
 TEST(Options, AssociationOptionsBelongToAssociationVerbs) {
@@ -183,7 +196,7 @@ TEST(Options, OptionsOfOneVerbAreRefusedByTheOthers) {
 
 TEST(Options, LanguagesBelongToText) {
   EXPECT_EQ(complaint({"ei", "A", "--language", "de", "-o", "json"}),
-            "'--language' is for text: mof and json are the same in every language; see 'corvcim --help'");
+            "'--language' is for text: csv, mof and json are the same in every language; see 'corvcim --help'");
 }
 
 TEST(Options, EveryVerbIsFoundByItsName) {

@@ -2,6 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <clocale>
+#include <string>
+
 #include "host/cli/Quantities.h"
 
 namespace Corvcim {
@@ -37,6 +40,48 @@ TEST(Text, LongTextsAreCutAtAWholeCharacter) {
   EXPECT_EQ(shorten("ééééé", 3), "éé…");
   EXPECT_EQ(shorten("abc", 1), "…");
   EXPECT_EQ(shorten("abc", 0), "");
+}
+
+/// A locale's characters, as long as this object lives.
+class CharacterLocale {
+ public:
+  explicit CharacterLocale(const char* name) : before_(std::setlocale(LC_CTYPE, nullptr)) {
+    isThere_ = std::setlocale(LC_CTYPE, name) != nullptr;
+  }
+  ~CharacterLocale() {
+    std::setlocale(LC_CTYPE, before_.c_str());
+    useCharset(Charset::Utf8);
+  }
+  CharacterLocale(const CharacterLocale&) = delete;
+  CharacterLocale& operator=(const CharacterLocale&) = delete;
+
+  bool isThere() const { return isThere_; }
+
+ private:
+  std::string before_;
+  bool isThere_ = false;
+};
+
+TEST(Text, WidthsAreThoseOfTheTerminal) {
+  const CharacterLocale locale("C.UTF-8");
+  ASSERT_TRUE(locale.isThere());
+
+  EXPECT_EQ(columns("漢字"), 4U);
+  EXPECT_EQ(columns("e\u0301"), 1U);
+  EXPECT_EQ(padRight("漢", 4), "漢  ");
+  EXPECT_EQ(shorten("漢字漢字", 6), "漢字…");
+  EXPECT_EQ(shorten("漢字漢字", 5), "漢字…");
+  EXPECT_EQ(shorten("漢字漢字", 4), "漢…");
+}
+
+TEST(Text, AsciiHasASignForEachSignOfTheDrawings) {
+  const CharacterLocale locale("C");
+  useCharset(Charset::Ascii);
+
+  EXPECT_EQ(inCharset("├─ 4 × L2 · a…\n│  └─ b"), "|- 4 x L2 - a~\n|  `- b");
+  EXPECT_EQ(toPrintable("é\n漢\U0001F600\xFF"), "\\u00E9\\n\\u6F22\\U0001F600\\uFFFD");
+  EXPECT_EQ(columns(toPrintable("漢×")), 7U);
+  EXPECT_EQ(inCharset(shorten("abcdef", 4)), "abc~");
 }
 
 TEST(Text, CountsHaveThePluralThatTheyNeed) {

@@ -3,10 +3,14 @@
 #include <gtest/gtest.h>
 
 #include "host/cli/drawing/TreeDot.h"
+#include "host/cli/drawing/TreeJson.h"
+#include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/host/cli/Machines.h"
 
 namespace Corvcim {
 namespace {
+
+using Tarn::Inventory::TreeBuilder;
 
 std::string drawn(const Tarn::Inventory::Tree& tree, std::size_t width = 0) {
   return drawTreeText(readMachine(tree, "host"), width);
@@ -26,13 +30,53 @@ TEST(TreeText, HybridLaptop) {
             "host: LapBook 14\n"
             "└─ processor P0: Mobile CPU 6; 6 cores; 8 threads; up to 4.7 GHz\n"
             "   └─ L3 12 MiB: shared by 6 cores\n"
-            "      ├─ core P0.C0: CPUs 0-1; L2 1.25 MiB, L1d 48 KiB, L1i 32 KiB\n"
-            "      ├─ core P0.C4: CPUs 2-3; L2 1.25 MiB, L1d 48 KiB, L1i 32 KiB\n"
+            "      ├─ P-core P0.C0: CPUs 0-1; L2 1.25 MiB, L1d 48 KiB, L1i 32 KiB\n"
+            "      ├─ P-core P0.C4: CPUs 2-3; L2 1.25 MiB, L1d 48 KiB, L1i 32 KiB\n"
             "      └─ L2 2 MiB: shared by 4 cores\n"
-            "         ├─ core P0.C8: CPU 4; L1d 32 KiB, L1i 64 KiB\n"
-            "         ├─ core P0.C9: CPU 5; L1d 32 KiB, L1i 64 KiB\n"
-            "         ├─ core P0.C10: CPU 6; L1d 32 KiB, L1i 64 KiB\n"
-            "         └─ core P0.C11: CPU 7; L1d 32 KiB, L1i 64 KiB\n");
+            "         ├─ E-core P0.C8: CPU 4; L1d 32 KiB, L1i 64 KiB\n"
+            "         ├─ E-core P0.C9: CPU 5; L1d 32 KiB, L1i 64 KiB\n"
+            "         ├─ E-core P0.C10: CPU 6; L1d 32 KiB, L1i 64 KiB\n"
+            "         └─ E-core P0.C11: CPU 7; L1d 32 KiB, L1i 64 KiB\n");
+}
+
+TEST(TreeText, PartsInOtherNumaNodesThanThoseAroundThemAreLabelled) {
+  EXPECT_EQ(drawn(Testing::numaServer()),
+            "host: RackBox 1U\n"
+            "├─ processor P0: Server CPU 4; 4 cores; 4 threads; up to 3 GHz; NUMA nodes 0, 1\n"
+            "│  ├─ L3 8 MiB: shared by 2 cores; NUMA node 0\n"
+            "│  │  ├─ core P0.C0: CPU 0\n"
+            "│  │  └─ core P0.C2: CPU 2\n"
+            "│  └─ L3 8 MiB: shared by 2 cores; NUMA node 1\n"
+            "│     ├─ core P0.C1: CPU 1\n"
+            "│     └─ core P0.C3: CPU 3\n"
+            "└─ processor P1: Server CPU 4; 4 cores; 4 threads; up to 3 GHz; NUMA node 2\n"
+            "   ├─ L3 8 MiB: shared by 2 cores\n"
+            "   │  ├─ core P1.C0: CPU 4\n"
+            "   │  └─ core P1.C2: CPU 6\n"
+            "   └─ L3 8 MiB: shared by 2 cores\n"
+            "      ├─ core P1.C1: CPU 5\n"
+            "      └─ core P1.C3: CPU 7\n");
+}
+
+TEST(TreeText, RunsOfCoresAreOfOneKindAndOneNumaNode) {
+  TreeBuilder builder;
+  builder.processor("P0").cpus({0});
+  Tarn::Inventory::CpuSet first;
+  Tarn::Inventory::CpuSet second;
+  for (unsigned int i = 0; i < 18; ++i) {
+    const std::string number = std::to_string(i);
+    builder.core("P0.C" + number).description((i < 10 ? "Performance core " : "Efficient core ") + number).cpus({i});
+    (i % 2 == 0 ? first : second).add(i);
+  }
+  builder.numaNode({0, first}).numaNode({1, second});
+
+  EXPECT_EQ(drawn(builder.build()),
+            "host\n"
+            "└─ processor P0: 18 cores; NUMA node 0\n"
+            "   ├─ 5 P-cores P0.C0 to P0.C8: CPUs 0,2,4,6,8; each 1 thread\n"
+            "   ├─ 4 E-cores P0.C10 to P0.C16: CPUs 10,12,14,16; each 1 thread\n"
+            "   ├─ 5 P-cores P0.C1 to P0.C9: CPUs 1,3,5,7,9; NUMA node 1; each 1 thread\n"
+            "   └─ 4 E-cores P0.C11 to P0.C17: CPUs 11,13,15,17; NUMA node 1; each 1 thread\n");
 }
 
 TEST(TreeText, DualSocketServerFitsAScreen) {
@@ -91,6 +135,76 @@ TEST(TreeDot, EachItemIsANodeBelowItsOwner) {
       "  n1 -> n2;\n"
       "  n0 -> n1;\n"
       "}\n");
+}
+
+TEST(TreeJson, NestsPartsAsTheDrawingsDo) {
+  TreeBuilder builder;
+  builder.system().text(Tarn::NodeLexicon::PropSystemModel, "X");
+  builder.processor("P0").cpus({0, 1});
+  builder.core("P0.C0").description("Efficient core 0").cpus({0}).core("P0.C1").cpus({1}).status(12);
+  builder.cache("P0.L3").number(Tarn::NodeLexicon::PropCacheLevel, 5).cpus({0, 1});
+  builder.number(Tarn::NodeLexicon::PropCacheBlockSize, 64).number(Tarn::NodeLexicon::PropCacheNumberOfBlocks, 16);
+  builder.numaNode({0, {0}}).numaNode({1, {1}});
+
+  EXPECT_EQ(drawTreeJson(readMachine(builder.build(), "host")), R"({
+  "system": "host",
+  "model": "X",
+  "processors": [
+    {
+      "path": "P0",
+      "name": null,
+      "status": 1,
+      "cores": 2,
+      "threads": null,
+      "maxClock": null,
+      "numaNodes": [
+        0,
+        1
+      ],
+      "parts": [
+        {
+          "cpus": "0-1",
+          "numaNodes": [
+            0,
+            1
+          ],
+          "caches": [
+            {
+              "name": "L3",
+              "size": 1024,
+              "status": 1
+            }
+          ],
+          "cores": 2,
+          "parts": [
+            {
+              "core": "P0.C0",
+              "kind": "E-core",
+              "status": 1,
+              "cpus": "0",
+              "numaNodes": [
+                0
+              ],
+              "caches": []
+            },
+            {
+              "core": "P0.C1",
+              "kind": null,
+              "status": 12,
+              "cpus": "1",
+              "numaNodes": [
+                1
+              ],
+              "caches": []
+            }
+          ]
+        }
+      ],
+      "otherCaches": []
+    }
+  ]
+}
+)");
 }
 
 }  // namespace

@@ -6,7 +6,8 @@
 #include <string>
 #include <vector>
 
-#include "host/cli/results/JsonBuilder.h"
+#include "host/cli/results/JsonWriter.h"
+#include "host/cli/results/TableWriter.h"
 
 namespace Corvcim {
 namespace {
@@ -246,14 +247,61 @@ TEST(JsonWriter, EveryByteGivesValidJson) {
   EXPECT_EQ(text.find("\uFFFD"), 128U);
 }
 
-TEST(JsonBuilder, NumbersThatJsonCanNotSayAreNull) {
-  JsonBuilder json;
-  json.beginArray();
-  json.number(1.5);
-  json.number(1.0 / 0.0);
-  json.endArray();
+TEST(JsonWriter, NumbersThatJsonDoesNotHaveAreNull) {
+  EXPECT_EQ(jsonLine(valueAsJson(Value::real64(1.5))), "1.5");
+  EXPECT_EQ(jsonLine(valueAsJson(Value::real64(1.0 / 0.0))), "null");
+}
 
-  EXPECT_EQ(json.take(), "[\n  1.5,\n  null\n]\n");
+TEST(JsonWriter, AnEmptyListIsADocument) {
+  EXPECT_EQ(instances(Format::Json, {}), "[]\n");
+}
+
+Instance sample(std::string_view className, std::vector<NamedValue> properties) {
+  return makeInstance("root/cimv2", className, std::move(properties));
+}
+
+TEST(TableWriter, ColumnsAreAlignedUnderTheirNames) {
+  const std::vector<Instance> rows = {
+      sample("HALDA_CPUProcessorCore", {{"InstanceID", Value::string("P0.C0")}, {"HealthState", Value::uint16(5)}}),
+      sample("HALDA_CPUProcessorCore", {{"InstanceID", Value::string("é")}, {"Caption", Value::string("x")}})};
+
+  EXPECT_EQ(rowsAsTable(rows, std::nullopt),
+            "InstanceID  HealthState  Caption\n"
+            "P0.C0       5 (OK)       -\n"
+            "é           -            x\n");
+}
+
+TEST(TableWriter, ListedPropertiesAreTheColumnsInTheirOrderAndTheSpellingOfTheClass) {
+  const std::vector<Instance> rows = {
+      sample("HALDA_CPUProcessorCore", {{"InstanceID", Value::string("P0.C0")}, {"HealthState", Value::uint16(5)}})};
+
+  EXPECT_EQ(rowsAsTable(rows, std::vector<std::string>{"healthSTATE", "instanceid", "Nothing"}),
+            "HealthState  InstanceID  Nothing\n"
+            "5 (OK)       P0.C0       -\n");
+  EXPECT_EQ(rowsAsTable(rows, std::vector<std::string>()), "InstanceID\nP0.C0\n");
+}
+
+TEST(TableWriter, RowsOfSeveralClassesBeginWithTheirClass) {
+  const std::vector<Instance> rows = {sample("HALDA_CPUProcessorCore", {{"InstanceID", Value::string("a")}}),
+                                      sample("HALDA_CPUProcessorCapabilities", {{"InstanceID", Value::string("b")}})};
+
+  EXPECT_EQ(rowsAsCsv(rows, std::nullopt),
+            "Class,InstanceID\r\n"
+            "HALDA_CPUProcessorCore,a\r\n"
+            "HALDA_CPUProcessorCapabilities,b\r\n");
+}
+
+TEST(TableWriter, CsvQuotesWhatRfc4180AsksFor) {
+  EXPECT_EQ(rowsAsCsv(std::vector{everyKind()}, std::nullopt),
+            "Key,EnabledState,HealthState,MaxClockSpeed,Big,Small,Share,Flag,When,Empty,Nothing,OperationalStatus,None,"
+            "Texts,Core,Cores\r\n"
+            "\"k\"\"1\",2,77,2300,18446744073709551615,-5,0.25,true,20240229120000.000000+060,\"\",,\"[2,5]\",[],"
+            "\"[\"\"a,b\"\",\"\"c\\nd\"\"]\",\"root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"\"P0.C1\"\"\","
+            "\"[\"\"root/cimv2:HALDA_CPUProcessorCore.InstanceID=\\\"\"a\\\"\"\"\","
+            "\"\"root/cimv2:HALDA_CPUProcessorCore.InstanceID=\\\"\"b\\\"\"\"\"]\"\r\n");
+  EXPECT_EQ(
+      rowsAsCsv(std::vector{sample("X", {{"A", Value::string("1\r\n2")}, {"B", Value::string("\xFF")}})}, std::nullopt),
+      "A,B\r\n\"1\r\n2\",\uFFFD\r\n");
 }
 
 }  // namespace
