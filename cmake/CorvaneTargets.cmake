@@ -23,11 +23,13 @@ target_compile_definitions(corvane_options INTERFACE _FILE_OFFSET_BITS=64)
 target_include_directories(corvane_options INTERFACE ${PROJECT_SOURCE_DIR})
 
 if(CORVANE_SANITIZE)
-  target_compile_options(corvane_options INTERFACE
-    -fsanitize=${CORVANE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer
-    # Optimizing what the sanitizers add takes most of the compile time, and the tests are small.
-    -O0 -g1)
-  target_link_options(corvane_options INTERFACE -fsanitize=${CORVANE_SANITIZE})
+  # Before every target's own options, so that these can take something back.
+  set(sanitizers "-fsanitize=${CORVANE_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer")
+  string(APPEND CMAKE_C_FLAGS " ${sanitizers}")
+  string(APPEND CMAKE_CXX_FLAGS " ${sanitizers}")
+  # The least time for compiling and running together. Reports name functions from the symbol table.
+  set(CMAKE_C_FLAGS_RELEASE "-Og")
+  set(CMAKE_CXX_FLAGS_RELEASE "-Og")
 endif()
 
 if(CORVANE_FUZZ)

@@ -4,8 +4,8 @@
 #include <link.h>
 
 #include <cstring>
+#include <filesystem>
 #include <fstream>
-#include <iterator>
 #include <stdexcept>
 
 namespace Library {
@@ -16,8 +16,8 @@ namespace {
 class Bytes {
  public:
   explicit Bytes(const std::string& path) {
-    std::ifstream file(path, std::ios::binary);
-    bytes_.assign(std::istreambuf_iterator<char>(file), {});
+    bytes_.resize(std::filesystem::file_size(path));
+    std::ifstream(path, std::ios::binary).read(bytes_.data(), static_cast<std::streamsize>(bytes_.size()));
   }
 
   template <class T>
