@@ -1,7 +1,9 @@
 # What the brokers' parts of corvcpu-register share. Sourced, not run.
 #
-# Paths in variables and records are those inside $root; "$root$path" is the file.
-# shellcheck shell=sh disable=SC2034,SC2154
+# Paths in variables are those inside $root; "$root$path" is the file. What is registered is read from
+# the broker's own files, so that a registration made by hand counts, and one taken away by hand does not.
+# Lists are words: no path or name in them has blanks.
+# shellcheck shell=sh disable=SC2034,SC2046,SC2086,SC2154
 
 libraries='corvcpuprofileprovider corvcomputersystemprovider'
 namespace=root/cimv2
@@ -83,91 +85,65 @@ find_libraries() {
   done
 }
 
-# record_of KIND: the list of what was done to a broker, one "kind value..." a line.
-record_of() { printf '/var/lib/corvane/%s.record\n' "$1"; }
-
-# recorded KIND WORD...: the record's lines with this first word, without it.
-recorded() {
-  file=$root$(record_of "$1")
-  [ ! -f "$file" ] || sed -n "s|^$2 ||p" "$file"
-}
-
-is_recorded() { [ -f "$root$(record_of "$1")" ] && grep -qxF "$2" "$root$(record_of "$1")"; }
-
-# record KIND LINE: remembered once. Written before the step it tells of, so that an interrupted
-# installation can be completed or taken back.
-record() {
-  if $dry_run || is_recorded "$1" "$2"; then return 0; fi
-  mkdir -p "$root/var/lib/corvane"
-  printf '%s\n' "$2" >>"$root$(record_of "$1")"
-}
-
-forget() {
-  if $dry_run; then return 0; fi
-  rm -f "$root$(record_of "$1")"
-  rmdir "$root/var/lib/corvane" 2>/dev/null || :
-}
-
-# make_directory KIND PATH: with those above it, each remembered.
-make_directory() {
-  [ ! -d "$root$2" ] || return 0
-  make_directory "$1" "$(dirname "$2")"
-  record "$1" "directory $2"
-  $dry_run || mkdir "$root$2"
-}
-
-# put KIND SOURCE TARGET: copies a file unless it is there already.
-put() {
-  make_directory "$1" "$(dirname "$3")"
-  if cmp -s "$root$2" "$root$3"; then
-    record "$1" "file $3"
-    return 0
-  fi
-  changed=true
-  record "$1" "file $3"
-  step "copy $2 to $3" copy_file "$root$2" "$root$3"
-}
-
 # A reader never sees half a file.
 copy_file() {
+  mkdir -p "$(dirname "$2")"
   cp "$1" "$2.new"
   chmod 644 "$2.new"
   mv "$2.new" "$2"
 }
 
-# link_libraries KIND DIRECTORY: what a broker finds by exactly lib<location>.so in its own directory.
+# our_links DIRECTORY...: the links to a provider library by which a broker finds it as lib<location>.so.
+our_links() {
+  for directory; do
+    for library in $libraries; do
+      case $(readlink "$root$directory/lib$library.so" || :) in
+        /*"/cmpi/lib$library.so") printf '%s\n' "$directory/lib$library.so" ;;
+      esac
+    done
+  done
+}
+
+unlink_libraries() {
+  for link in $(our_links "$@"); do
+    step "remove $link" rm "$root$link"
+  done
+}
+
+# link_libraries DIRECTORY: unless it is where the libraries lie.
 link_libraries() {
-  [ "$2" != "$library_directory" ] || return 0
+  [ "$1" != "$library_directory" ] || return 0
   for library in $libraries; do
     target=$library_directory/lib$library.so
-    link=$2/lib$library.so
+    link=$1/lib$library.so
     [ "$(readlink "$root$link" || :)" != "$target" ] || continue
-    changed=true
-    record "$1" "link $link"
     step "link $link to $target" ln -sfn "$target" "$root$link"
   done
 }
 
-# check_links KIND DIRECTORY: a file of that name that is not ours is not overwritten.
+# check_links DIRECTORY: a file of that name that is not ours is not overwritten.
 check_links() {
-  [ "$2" != "$library_directory" ] || return 0
-  need_writable "$2"
+  [ "$1" != "$library_directory" ] || return 0
+  need_writable "$1"
   for library in $libraries; do
-    link=$2/lib$library.so
-    if [ -e "$root$link" ] || [ -L "$root$link" ]; then
-      [ "$(readlink "$root$link" || :)" = "$library_directory/lib$library.so" ] || is_recorded "$1" "link $link" ||
-        fail "$root$link exists and was not put there by this program; move it away"
+    link=$1/lib$library.so
+    if [ -e "$root$link" ] && ! is_listed "$link" $(our_links "$1"); then
+      fail "$root$link exists and was not put there by this program; move it away"
     fi
   done
 }
 
-# missing KIND: the first recorded file or link that is not there, or leads nowhere.
-missing() {
-  for path in $(recorded "$1" file); do
-    [ -f "$root$path" ] || { say "$path" && return 0; }
-  done
-  for path in $(recorded "$1" link); do
-    { [ -L "$root$path" ] && [ -f "$root$(readlink "$root$path")" ]; } || { say "$path" && return 0; }
+# missing_library DIRECTORY...: the first library that none of them has.
+missing_library() {
+  for library in $libraries; do
+    found=false
+    for directory; do
+      # A link leads to a path inside $root.
+      file=$(readlink "$root$directory/lib$library.so" || :)
+      case $file in /*) ;; *) file=$directory/lib$library.so ;; esac
+      [ ! -f "$root$file" ] || found=true
+    done
+    $found || { say "lib$library.so" && return 0; }
   done
   return 1
 }
@@ -182,28 +158,65 @@ is_listed() {
   return 1
 }
 
-# take_back KIND: removes recorded links, files and the directories that are empty then. Files whose
-# path stands in $kept stay.
-take_back() {
-  for link in $(recorded "$1" link); do
-    [ ! -L "$root$link" ] || step "remove $link" rm "$root$link"
-  done
-  for file in $(recorded "$1" file); do
-    # shellcheck disable=SC2086
-    if is_listed "$file" ${kept:-}; then continue; fi
-    [ ! -f "$root$file" ] || step "remove $file" rm "$root$file"
-  done
-  recorded "$1" directory | sort -r | while read -r directory; do
-    $dry_run || rmdir "$root$directory" 2>/dev/null || :
-  done
-}
-
 # classes_of MOF: the classes that a file declares; parents_of MOF: what they are derived from.
 classes_of() { sed -n 's/^class \([A-Za-z_]*\) : .*/\1/p' "$root$1"; }
 parents_of() { sed -n 's/^class [A-Za-z_]* : \([A-Za-z_]*\).*/\1/p' "$root$1" | sort -u; }
 
 check_product() {
-  for file in schema/corvane-cpu.mof schema/corvane-computersystem.mof "$@"; do
-    need_file "$data/$file" "half an installation" "install the provider package again"
+  for unit in corvane-computersystem corvane-cpu; do
+    for file in schema/$unit.mof sfcb/$unit.reg pegasus/$unit.mof; do
+      need_file "$data/$file" "half an installation" "install the provider package again"
+    done
   done
+}
+
+# look KIND: sets $owner, what other agent has HALDA_ComputerSystem, and $units, what is registered beside it.
+look() {
+  units='corvane-computersystem corvane-cpu'
+  ! owner=$("$1_owner" "$system_class") || units=corvane-cpu
+}
+
+status() {
+  if ! "$1_is_registered"; then
+    say "$1: not registered"
+    return 3
+  fi
+  look "$1"
+  problem=$("$1_problem" $units)
+  if [ -n "$problem" ]; then
+    say "$1: incomplete, $problem; run corvcpu-register install"
+    return 1
+  fi
+  say "$1: registered, with${owner:+out} $system_class${owner:+, which is left to its agent}"
+}
+
+check_install() {
+  check_product
+  "$1_check_tools" install
+  for class in $(classes_of "$data/schema/corvane-cpu.mof"); do
+    ! owner=$("$1_owner" "$class") ||
+      fail "$class belongs to another agent: $owner names it; remove that agent's registration first"
+  done
+  look "$1"
+  "$1_check_install"
+}
+
+install() {
+  look "$1"
+  [ -z "$owner" ] || say "leave $system_class to its agent ($owner)"
+  "$1_install"
+  $dry_run || status "$1"
+}
+
+check_remove() { ! "$1_is_registered" || "$1_check_tools" remove; }
+
+remove() {
+  if ! "$1_is_registered"; then
+    say "$1: not registered; nothing to remove"
+    return 0
+  fi
+  look "$1"
+  [ -z "$owner" ] || say "leave $system_class to its agent ($owner)"
+  "$1_remove"
+  $dry_run || status "$1" || [ $? -eq 3 ]
 }

@@ -1,5 +1,5 @@
 # SFCB: files in its staging directory, from which sfcbrepos builds the repository. Sourced, not run.
-# shellcheck shell=sh disable=SC2154
+# shellcheck shell=sh disable=SC2046,SC2086,SC2154
 
 sfcb_find() {
   for sfcb_layout in /usr:/etc:/var /usr/local:/usr/local/etc:/usr/local/var /opt/sfcb:/opt/sfcb/etc:/opt/sfcb/var; do
@@ -10,8 +10,7 @@ sfcb_find() {
     sfcb_daemon=$(first_of -f "$sfcb_prefix/sbin/sfcbd" "$sfcb_prefix/bin/sfcbd") || sfcb_daemon=
     if [ -f "$root$sfcb_config" ] || [ -n "$sfcb_daemon" ] || [ -d "$root$sfcb_state" ]; then
       sfcb_stage=$sfcb_state/stage
-      sfcb_mofs=$sfcb_stage/mofs/$namespace
-      sfcb_regs=$sfcb_stage/regs
+      sfcb_registration=$sfcb_state/registration
       return 0
     fi
   done
@@ -22,26 +21,50 @@ sfcb_check_tools() {
   advice="install the broker completely first"
   need_file "$sfcb_config" "SFCB is there by half" "$advice"
   need_directory "$sfcb_stage" "SFCB is there by half" "$advice"
+  need_directory "$sfcb_registration" "SFCB is there by half" "$advice"
   [ -n "$sfcb_daemon" ] || fail "SFCB is there by half: no sfcbd in $root$sfcb_prefix/sbin; $advice"
   sfcb_repos=$(first_of -x "$sfcb_prefix/bin/sfcbrepos" "$sfcb_prefix/sbin/sfcbrepos") ||
     fail "SFCB is there by half: no sfcbrepos in $root$sfcb_prefix/bin; $advice"
-  # The tool names the directory of the DMTF schema where it is a script.
-  sfcb_schema=$(sed -n 's|^schemadir=\(/[^ $]*\)$|\1|p' "$root$sfcb_repos" | head -n 1)
-  [ -z "$sfcb_schema" ] || need_directory "$sfcb_schema" "SFCB has no DMTF schema" "install it, then run this again"
-  need_writable "$sfcb_mofs"
-  need_writable "$sfcb_regs"
-  need_writable /var/lib/corvane
+  # The tool is a script that names the directory of the DMTF schema.
+  # shellcheck disable=SC2016
+  sfcb_schema=$(sed -n 's|^[[:blank:]]*cimschemadir=\(${DESTDIR}\)*\(/[^ $]*\)$|\2|p' "$root$sfcb_repos" | head -n 1)
+  [ -z "$sfcb_schema" ] ||
+    need_file "$sfcb_schema/CIM_Schema.mof" "SFCB has no DMTF schema" "install it, then run this again"
+  need_writable "$sfcb_stage"
+  need_writable "$sfcb_registration"
 }
 
-# sfcb_others PATTERN FILE...: the first file that has the pattern and is not of this product.
+# sfcb_files UNIT...: seen from the staging directory.
+sfcb_files() {
+  for unit; do
+    printf '%s\n' "mofs/$namespace/$unit.mof" "regs/$unit.reg"
+  done
+}
+
+# What a staged file is a copy of.
+sfcb_source() {
+  case $1 in *.mof) printf '%s\n' "$data/schema/${1##*/}" ;; *) printf '%s\n' "$data/sfcb/${1##*/}" ;; esac
+}
+
+# sfcbstage pipes a MOF file through a preprocessor that drops its comments.
+without_comments() { sed -e '/^\/\//d' -e '/^$/d' "$1"; }
+same_texts() { [ "$(without_comments "$1")" = "$(without_comments "$2")" ]; }
+
+sfcb_all_files() { sfcb_files corvane-computersystem corvane-cpu; }
+
+# The staged files of this product, of whatever version and by whomever they were staged.
+sfcb_staged() {
+  for file in $(sfcb_all_files); do
+    ! grep -qsE '^class HALDA_|location:[[:blank:]]*corvc' "$root$sfcb_stage/$file" || printf '%s\n' "$file"
+  done
+}
+
+# sfcb_others PATTERN FILE...: the first file that has the pattern and has no name of this product's.
 sfcb_others() {
   pattern=$1
   shift
   for path; do
-    case $path in
-      */corvane-cpu.reg | */corvane-computersystem.reg | */corvane-cpu.mof | */corvane-computersystem.mof) continue ;;
-    esac
-    if [ -f "$path" ] && grep -qiE "$pattern" "$path"; then
+    if ! is_listed "${path#"$root$sfcb_stage/"}" $(sfcb_all_files) && grep -qsiE "$pattern" "$path"; then
       printf '%s\n' "$path"
       return 0
     fi
@@ -49,132 +72,131 @@ sfcb_others() {
   return 1
 }
 
-# sfcb_owner CLASS: the file by which another agent serves or declares the class.
-sfcb_owner() {
-  sfcb_others "^[[:blank:]]*\[$1\]" "$root$sfcb_regs"/* || sfcb_others "^[[:blank:]]*class[[:blank:]]+$1([[:blank:]:{]|$)" "$root$sfcb_mofs"/*
+sfcb_registers() { sfcb_others "^[[:blank:]]*\[$1\]" "$root$sfcb_stage"/regs/*; }
+sfcb_declares() { sfcb_others "^[[:blank:]]*class[[:blank:]]+$1([[:blank:]:{]|$)" "$root$sfcb_stage/mofs/$namespace"/*; }
+
+# sfcb_built CLASS: the locations that serve the class in the registration that was built.
+sfcb_built() {
+  [ ! -f "$root$sfcb_registration/providerRegister" ] ||
+    awk -v class="[$1]" '/^[ \t]*\[/ { on = tolower($1) == tolower(class) } on && $1 == "location:" { print $2 }' \
+      "$root$sfcb_registration/providerRegister"
 }
 
-# Providers that were written into the built registration without being staged.
-sfcb_owner_built() {
-  is_recorded sfcb "file $sfcb_regs/corvane-computersystem.reg" ||
-    sfcb_others "^[[:blank:]]*\[$1\]" "$root$sfcb_state/registration/providerRegister"
+# sfcb_owner CLASS: the file by which another agent serves or declares the class, staged or not.
+sfcb_owner() {
+  if sfcb_registers "$1" || sfcb_declares "$1"; then return 0; fi
+  for location in $(sfcb_built "$1"); do
+    is_listed "$location" $libraries || { printf '%s\n' "$root$sfcb_registration/providerRegister" && return 0; }
+  done
+  return 1
 }
 
 sfcb_provider_directories() {
-  sed -n 's/^[[:blank:]]*providerDirs[[:blank:]]*:[[:blank:]]*//p' "$root$sfcb_config" | head -n 1
+  sed -n 's/^[[:blank:]]*providerDirs[[:blank:]]*:[[:blank:]]*//p' "$root$sfcb_config" | tail -n 1
 }
 
-# Sets what install goes by: $sfcb_units, $sfcb_links.
+# Sets $sfcb_links, the directory that the libraries are linked into.
 sfcb_check_install() {
-  check_product sfcb/corvane-cpu.reg sfcb/corvane-computersystem.reg
-  sfcb_check_tools
   find_libraries "$sfcb_daemon"
-  for class in $(classes_of "$data/schema/corvane-cpu.mof"); do
-    if owner=$(sfcb_owner "$class"); then
-      fail "$class belongs to another agent: $owner names it; remove that agent's registration first"
-    fi
-  done
-  sfcb_units='corvane-computersystem corvane-cpu'
-  sfcb_system_owner=$(sfcb_owner "$system_class" || sfcb_owner_built "$system_class") || sfcb_system_owner=
-  [ -z "$sfcb_system_owner" ] || sfcb_units=corvane-cpu
-  for unit in $sfcb_units; do
-    sfcb_check_place "$sfcb_mofs/$unit.mof" "$data/schema/$unit.mof"
-    sfcb_check_place "$sfcb_regs/$unit.reg" "$data/sfcb/$unit.reg"
+  for file in $(sfcb_all_files); do
+    [ ! -e "$root$sfcb_stage/$file" ] || is_listed "$file" $(sfcb_staged) ||
+      fail "$root$sfcb_stage/$file exists and is not of this product; move it away"
   done
   sfcb_directories=$(sfcb_provider_directories)
   [ -n "$sfcb_directories" ] || fail "$root$sfcb_config has no line \"providerDirs:\"; give it one with $library_directory"
   sfcb_links=$library_directory
-  # shellcheck disable=SC2086
   if ! is_listed "$library_directory" $sfcb_directories; then
     sfcb_links=$(first_of -d $sfcb_directories) ||
       fail "none of the directories of \"providerDirs:\" in $root$sfcb_config exists; add $library_directory to the line"
-    check_links sfcb "$sfcb_links"
+    check_links "$sfcb_links"
   fi
 }
 
-# A staged file of our name is ours by record or by content.
-sfcb_check_place() {
-  [ ! -e "$root$1" ] || is_recorded sfcb "file $1" || cmp -s "$root$1" "$root$2" ||
-    fail "$root$1 exists and was not staged by this program; move it away"
+# sfcb_problem UNIT...: what their registration lacks; nothing if it is complete.
+sfcb_problem() {
+  for file in $(sfcb_files "$@"); do
+    [ -f "$root$sfcb_stage/$file" ] || { say "$sfcb_stage/$file is missing" && return; }
+    same_texts "$root$sfcb_stage/$file" "$root$(sfcb_source "$file")" ||
+      { say "$sfcb_stage/$file is that of another version" && return; }
+  done
+  for unit; do
+    for class in $(classes_of "$data/schema/$unit.mof"); do
+      { [ -n "$(sfcb_built "$class")" ] &&
+        grep -qs "$class" "$root$sfcb_registration/repository/$namespace"/classSchemas*; } ||
+        { say "sfcbrepos has not run" && return; }
+    done
+  done
+  ! library=$(missing_library $(sfcb_provider_directories)) || say "no directory of \"providerDirs:\" has $library"
 }
 
-sfcb_rebuild() {
-  step "run sfcbrepos" "$root$sfcb_repos" -f -s "$root$sfcb_stage" -r "$root$sfcb_state/registration"
+# sfcb_restage RUN STAGE: RUN is "step", or "quietly" for the copy of the staging directory.
+sfcb_restage() {
+  for file in $sfcb_add; do
+    "$1" "copy $(sfcb_source "$file") to $sfcb_stage/$file" copy_file "$root$(sfcb_source "$file")" "$2/$file"
+  done
+  for file in $sfcb_drop; do
+    "$1" "remove $sfcb_stage/$file" rm "$2/$file"
+  done
 }
+
+quietly() {
+  shift
+  "$@"
+}
+
+# sfcbrepos leaves an empty repository if it fails. So it works on copies, which replace the repository
+# only if it succeeds; the staging directory is the last to change.
+sfcb_rebuild() {
+  work=$root$sfcb_registration/corvane.new
+  rm -rf "$work"
+  mkdir "$work"
+  cp -a "$root$sfcb_stage" "$work/stage"
+  for part in repository providerRegister; do
+    [ ! -e "$root$sfcb_registration/$part" ] || cp -a "$root$sfcb_registration/$part" "$work"
+  done
+  sfcb_restage quietly "$work/stage"
+  if ! DESTDIR=$root "$root$sfcb_repos" -f -s "$work/stage" -r "$work"; then
+    rm -rf "$work"
+    fail "sfcbrepos failed, see above; nothing was changed. Repair what it complains about, then run this again"
+  fi
+  for part in repository providerRegister; do
+    rm -rf "$root$sfcb_registration/$part.previous"
+    [ ! -e "$root$sfcb_registration/$part" ] ||
+      mv "$root$sfcb_registration/$part" "$root$sfcb_registration/$part.previous"
+    mv "$work/$part" "$root$sfcb_registration/$part"
+  done
+  rm -rf "$work"
+}
+
+sfcb_change() {
+  step "build the repository with sfcbrepos" sfcb_rebuild
+  sfcb_restage step "$root$sfcb_stage"
+}
+
+sfcb_say_restart() { $dry_run || say "sfcb: restart sfcbd, which still works by the old registration"; }
 
 sfcb_install() {
-  changed=false
-  fresh=true
-  [ ! -f "$root$(record_of sfcb)" ] || fresh=false
-  # Whatever an interrupted run left staged still has to be built.
-  $fresh || ! is_recorded sfcb unfinished || changed=true
-  link_libraries sfcb "$sfcb_links"
-  for unit in $sfcb_units; do
-    put sfcb "$data/schema/$unit.mof" "$sfcb_mofs/$unit.mof"
-    put sfcb "$data/sfcb/$unit.reg" "$sfcb_regs/$unit.reg"
-  done
-  [ -z "$sfcb_system_owner" ] || say "leave $system_class to its agent ($sfcb_system_owner)"
-  if ! $changed; then
-    say "sfcb: registered already"
-    return 0
-  fi
-  record sfcb unfinished
-  if ! sfcb_rebuild; then
-    if $fresh; then
-      take_back sfcb
-      forget sfcb
-      fail "sfcbrepos failed, see above; everything was taken back. Repair SFCB's schema, then run this again"
-    fi
-    fail "sfcbrepos failed, see above; repair SFCB's schema, then run this again"
-  fi
-  $dry_run || sed -i '/^unfinished$/d' "$root$(record_of sfcb)"
-  sfcb_say_end registered
+  [ -n "$(sfcb_problem $units)" ] || return 0
+  sfcb_add=$(sfcb_files $units)
+  sfcb_drop=
+  sfcb_change
+  link_libraries "$sfcb_links"
+  sfcb_say_restart
 }
 
-sfcb_say_end() {
-  if $dry_run; then return 0; fi
-  say "sfcb: $1; restart sfcbd to make it count"
-}
-
-sfcb_check_remove() {
-  [ -f "$root$(record_of sfcb)" ] || return 0
-  sfcb_check_tools
+sfcb_is_registered() {
+  sfcb_staged | grep -qv computersystem.mof ||
+    grep -qsE '^[[:blank:]]*location:[[:blank:]]*corvc' "$root$sfcb_registration/providerRegister"
 }
 
 sfcb_remove() {
-  if [ ! -f "$root$(record_of sfcb)" ]; then
-    say "sfcb: not registered by this program; nothing to remove"
-    return 0
-  fi
-  kept=
+  sfcb_add=
+  sfcb_drop=$(sfcb_staged)
   # An agent that registers the class without a declaration of its own needs ours.
-  if sfcb_others "^[[:blank:]]*\[$system_class\]" "$root$sfcb_regs"/* >/dev/null &&
-    ! sfcb_others "^[[:blank:]]*class[[:blank:]]+$system_class([[:blank:]:{]|$)" "$root$sfcb_mofs"/* >/dev/null; then
-    kept=$sfcb_mofs/corvane-computersystem.mof
-    say "leave $kept to the agent that registered $system_class"
+  if sfcb_registers "$system_class" >/dev/null && ! sfcb_declares "$system_class" >/dev/null; then
+    sfcb_drop=$(sfcb_staged | grep -v computersystem.mof)
   fi
-  take_back sfcb
-  forget sfcb
-  sfcb_rebuild || fail "sfcbrepos failed, see above; the files are removed. Run sfcbrepos -f once it is repaired"
-  sfcb_say_end removed
-}
-
-sfcb_status() {
-  if [ ! -f "$root$(record_of sfcb)" ]; then
-    say "sfcb: not registered"
-    return 3
-  fi
-  if lost=$(missing sfcb); then
-    say "sfcb: incomplete, $lost is missing; run corvcpu-register install"
-    return 1
-  fi
-  if is_recorded sfcb unfinished; then
-    say "sfcb: incomplete, sfcbrepos has not run; run corvcpu-register install"
-    return 1
-  fi
-  if is_recorded sfcb "file $sfcb_regs/corvane-computersystem.reg"; then
-    say "sfcb: registered, with $system_class"
-  else
-    say "sfcb: registered, without $system_class, which is left to its agent"
-  fi
+  sfcb_change
+  unlink_libraries $(sfcb_provider_directories)
+  sfcb_say_restart
 }

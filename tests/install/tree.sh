@@ -2,24 +2,13 @@
 # scripts/check-packages.
 # shellcheck shell=bash disable=SC2154
 
+install_tests=${BASH_SOURCE[0]%/*}
+
 # elf FILE CLASS: the first bytes of a program of 32 (1) or 64 (2) bits.
 elf() {
   mkdir -p "${1%/*}"
   printf '\177ELF%b\001\001' "\\00$2" >"$1"
   chmod +x "$1"
-}
-
-# tool FILE [LINE...]: a program that records its call and goes on with these lines.
-tool() {
-  local file=$1
-  shift
-  mkdir -p "${file%/*}"
-  # shellcheck disable=SC2016
-  {
-    printf '#!/bin/sh\ncalls=%s\ntree=%s\n' "$tree/calls" "$tree"
-    printf '%s\n' 'echo "${0##*/} $*" | sed "s|$tree/|/|g" >>"$calls"' "$@"
-  } >"$file"
-  chmod +x "$file"
 }
 
 product() {
@@ -36,39 +25,50 @@ product() {
   done
 }
 
-# sfcb [CLASS]: a broker whose configuration names a provider directory of its own.
-sfcb() {
-  elf "$tree/usr/sbin/sfcbd" "${1:-2}"
-  # shellcheck disable=SC2016
-  tool "$tree/usr/bin/sfcbrepos" 'test ! -e "$tree/broken"'
-  mkdir -p "$tree/etc/sfcb" "$tree/var/lib/sfcb/stage/mofs" "$tree/var/lib/sfcb/stage/regs" \
-    "$tree/var/lib/sfcb/registration" "$tree/usr/lib/sfcb"
-  printf 'httpPort: 5988\nproviderDirs: /usr/lib/sfcb /usr/lib\n' >"$tree/etc/sfcb/sfcb.cfg"
-  printf '[CIM_IndicationFilter]\n   provider: x\n' >"$tree/var/lib/sfcb/stage/regs/default.reg"
+# captured BROKER: the files and directories of a real one; files without content are empty.
+captured() {
+  local path
+  while read -r path; do
+    case $path in
+      '#'*) ;;
+      */) mkdir -p "$tree/$path" ;;
+      *) mkdir -p "$tree/${path%/*}" && : >"$tree/$path" ;;
+    esac
+  done <"$install_tests/captured/$1.files"
+  cp -r "$install_tests/captured/$1/." "$tree"
 }
 
-# What a running OpenPegasus does to its repository: cimmof makes class files, cimcli takes them away.
-pegasus() {
-  local state=$tree/var/lib/Pegasus class
-  local classes=$state/repository/root#cimv2/classes
-  elf "$tree/usr/sbin/cimserver" 2
-  mkdir -p "$classes" "$state/repository/root#PG_InterOp" "$tree/etc/Pegasus" "$tree/usr/lib/Pegasus/providers"
-  for class in Processor ProcessorCore Memory ProcessorCapabilities ComputerSystem AssociatedCacheMemory SystemDevice \
-    ElementCapabilities ConcreteComponent; do
-    : >"$classes/CIM_$class.CIM_Parent"
+# put_tools DIRECTORY TOOL...
+put_tools() {
+  local tool
+  export tree tools=$install_tests/tools
+  for tool in "${@:2}"; do
+    ln -sf "$tools/${tool/%mofl/mof}" "$tree/$1/$tool"
   done
-  # shellcheck disable=SC2016
-  local compile='for file; do :; done
-test ! -e "$tree/broken" || exit 4
-for class in $(sed -n "s/^class \([A-Za-z_]*\) .*/\1/p" "$file"); do : >"'$classes'/$class.CIM_Parent"; done
-sed -n "/PG_ProviderModule /,/^}/s/^   Name = \"\(.*\)\";/\1/p" "$file" >>"$tree/modules"'
-  tool "$tree/usr/bin/cimmof" "$compile"
-  tool "$tree/usr/bin/cimmofl" "$compile"
-  # shellcheck disable=SC2016
-  tool "$tree/usr/bin/cimprovider" 'test ! -e "$tree/stopped" || exit 1
-case $1 in -l) cat "$tree/modules" ;; -r) sed -i "/^$3\$/d" "$tree/modules" ;; esac'
-  # shellcheck disable=SC2016
-  tool "$tree/usr/bin/cimcli" 'case $1 in ei) cat "$tree/capabilities" ;; dc) rm "'"$classes"'/$2".* ;; esac'
-  : >"$tree/modules"
-  : >"$tree/capabilities"
+}
+
+# sfcb [CLASS]: 1 for one of 32 bits.
+sfcb() {
+  captured sfcb
+  elf "$tree/usr/sbin/sfcbd" "${1:-2}"
+  put_tools usr/bin sfcbrepos sfcbstage
+  cp "$tree/var/lib/sfcb/stage/default.reg" "$tree/var/lib/sfcb/registration/providerRegister"
+}
+
+# An OpenPegasus that runs where it was built.
+pegasus() {
+  captured pegasus
+  elf "$tree/opt/pegasus/bin/cimserver" 2
+  put_tools opt/pegasus/bin cimmof cimmofl cimprovider cimcli
+}
+
+# The same one, laid out as distributions package it.
+packaged_pegasus() {
+  pegasus
+  mkdir -p "$tree/var/lib/Pegasus" "$tree/etc/Pegasus" "$tree/usr/lib/Pegasus/providers"
+  mv "$tree/opt/pegasus/repository" "$tree/var/lib/Pegasus"
+  mv "$tree/opt/pegasus/bin/cimserver" "$tree/usr/sbin"
+  mkdir -p "$tree/usr/bin"
+  mv "$tree"/opt/pegasus/bin/* "$tree/usr/bin"
+  rm -r "$tree/opt"
 }
