@@ -27,7 +27,8 @@ set(CPACK_DEBIAN_PACKAGE_SECTION admin)
 set(CPACK_DEBIAN_PACKAGE_DEPENDS "libc6 (>= 2.34), libgcc-s1 (>= 3.3.1), libstdc++6 (>= 12)")
 
 set(CPACK_DEBIAN_PROVIDER_PACKAGE_NAME corvane-cpu-provider)
-set(CPACK_DEBIAN_PROVIDER_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/packaging/debian/conffiles)
+set(CPACK_DEBIAN_PROVIDER_PACKAGE_CONTROL_EXTRA
+  ${PROJECT_SOURCE_DIR}/packaging/debian/conffiles ${PROJECT_SOURCE_DIR}/packaging/debian/postinst)
 
 set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME corvane-cpu-tools)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS

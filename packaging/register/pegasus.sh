@@ -92,18 +92,16 @@ pegasus_servers() {
     { position += length($0) + 1 }' "$file.idx" "$file.instances"
 }
 
-# pegasus_owner CLASS: by what another agent has it. The computer system may be an agent's without being served,
-# unless its registration or the record says that it is ours.
+# pegasus_owner CLASS: the other agent's module that serves it. A declaration of the computer system without our
+# description is another agent's, too.
 pegasus_owner() {
   for module in $(pegasus_servers "$1"); do
     is_listed "$module" $(pegasus_modules corvane-computersystem corvane-cpu) || { say "module $module" && return 0; }
   done
-  if [ "$1" = "$system_class" ] && pegasus_has_class "$1" && ! pegasus_has_module "$(pegasus_modules corvane-computersystem)" &&
-    ! grep -qs '/corvane-computersystem\.mof$' "$root$pegasus_record"; then
-    say "$root$pegasus_repository"
-    return 0
-  fi
-  return 1
+  [ "$1" = "$system_class" ] && pegasus_has_class "$1" || return 1
+  description=$(sed -n 's/^ Description("\(.*\)")\]$/\1/p' "$root$data/schema/corvane-computersystem.mof")
+  ! grep -qF "$description" "$root$pegasus_repository/root#cimv2/classes/$1".* || return 1
+  say "$root$pegasus_repository"
 }
 
 # providerDir as configured; its default depends on how the broker was built.
