@@ -11,6 +11,7 @@
 #include "platform/common/Ascii.h"
 #include "platform/common/ConfigurationFile.h"
 #include "platform/common/FileDescriptor.h"
+#include "platform/common/NearestName.h"
 
 namespace Tarn::Common {
 namespace {
@@ -31,14 +32,6 @@ constexpr std::array<std::string_view, 12> knownKeys = {
     "trace.rate",         //
     "trace.size",         //
 };
-
-std::string listOfKeys() {
-  std::string list;
-  for (std::string_view key : knownKeys) {
-    list.append(list.empty() ? "" : ", ").append(key);
-  }
-  return list;
-}
 
 std::string errorText(int error) {
   return std::generic_category().message(error);
@@ -111,8 +104,8 @@ void Configuration::parseLine(std::string_view line, const std::string& where) {
   }
   const std::string_view key = trimmed(line.substr(0, equals));
   if (std::find(knownKeys.begin(), knownKeys.end(), key) == knownKeys.end()) {
-    problems_.push_back(
-        {where, "unknown key \"" + std::string(key) + "\"; the line is ignored (known keys: " + listOfKeys() + ")"});
+    problems_.push_back({where, "unknown key \"" + std::string(key) + "\"; the line is ignored (" +
+                                    suggestNames(key, knownKeys, "known keys: ") + ")"});
     return;
   }
   settings_.insert_or_assign(std::string(key), Setting{std::string(trimmed(line.substr(equals + 1))), where});

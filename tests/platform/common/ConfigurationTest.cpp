@@ -51,15 +51,17 @@ TEST(Configuration, CountsTheLaterOfTwoLines) {
 }
 
 TEST(Configuration, NamesEveryLineThatDoesNotCount) {
-  const Configuration configuration = Configuration::parse("debug\nlog.levle = 1\n = 2\nlanguage =\n", "corvane.conf");
+  const Configuration configuration =
+      Configuration::parse("debug\nlog.levle = 1\n = 2\nlanguage =\ncolour = 3\n", "corvane.conf");
   EXPECT_THAT(
       configuration.problems(),
       ElementsAre(
           ConfigurationProblem{"corvane.conf:1", "expected \"key = value\" but there is no \"=\"; the line is ignored"},
-          ConfigurationProblem{"corvane.conf:2", std::string("unknown key \"log.levle\"; the line is "
-                                                             "ignored ") +
-                                                     knownKeys},
-          ConfigurationProblem{"corvane.conf:3", std::string("unknown key \"\"; the line is ignored ") + knownKeys}));
+          ConfigurationProblem{"corvane.conf:2",
+                               "unknown key \"log.levle\"; the line is ignored (did you mean log.level?)"},
+          ConfigurationProblem{"corvane.conf:3", std::string("unknown key \"\"; the line is ignored ") + knownKeys},
+          ConfigurationProblem{"corvane.conf:5",
+                               std::string("unknown key \"colour\"; the line is ignored ") + knownKeys}));
   expectSetting(configuration, "language", "", "corvane.conf:4");
 }
 

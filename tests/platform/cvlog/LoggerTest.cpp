@@ -130,7 +130,7 @@ TEST_F(Logger, ReportsABrokenConfigurationOnceAndObeysTheRest) {
       recordedSystemLog(),
       ElementsAre(Field(&SystemLogRecord::text,
                         MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
-                                     ":2: unknown key \"log.levle\"; the line is ignored \\(known keys: .*\\)")),
+                                     ":2: unknown key \"log.levle\"; the line is ignored \\(did you mean log.level\\?\\)")),
                   Field(&SystemLogRecord::text,
                         MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
                                      ":4: \"printer\" is not valid: expected none, stderr, syslog or file:PATH")),
