@@ -1,6 +1,9 @@
 #include "platform/locale/Catalogue.h"
 
 #include <iterator>
+#include <ranges>
+
+#include "platform/locale/LanguageId.h"
 
 namespace Tarn::Locale {
 namespace {
@@ -50,6 +53,30 @@ std::optional<std::wstring_view> findHere(int number, std::wstring_view language
 }
 
 }  // namespace
+
+std::vector<std::string> translatedLanguages() {
+  std::vector<std::string> languages;
+  for (const Catalogue& catalogue : catalogues()) {
+    // Language ids are ASCII.
+    const auto narrow =
+        std::views::transform(catalogue.language, [](wchar_t letter) { return static_cast<char>(letter); });
+    languages.emplace_back(narrow.begin(), narrow.end());
+  }
+  std::ranges::sort(languages);
+  languages.erase(std::ranges::unique(languages).begin(), languages.end());
+  return languages;
+}
+
+bool isTranslated(std::string_view id) {
+  const std::string normalized = normalizedLanguageId(id);
+  const std::wstring wide(normalized.begin(), normalized.end());
+  for (std::wstring_view language = wide; !language.empty(); language = parentOf(language)) {
+    if (std::ranges::find(catalogues(), language, &Catalogue::language) != catalogues().end()) {
+      return true;
+    }
+  }
+  return false;
+}
 
 std::optional<std::wstring_view> findMessage(int number, std::wstring_view language, std::wstring_view id) {
   for (; !language.empty(); language = parentOf(language)) {

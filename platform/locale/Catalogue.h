@@ -4,7 +4,9 @@
 #include <algorithm>
 #include <optional>
 #include <span>
+#include <string>
 #include <string_view>
+#include <vector>
 
 namespace Tarn::Locale {
 
@@ -29,6 +31,13 @@ constexpr bool isSorted(std::span<const Message> messages) {
 
 /// All catalogues, compiled in from the files in `locale/`.
 std::span<const Catalogue> catalogues();
+
+/// The languages that there are catalogues in, sorted.
+std::vector<std::string> translatedLanguages();
+
+/// Whether the text is a language id whose texts come from a catalogue in it or in one of its parents, as findMessage
+/// knows them, and not from the English one for want of any.
+bool isTranslated(std::string_view id);
 
 /// The text in that language or, where it has none, in its parents ("de_AT", "de"; "zh_Hans_SG", "zh_Hans", "zh",
 /// "zh_CN") and at last in English.

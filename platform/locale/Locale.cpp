@@ -21,17 +21,6 @@ using Common::Setting;
 // The language where no other is asked for.
 constexpr std::string_view defaultLanguage = "en";
 
-std::optional<Setting> wantedLanguage() {
-  constexpr const char* variable = "CORVANE_LANGUAGE";
-  if (const auto value = Common::environmentOverride(variable)) {
-    return Setting{*value, variable};
-  }
-  if (const Setting* setting = Common::configuration().find("language")) {
-    return *setting;
-  }
-  return std::nullopt;
-}
-
 void reportUnknown(const Setting& setting) {
   Common::report({"Corvane.Locale", "Locale.cpp"}, CVLog::levelError,
                  "Configuration: " + setting.where + ": \"" + setting.value +
@@ -50,6 +39,17 @@ std::string languageOfThisProcess() {
 }
 
 }  // namespace
+
+std::optional<Setting> wantedLanguage() {
+  constexpr const char* variable = "CORVANE_LANGUAGE";
+  if (const auto value = Common::environmentOverride(variable)) {
+    return Setting{*value, variable};
+  }
+  if (const Setting* setting = Common::configuration().find("language")) {
+    return *setting;
+  }
+  return std::nullopt;
+}
 
 std::string getLanguageId() {
   static const std::string language = languageOfThisProcess();

@@ -46,6 +46,23 @@ TEST(Catalogues, AreThereInTheseLanguages) {
   EXPECT_EQ(Tarn::Locale::catalogues().size(), languages.size());
 }
 
+TEST(Catalogues, ListTheirLanguages) {
+  std::vector<std::string> languages;
+  for (const auto& [language, file] : catalogueFiles()) {
+    languages.push_back(language);
+  }
+  EXPECT_EQ(Tarn::Locale::translatedLanguages(), languages);
+}
+
+TEST(Catalogues, TranslateIntoTheirLanguagesAndTheVariantsOfThese) {
+  for (const char* id : {"en", "en_GB", "fr_CA.UTF-8", "de_DE.UTF-8", "DE-at", "zh", "zh_CN", "zh_Hans_SG"}) {
+    EXPECT_TRUE(Tarn::Locale::isTranslated(id)) << id;
+  }
+  for (const char* id : {"", "C", "C.UTF-8", "fi", "fi_FI", "zh_TW", "German"}) {
+    EXPECT_FALSE(Tarn::Locale::isTranslated(id)) << id;
+  }
+}
+
 TEST(Catalogues, HaveInEnglishWhatTheLibraryAsksFor) {
   std::set<std::string> ids;
   for (const PoEntry& entry : catalogueFiles().at("en").entries) {

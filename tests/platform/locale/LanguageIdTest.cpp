@@ -10,6 +10,7 @@ TEST(LanguageId, HasOneFormHoweverItIsWritten) {
   for (const char* id : {"de_AT", "de-AT", "DE_at", "de_at", "de_AT.UTF-8", "de-AT@euro", "de_AT.ISO-8859-15@euro"}) {
     EXPECT_EQ(normalizedLanguageId(id), "de_AT") << id;
   }
+  EXPECT_EQ(normalizedLanguageId("fr_CA.UTF-8"), "fr_CA");
   EXPECT_EQ(normalizedLanguageId("EN"), "en");
   EXPECT_EQ(normalizedLanguageId("GSW"), "gsw");
   EXPECT_EQ(normalizedLanguageId("ZH-hANT-tw"), "zh_Hant_TW");
