@@ -5,6 +5,7 @@
 
 #include "host/broker/Names.h"
 #include "host/broker/ProviderProcess.h"
+#include "platform/common/NearestName.h"
 
 namespace Corvcim {
 namespace {
@@ -18,24 +19,14 @@ Answer answerOf(Response response) {
   return {std::move(response), {}};
 }
 
-std::string nameList(bool associations) {
-  std::string result;
-  for (const ClassDefinition& each : classDefinitions()) {
-    if (!associations || each.association) {
-      result += (result.empty() ? "" : ", ") + std::string(each.name);
-    }
-  }
-  return result;
-}
-
 Response unknownClass(std::string_view name) {
   return failure(CMPI_RC_ERR_INVALID_CLASS,
-                 "no class " + quotedText(name) + " is served here; there are " + nameList(false));
+                 "no class " + quotedText(name) + " is served here; " + suggestClasses(name));
 }
 
 Response unknownAssociation(std::string_view name) {
   return failure(CMPI_RC_ERR_INVALID_PARAMETER,
-                 "no association class " + quotedText(name) + " is served here; there are " + nameList(true));
+                 "no association class " + quotedText(name) + " is served here; " + suggestClasses(name, true));
 }
 
 ObjectPath withClass(ObjectPath path, const ClassDefinition& definition) {
@@ -164,7 +155,36 @@ Answer exactlyOne(Answer answer, const ObjectPath& path) {
   return answer;
 }
 
+// The association classes that the filter names, by any spelling; all of them if it names none.
+Classes associationsNamed(const Operation& operation) {
+  Classes all;
+  for (const ClassDefinition& each : classDefinitions()) {
+    if (each.association) {
+      all.push_back(&each);
+    }
+  }
+  const bool references = isReferenceOperation(operation.kind);
+  const auto& name = references ? operation.filter.resultClass : operation.filter.assocClass;
+  Classes named = all;
+  std::erase_if(named, [&](const ClassDefinition* each) { return !isA(each->name, name.value_or("")); });
+  return named.empty() ? all : named;
+}
+
 }  // namespace
+
+std::string suggestClasses(std::string_view name, bool onlyAssociations) {
+  std::vector<std::string_view> served;
+  std::vector<std::string_view> known;
+  for (const ClassDefinition& each : classDefinitions()) {
+    if (!onlyAssociations || each.association) {
+      served.push_back(each.name);
+      for (std::string_view ancestor = each.name; !ancestor.empty(); ancestor = parentOf(ancestor)) {
+        known.push_back(ancestor);
+      }
+    }
+  }
+  return Tarn::Common::suggestNames(name, Tarn::Common::nearestName(name, known).empty() ? served : known);
+}
 
 Dispatcher::Dispatcher(LibraryFiles libraryFiles) : libraryFiles_(std::move(libraryFiles)) {}
 
@@ -202,6 +222,15 @@ Answer Dispatcher::referenceNames(const ObjectPath& source, const AssociationFil
 
 Answer Dispatcher::perform(const Operation& operation) {
   return isAssociationOperation(operation.kind) ? performOnAssociations(operation) : performOnClasses(operation);
+}
+
+Answer Dispatcher::performAsIs(const Operation& operation) {
+  const Classes classes =
+      isAssociationOperation(operation.kind) ? associationsNamed(operation) : classesServing(operation.path.className);
+  if (classes.empty()) {
+    return answerOf(unknownClass(operation.path.className));
+  }
+  return mergeAll(classes, [&](const ClassDefinition& each) { return performOn(each, operation); });
 }
 
 Answer Dispatcher::performOnClasses(const Operation& operation) {

@@ -26,6 +26,10 @@ struct ClassFailure {
   friend bool operator==(const ClassFailure&, const ClassFailure&) = default;
 };
 
+/// How a message about a class that is not served ends: "did you mean HALDA_CPUMemory?", or the list of the classes
+/// served. `onlyAssociations` leaves out all others.
+[[nodiscard]] std::string suggestClasses(std::string_view name, bool onlyAssociations = false);
+
 /// What all classes asked said together. The response holds everything that succeeded and is OK if
 /// anything did; `failures` tells the rest. When nothing succeeded, the response is the first failure.
 struct Answer {
@@ -70,6 +74,11 @@ class Dispatcher {
   Answer referenceNames(const ObjectPath& source, const AssociationFilter& filter = {});
 
   Answer perform(const Operation& operation);
+
+  /// Sends the operation as it is to the providers that a broker would choose for it, and returns what they answer:
+  /// nothing is completed, spelled or filtered here. Of an association operation these are the providers of the
+  /// association classes that are the class named or derived from it, of all if there are none.
+  Answer performAsIs(const Operation& operation);
 
  private:
   Answer performOnClasses(const Operation& operation);

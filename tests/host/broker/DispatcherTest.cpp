@@ -68,6 +68,44 @@ TEST_F(DispatcherTest, SaysWhichClassesThereAreIfTheClassIsUnknown) {
   EXPECT_EQ(dispatcher_.associators(instanceOf("plain", "CIM_Fan")).response.rc, CMPI_RC_ERR_INVALID_CLASS);
 }
 
+TEST_F(DispatcherTest, SuggestsTheClassThatIsNearest) {
+  EXPECT_EQ(outcome(dispatcher_.enumerateInstances(classPath("plain", "HALDA_CPUMemry"))),
+            "CMPI_RC_ERR_INVALID_CLASS no class \"HALDA_CPUMemry\" is served here; did you mean HALDA_CPUMemory?");
+  EXPECT_EQ(suggestClasses("CIM_LogicalDevise"), "did you mean CIM_LogicalDevice?");
+  EXPECT_EQ(suggestClasses("HALDA_CPUMemry", true).substr(0, 32), "there are HALDA_CPUSystemDevice,");
+}
+
+TEST_F(DispatcherTest, SendsRequestsAsTheyAre) {
+  const auto sent = [&](OperationKind kind, const ObjectPath& path, const AssociationFilter& filter = {}) {
+    return told(dispatcher_.performAsIs({kind, path, std::nullopt, filter}));
+  };
+  const ObjectPath memory = instanceOf("plain", "HALDA_cpumemory");
+
+  EXPECT_EQ(sent(OperationKind::Associators, memory, {"halda_cpuassociatedcachememory", "x", "y", ""}),
+            (Told{"HALDA_CPUAssociatedCacheMemory: associators halda_cpuassociatedcachememory x y "}));
+  EXPECT_EQ(sent(OperationKind::References, memory, {{}, "CIM_ElementCapabilities", "y", {}}),
+            (Told{"HALDA_CPUElementCapabilities: references CIM_ElementCapabilities y"}));
+  EXPECT_EQ(sent(OperationKind::Associators, instanceOf("plain", "CIM_Fan"), {"CIM_Fans", {}, {}, {}}),
+            (Told{"HALDA_CPUSystemDevice: associators CIM_Fans NULL NULL NULL",
+                  "HALDA_CPUConcreteComponent: associators CIM_Fans NULL NULL NULL",
+                  "HALDA_CPUAssociatedCacheMemory: associators CIM_Fans NULL NULL NULL",
+                  "HALDA_CPUCoreAssociatedCacheMemory: associators CIM_Fans NULL NULL NULL",
+                  "HALDA_CPUElementCapabilities: associators CIM_Fans NULL NULL NULL"}));
+  EXPECT_EQ(dispatcher_.performAsIs({OperationKind::EnumerateInstanceNames, classPath("plain", "cim_MEMORY"), {}, {}})
+                .response.paths,
+            (std::vector<ObjectPath>{classPath("plain", "cim_MEMORY")}));
+}
+
+TEST_F(DispatcherTest, AddsNothingToTheAnswersOfRequestsThatAreSentAsTheyAre) {
+  const auto get = [&](std::string_view nameSpace, std::string_view className) {
+    return dispatcher_.performAsIs({OperationKind::GetInstance, instanceOf(nameSpace, className), {}, {}});
+  };
+
+  EXPECT_EQ(get("two", "HALDA_CPUProcessorCore").response.instances.size(), 2U);
+  EXPECT_EQ(get("none", "HALDA_CPUProcessorCore").response, Response{});
+  EXPECT_EQ(get("plain", "CIM_Fan").response.rc, CMPI_RC_ERR_INVALID_CLASS);
+}
+
 TEST_F(DispatcherTest, GetsExactlyOneInstance) {
   EXPECT_EQ(told(dispatcher_.getInstance(instanceOf("plain", "HALDA_CPUMemory"))),
             (Told{"HALDA_CPUMemory: getInstance"}));
