@@ -14,6 +14,9 @@ namespace Corvcim {
 /// files. Everything here is constant data; all functions may be called from any thread. Class and
 /// property names compare without regard to ASCII case, as everywhere in CIM.
 
+/// The namespace that all classes are served in.
+inline constexpr std::string_view servedNameSpace = "root/cimv2";
+
 struct PropertyDefinition {
   std::string_view name;            ///< as the providers spell it
   CMPIType type;                    ///< exact CMPI type; texts are CMPI_string, references CMPI_ref

@@ -4,12 +4,14 @@
 #include <string>
 #include <string_view>
 
+#include "host/ClassTable.h"
+
 /// The registration of a library's providers, rendered from the host's class table: the one list of
 /// classes, providers, libraries and process groups.
 namespace Registration {
 
 /// The namespace that the classes are served in.
-inline constexpr std::string_view nameSpace = "root/cimv2";
+inline constexpr std::string_view nameSpace = Corvcim::servedNameSpace;
 
 /// The text format of SFCB: one block for each class that `library` ("corvcpuprofileprovider") serves.
 std::string forSfcb(std::string_view library);

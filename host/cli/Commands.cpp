@@ -4,13 +4,14 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <iterator>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "host/broker/Dispatcher.h"
 #include "host/cli/ClassList.h"
-#include "host/cli/CrashReport.h"
 #include "host/cli/Health.h"
 #include "host/cli/InventoryText.h"
 #include "host/cli/Libraries.h"
@@ -18,6 +19,7 @@
 #include "host/cli/Operations.h"
 #include "host/cli/Overview.h"
 #include "host/cli/SnapshotCommand.h"
+#include "host/cli/SourceArgument.h"
 #include "host/cli/diff/DiffCommand.h"
 #include "host/cli/drawing/Machine.h"
 #include "host/cli/drawing/TreeDot.h"
@@ -25,18 +27,19 @@
 #include "host/cli/drawing/TreeSvg.h"
 #include "host/cli/drawing/TreeText.h"
 #include "host/cli/explain/ExplainCommand.h"
-#include "host/hwloc/HwlocSource.h"
+#include "platform/common/Configuration.h"
+#include "platform/common/Environment.h"
+#include "platform/cvlog/Settings.h"
 #include "platform/instrumentation/ProcessTree.h"
 #include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/locale/Catalogue.h"
+#include "platform/locale/LanguageId.h"
 
 namespace Corvcim {
 namespace {
 
 /// The libraries read these when they are loaded, and so does this program's own inventory.
 void setEnvironment(const Options& options) {
-  if (!options.inventory.empty()) {
-    setenv("CORVANE_INVENTORY", options.inventory.c_str(), 1);
-  }
   if (isForPrograms(options.format)) {
     setenv("CORVANE_LANGUAGE", "en", 1);
   } else if (!options.language.empty()) {
@@ -44,14 +47,40 @@ void setEnvironment(const Options& options) {
   }
 }
 
-std::shared_ptr<const Tarn::Inventory::Tree> inventoryTree(const Options& options) {
-  if (options.convertFrom.empty()) {
-    return Tarn::Inventory::processTree();
+/// Also what the environment or the configuration names may be read only once.
+void setInventory(const Options& options) {
+  if (!options.convertFrom.empty()) {
+    return;
   }
-  // hwloc trusts that a description is complete.
-  const CrashReport report("cannot read the inventory: " + options.convertFrom +
-                           ": hwloc crashed on it; correct the description");
-  return std::make_shared<const Tarn::Inventory::Tree>(readHwloc(options.convertFrom));
+  const std::string chosen = options.inventory.empty() ? Tarn::Inventory::chosenSource() : options.inventory;
+  const std::string settled = settleSource(chosen);
+  if (!options.inventory.empty() || settled != chosen) {
+    setenv("CORVANE_INVENTORY", settled.c_str(), 1);
+  }
+}
+
+/// What is wrong with the configuration, which the libraries log and otherwise ignore.
+std::vector<std::string> configurationRemarks() {
+  using Tarn::Common::configuration;
+  using Tarn::Common::environmentOverride;
+  std::vector<std::string> remarks;
+  const CVLog::Settings settings =
+      CVLog::makeSettings(configuration(), environmentOverride("CORVANE_LOG"), environmentOverride("CORVANE_TRACE"));
+  for (const Tarn::Common::ConfigurationProblem& problem : settings.problems) {
+    remarks.push_back(problem.where + ": " + problem.why);
+  }
+  const std::optional<Tarn::Common::Setting> language = Tarn::Locale::wantedLanguage();
+  if (language && !Tarn::Locale::isTranslated(language->value)) {
+    remarks.push_back(language->where + ": there are no texts in \"" + language->value +
+                      "\"; English ones are used instead");
+  }
+  return remarks;
+}
+
+std::shared_ptr<const Tarn::Inventory::Tree> inventoryTree(const Options& options) {
+  return options.convertFrom.empty()
+             ? Tarn::Inventory::processTree()
+             : std::make_shared<const Tarn::Inventory::Tree>(convertDescription(options.convertFrom));
 }
 
 std::string inventoryOutput(const Options& options) {
@@ -104,19 +133,12 @@ std::vector<std::string> remarksOf(const std::vector<std::string>& written, cons
   return remarks;
 }
 
-}  // namespace
-
-Outcome runCommand(const Options& options, std::size_t width) {
-  setEnvironment(options);
+Outcome runWithInventory(const Options& options, std::size_t width) {
   switch (options.verb->verb) {
-    case Verb::Classes:
-      return {classOutput(options), {}};
     case Verb::Inventory:
       return {inventoryOutput(options), {}};
     case Verb::Snapshot:
       return takeSnapshot(options);
-    case Verb::Diff:
-      return diffInventories(options);
     case Verb::Tree:
       return {treeOutput(options.format, width), {}};
     default:
@@ -125,6 +147,26 @@ Outcome runCommand(const Options& options, std::size_t width) {
   LibraryErrors written;
   Outcome outcome = askLibraries(options);
   outcome.remarks = remarksOf(written.take(), outcome.errors);
+  return outcome;
+}
+
+}  // namespace
+
+Outcome runCommand(const Options& options, std::size_t width) {
+  if (options.verb->verb == Verb::Classes) {
+    return {classOutput(options), {}};
+  }
+  setEnvironment(options);
+  std::vector<std::string> remarks = configurationRemarks();
+  Outcome outcome;
+  if (options.verb->verb == Verb::Diff) {
+    outcome = diffInventories(options);
+  } else {
+    setInventory(options);
+    outcome = runWithInventory(options, width);
+  }
+  outcome.remarks.insert(outcome.remarks.begin(), std::make_move_iterator(remarks.begin()),
+                         std::make_move_iterator(remarks.end()));
   return outcome;
 }
 

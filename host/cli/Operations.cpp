@@ -1,5 +1,7 @@
 #include "host/cli/Operations.h"
 
+#include <algorithm>
+#include <iterator>
 #include <stdexcept>
 #include <utility>
 #include <vector>
@@ -8,16 +10,14 @@
 #include "host/broker/Dispatcher.h"
 #include "host/broker/Names.h"
 #include "host/cli/DirectEnumeration.h"
+#include "host/cli/RequestCheck.h"
+#include "host/cli/ResultCount.h"
 #include "host/cli/results/ResultWriter.h"
 #include "host/cli/results/TableWriter.h"
 #include "platform/instrumentation/ProcessTree.h"
 
 namespace Corvcim {
 namespace {
-
-std::optional<std::string> unlessEmpty(const std::string& text) {
-  return text.empty() ? std::nullopt : std::optional(text);
-}
 
 OperationKind kindOf(Verb verb) {
   switch (verb) {
@@ -45,14 +45,14 @@ bool isEnumeration(OperationKind kind) {
 /// A reference's result class is the association; wbemcli's users give it by either option.
 AssociationFilter filterOf(OperationKind kind, const AssociationOptions& options) {
   AssociationFilter filter;
-  filter.role = unlessEmpty(options.role);
+  filter.role = options.role;
   if (isReferenceOperation(kind)) {
-    filter.resultClass = unlessEmpty(options.associationClass);
+    filter.resultClass = options.associationClass;
     return filter;
   }
-  filter.assocClass = unlessEmpty(options.associationClass);
-  filter.resultClass = unlessEmpty(options.resultClass);
-  filter.resultRole = unlessEmpty(options.resultRole);
+  filter.assocClass = options.associationClass;
+  filter.resultClass = options.resultClass;
+  filter.resultRole = options.resultRole;
   return filter;
 }
 
@@ -72,9 +72,20 @@ Operation operationOf(const Options& options) {
                              " takes the path of an instance; ein lists the paths of a class");
   }
   if (options.hasPropertyList) {
-    operation.properties = asProvidersSpell(options.properties);
+    operation.properties = options.asIs ? options.properties : asProvidersSpell(options.properties);
   }
   operation.filter = filterOf(operation.kind, options.association);
+  return operation;
+}
+
+/// As brokers take it: a filter without text filters nothing.
+Operation withoutEmptyFilters(Operation operation) {
+  AssociationFilter& filter = operation.filter;
+  for (std::optional<std::string>* each : {&filter.assocClass, &filter.resultClass, &filter.role, &filter.resultRole}) {
+    if (*each && (*each)->empty()) {
+      each->reset();
+    }
+  }
   return operation;
 }
 
@@ -159,20 +170,45 @@ std::optional<std::string> inventoryError() {
   }
 }
 
+namespace {
+
+/// What the providers answer to the request as it was typed, and nothing else.
+Outcome performAsTyped(const LibraryFiles& files, const Options& options) {
+  const Operation operation = operationOf(options);
+  const Answer answer = Dispatcher(files).performAsIs(operation);
+  Outcome outcome;
+  if (answer.response.ok()) {
+    outcome.output = write(options, operation, answer.response);
+  }
+  outcome.errors = describeFailures(operation, answer, std::nullopt);
+  return outcome;
+}
+
+Outcome performAsBroker(const LibraryFiles& files, const Options& options) {
+  const Operation operation = withoutEmptyFilters(operationOf(options));
+  checkRequest(operation);
+  const Answer answer = ask(files, operation);
+  Outcome outcome;
+  if (answer.response.ok()) {
+    outcome.output = write(options, operation, answer.response);
+  }
+  const std::optional<std::string> unreadable = unreadInventory(answer.response);
+  outcome.errors = describeFailures(operation, answer, unreadable);
+  if (unreadable) {
+    outcome.errors.push_back(*unreadable);
+  } else if (answer.response.ok()) {
+    std::ranges::move(describeMissingResults(operation, answer.response), std::back_inserter(outcome.errors));
+  }
+  return outcome;
+}
+
+}  // namespace
+
 Outcome performOperation(const LibraryFiles& files, const Options& options) {
   const std::string what = std::string(options.verb->name).append(" ").append(options.operand(0)).append(": ");
   Outcome outcome;
   try {
-    const Operation operation = operationOf(options);
-    const Answer answer = ask(files, operation);
-    if (answer.response.ok()) {
-      outcome.output = write(options, operation, answer.response);
-    }
-    const std::optional<std::string> unreadable = unreadInventory(answer.response);
-    outcome.errors = describeFailures(operation, answer, unreadable);
-    if (unreadable) {
-      outcome.errors.push_back(*unreadable);
-    }
+    outcome = options.asIs ? performAsTyped(files, options) : performAsBroker(files, options);
     for (std::string& error : outcome.errors) {
       error.insert(0, what);
     }

@@ -1,10 +1,15 @@
 #include "host/cli/Options.h"
 
 #include <algorithm>
+#include <iterator>
 #include <optional>
 #include <string_view>
 
-#include "platform/instrumentation/Source.h"
+#include "host/broker/Names.h"
+#include "host/cli/SourceArgument.h"
+#include "platform/common/NearestName.h"
+#include "platform/locale/Catalogue.h"
+#include "platform/locale/LanguageId.h"
 
 namespace Corvcim {
 namespace {
@@ -26,6 +31,14 @@ std::string quoted(const std::string& text) {
   throw UsageError(std::string(verb.name) + ": " + text + "; usage: corvcim [OPTION...] " + callOf(verb));
 }
 
+/// Names the valid word that the user most likely meant, if there is one.
+[[noreturn]] void failNear(const std::string& text, std::string_view word, std::span<const std::string_view> valid) {
+  if (const std::string_view nearest = Tarn::Common::nearestName(word, valid); !nearest.empty()) {
+    throw UsageError(text + "; did you mean " + std::string(nearest) + "?");
+  }
+  fail(text);
+}
+
 /// The verbs that an option is for, and what the others answer.
 struct Scope {
   bool (*holds)(const VerbSyntax& verb);
@@ -42,7 +55,8 @@ constexpr Scope onlyInventory = {[](const VerbSyntax& verb) { return verb.verb =
 constexpr Scope columnVerbs = {[](const VerbSyntax& verb) { return std::ranges::any_of(verb.formats, hasColumns); },
                                "its output has no columns"};
 constexpr Scope onlyDiff = {[](const VerbSyntax& verb) { return verb.verb == Verb::Diff; }, "it belongs to diff"};
-
+constexpr Scope requests = {[](const VerbSyntax& verb) { return verb.isRequest; },
+                            "it belongs to ei, ein, gi, ai, ain, ri and rin"};
 constexpr Scope onlySnapshot = {[](const VerbSyntax& verb) { return verb.verb == Verb::Snapshot; },
                                 "it belongs to snapshot"};
 
@@ -83,11 +97,11 @@ std::vector<std::string> splitAtCommas(std::string_view list) {
   return names;
 }
 
-/// What the user typed is at fault here, so nothing is said of the configuration that names a source as well.
+/// The command line is at fault here, so the message does not mention the configuration, which names a source as well.
 void checkSource(std::string_view said, std::string_view source) {
-  if (!Tarn::Inventory::namesSource(source)) {
-    fail(std::string(said) + ": " + quoted(source) + " names no source of an inventory: it can be " +
-         std::string(Tarn::Inventory::sourceForms));
+  if (!isSourceArgument(source)) {
+    fail(std::string(said) + ": " + quoted(source) +
+         " is neither a file nor another source of an inventory: it can be " + std::string(sourceArgumentForms));
   }
 }
 
@@ -102,17 +116,29 @@ void setInventory(Options& options, const std::string& source) {
   options.inventory = source;
 }
 
+void setLanguage(Options& options, const std::string& id) {
+  if (!Tarn::Locale::isTranslated(id)) {
+    std::string known;
+    for (const std::string& language : Tarn::Locale::translatedLanguages()) {
+      known.append(known.empty() ? "" : ", ").append(language);
+    }
+    fail("unknown language " + quoted(id) + ": it can be " + known);
+  }
+  options.language = id;
+}
+
 constexpr Option optionTable[] = {
     {"--library", "-l", true, everyVerb, [](Options& o, const std::string& value) { o.library = value; }},
     {"--companion", "", true, everyVerb, [](Options& o, const std::string& value) { o.companion = value; }},
     {"--inventory", "-i", true, oneInventory, setInventory},
-    {"--language", "", true, everyVerb, [](Options& o, const std::string& value) { o.language = value; }},
+    {"--language", "", true, everyVerb, setLanguage},
     {"--namespace", "-n", true, everyVerb, setNameSpace},
     {"--output", "-o", true, everyVerb, setFormat},
     {"--columns", "", true, columnVerbs, setColumns},
     {"--from", "", true, onlyInventory, [](Options& o, const std::string& value) { o.convertFrom = value; }},
     {"--ignore", "", true, onlyDiff,
      [](Options& o, const std::string& value) { o.ignoredFields = splitAtCommas(value); }},
+    {"--as-is", "", false, requests, [](Options& o, const std::string&) { o.asIs = true; }},
     {"--unmasked", "", false, onlySnapshot, [](Options& o, const std::string&) { o.unmasked = true; }},
     {"--help", "-h", false, everyVerb, [](Options& o, const std::string&) { o.wantsHelp = true; }},
     {"--version", "-V", false, everyVerb, [](Options& o, const std::string&) { o.wantsVersion = true; }},
@@ -131,6 +157,11 @@ struct Match {
   std::optional<std::string> value;
 };
 
+/// wbemcli has an option -nl, which must not become the namespace "l".
+bool mayBeGlued(const Option& option, std::string_view value) {
+  return option.apply != setNameSpace || value.find('/') != std::string_view::npos;
+}
+
 /// Takes --name, --name=value, -x, -xvalue and the words -ac, -arc, -ar, -arr.
 Match matchOption(std::string_view argument) {
   const std::size_t equals = argument.starts_with("--") ? argument.find('=') : std::string_view::npos;
@@ -145,11 +176,14 @@ Match matchOption(std::string_view argument) {
     return {&option, std::string(argument.substr(equals + 1))};
   }
   for (const Option& option : optionTable) {
-    if (option.shortName.size() == 2 && option.hasValue && argument.starts_with(option.shortName)) {
+    if (option.shortName.size() == 2 && option.hasValue && argument.starts_with(option.shortName) &&
+        mayBeGlued(option, argument.substr(2))) {
       return {&option, std::string(argument.substr(2))};
     }
   }
-  fail("unknown option " + quoted(argument));
+  std::vector<std::string_view> names;
+  std::ranges::transform(optionTable, std::back_inserter(names), &Option::longName);
+  failNear("unknown option " + quoted(argument), name, names);
 }
 
 bool isOption(std::string_view argument) {
@@ -171,7 +205,9 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
   }
   const VerbSyntax* verb = findVerb(operands.front());
   if (verb == nullptr) {
-    fail("unknown verb " + quoted(operands.front()));
+    std::vector<std::string_view> names;
+    std::ranges::transform(verbs(), std::back_inserter(names), &VerbSyntax::name);
+    failNear("unknown verb " + quoted(operands.front()), operands.front(), names);
   }
   options.verb = verb;
   const std::size_t count = operands.size() - 1;
@@ -218,6 +254,10 @@ void checkCombination(const Options& options, const std::vector<Given>& given) {
   if (std::ranges::any_of(given, isColumns) && !hasColumns(options.format)) {
     fail("'--columns' is for '-o table' and '-o csv'");
   }
+  if (!options.asIs && !sameName(options.nameSpace, servedNameSpace)) {
+    fail("no class is served in the namespace " + quoted(options.nameSpace) + ": it can be " +
+         std::string(servedNameSpace));
+  }
   if (!options.convertFrom.empty() && !options.inventory.empty()) {
     fail("'--from' and '--inventory' both name a source");
   }
@@ -236,13 +276,13 @@ void settleReferenceOptions(Options& options) {
     return;
   }
   AssociationOptions& association = options.association;
-  if (!association.resultRole.empty()) {
+  if (association.resultRole) {
     fail(*options.verb, "no option '-arr': a reference has no far end");
   }
-  if (!association.associationClass.empty() && !association.resultClass.empty()) {
+  if (association.associationClass && association.resultClass) {
     fail(*options.verb, "'-ac' and '-arc' both name the association class");
   }
-  if (association.associationClass.empty()) {
+  if (!association.associationClass) {
     association.associationClass.swap(association.resultClass);
   }
 }

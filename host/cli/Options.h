@@ -2,32 +2,34 @@
 #define HOST_CLI_OPTIONS_H
 
 #include <cstddef>
+#include <optional>
 #include <span>
 #include <stdexcept>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "host/ClassTable.h"
 #include "host/cli/Verbs.h"
 
 namespace Corvcim {
 
-/// What an association request is narrowed to. An empty text narrows nothing.
+/// What an association request is narrowed to, as far as it is given.
 struct AssociationOptions {
-  std::string associationClass;
-  std::string resultClass;
-  std::string role;
-  std::string resultRole;
+  std::optional<std::string> associationClass;
+  std::optional<std::string> resultClass;
+  std::optional<std::string> role;
+  std::optional<std::string> resultRole;
 };
 
 /// One command line, understood.
 struct Options {
   std::string library;      ///< the provider library; empty: the one that belongs to this program
   std::string companion;    ///< the library with HALDA_ComputerSystem; empty: the one beside it
-  std::string inventory;    ///< as CORVANE_INVENTORY takes it; empty: as the environment says
+  std::string inventory;    ///< as settleSource takes it; empty: as the environment says
   std::string convertFrom;  ///< what the verb inventory converts, as readHwloc takes it; empty: nothing
   std::string language;     ///< as CORVANE_LANGUAGE takes it; empty: as the environment says
-  std::string nameSpace = "root/cimv2";
+  std::string nameSpace{servedNameSpace};
   Format format = Format::Text;
   const VerbSyntax* verb = &overviewSyntax();
   std::vector<std::string> operands;  ///< the words after the verb, as its syntax names them
@@ -35,6 +37,7 @@ struct Options {
   std::vector<std::string> properties;  ///< an empty list selects the keys alone
   AssociationOptions association;
   std::vector<std::string> ignoredFields;  ///< what diff leaves out
+  bool asIs = false;                       ///< the request goes to the providers as it was typed
   bool unmasked = false;                   ///< snapshot keeps serial numbers and the like
   bool wantsHelp = false;
   bool wantsVersion = false;

@@ -50,6 +50,7 @@ struct VerbSyntax {
   unsigned maximumOperands = 0;
   std::string_view summary;
   std::span<const Format> formats;  ///< the output formats that the verb knows
+  bool isRequest = false;           ///< asks providers for one operation
   bool isAssociation = false;       ///< takes the options that name ends and classes
   std::string_view details = {};    ///< further paragraphs of the verb's own help
 };

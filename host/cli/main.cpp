@@ -12,6 +12,7 @@
 #include "host/cli/Commands.h"
 #include "host/cli/Health.h"
 #include "host/cli/Options.h"
+#include "host/cli/SourceArgument.h"
 #include "host/cli/StandardStreams.h"
 #include "host/cli/Text.h"
 #include "host/cli/Usage.h"
@@ -68,7 +69,7 @@ int run(const Corvcim::Options& options, Corvcim::Charset charset) {
   Corvcim::writeOutput(isForTerminal(options) ? Corvcim::inCharset(outcome.output) : outcome.output);
   Corvcim::useCharset(charset);
   for (const std::string& error : outcome.errors) {
-    Corvcim::writeError(error);
+    Corvcim::writeError(Corvcim::withGivenNames(error));
   }
   for (const std::string& remark : outcome.remarks) {
     Corvcim::writeError(remark);
@@ -105,7 +106,7 @@ int main(int count, char** arguments) {
     return wrongUsage(all, error.what());
   } catch (const std::exception& error) {
     Corvcim::useCharset(charset);
-    Corvcim::writeError(error.what());
+    Corvcim::writeError(Corvcim::withGivenNames(error.what()));
     return failed;
   }
 }

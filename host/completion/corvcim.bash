@@ -22,7 +22,7 @@ _corvcim_inventory() {
   elif [[ ${COMP_WORDS[COMP_CWORD - 1]} == : ]]; then
     _corvcim_files "$current"
   else
-    _corvcim_offer "live root: snapshot: json: smbios:"
+    mapfile -t COMPREPLY < <(compgen -W "live root: snapshot: json: smbios: hwloc:" -f -- "$current")
     compopt -o nospace
   fi
 }
@@ -73,9 +73,9 @@ _corvcim() {
 
   if [[ $current == -* ]]; then
     case $verb in
-      ei | ein | gi) options+=" --columns" ;;
-      ai | ain) options+=" --columns -ac -arc -ar -arr" ;;
-      ri | rin) options+=" --columns -ac -arc -ar" ;;
+      ei | ein | gi) options+=" --columns --as-is" ;;
+      ai | ain) options+=" --columns --as-is -ac -arc -ar -arr" ;;
+      ri | rin) options+=" --columns --as-is -ac -arc -ar" ;;
       diff) options+=" --ignore" ;;
       snapshot) options+=" --unmasked" ;;
       inventory) options+=" --from" ;;

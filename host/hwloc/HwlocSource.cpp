@@ -40,9 +40,8 @@ Tree readHwloc(std::string_view source) {
       return scheme.read(std::string(source.substr(scheme.prefix.size())));
     }
   }
-  throw InventoryError(
-      "cannot convert the inventory", '"' + std::string(source) + '"', "it names no description to convert",
-      "--from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION, and --inventory what the library reads");
+  throw InventoryError("cannot convert the inventory", '"' + std::string(source) + '"',
+                       "it names no description to convert", "--from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION");
 }
 
 }  // namespace Corvcim

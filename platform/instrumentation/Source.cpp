@@ -6,6 +6,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "platform/instrumentation/files/Archive.h"
 #include "platform/instrumentation/files/FileSystem.h"
@@ -144,6 +145,20 @@ Tree loadSmbios(const std::string& location, Detail detail) {
 
 bool namesSource(std::string_view specification) {
   return find(specification).has_value();
+}
+
+std::vector<std::string_view> locationsOf(std::string_view specification) {
+  const std::optional<Choice> choice = find(specification);
+  if (!choice || !choice->scheme.hasLocation) {
+    return {};
+  }
+  const std::string_view location = specification.substr(specification.size() - choice->location.size());
+  const Dump dump = choice->scheme.load == loadSmbios ? splitDump(choice->location) : Dump{choice->location, {}};
+  std::vector<std::string_view> locations = {location.substr(0, dump.file.size())};
+  if (dump.behind && dump.behind->scheme.hasLocation) {
+    locations.push_back(location.substr(location.size() - dump.behind->location.size()));
+  }
+  return locations;
 }
 
 Tree loadInventory(std::string_view specification, Detail detail) {

@@ -3,6 +3,7 @@
 
 #include <memory>
 #include <string_view>
+#include <vector>
 
 #include "platform/instrumentation/files/FileSystem.h"
 #include "platform/instrumentation/tree/Tree.h"
@@ -14,6 +15,10 @@ inline constexpr std::string_view sourceForms = "live, root:DIRECTORY, snapshot:
 
 /// Whether the text names a source, be its file there or not.
 bool namesSource(std::string_view specification);
+
+/// The names of files and directories in the text of a source, in order, as parts of it: both of
+/// smbios:FILE+root:DIR, none of live.
+std::vector<std::string_view> locationsOf(std::string_view specification);
 
 /// Reads the inventory that the text names:
 ///

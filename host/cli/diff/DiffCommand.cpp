@@ -3,9 +3,11 @@
 #include <algorithm>
 
 #include "host/cli/InventoryText.h"
+#include "host/cli/SourceArgument.h"
 #include "host/cli/diff/DiffText.h"
 #include "host/cli/diff/InventoryDiff.h"
 #include "host/cli/results/Json.h"
+#include "platform/common/NearestName.h"
 #include "platform/instrumentation/Source.h"
 #include "platform/instrumentation/tree/PropertyTable.h"
 
@@ -21,11 +23,8 @@ void checkIgnored(const std::vector<std::string>& ignored) {
     if (std::ranges::find(known, name) != known.end()) {
       continue;
     }
-    std::string text = "diff: '--ignore' names no field of an inventory: '" + name + "'; there are";
-    for (const std::string_view field : known) {
-      text.append(field == known.front() ? " " : ", ").append(field);
-    }
-    throw UsageError(text);
+    throw UsageError("diff: '--ignore' names no field of an inventory: '" + name + "'; " +
+                     Tarn::Common::suggestNames(name, known));
   }
 }
 
@@ -105,8 +104,8 @@ std::string asJson(const Difference& difference) {
 
 Outcome diffInventories(const Options& options) {
   checkIgnored(options.ignoredFields);
-  const Tree before = Tarn::Inventory::loadInventory(options.operand(0));
-  const Tree after = Tarn::Inventory::loadInventory(options.operand(1));
+  const Tree before = Tarn::Inventory::loadInventory(settleSource(options.operand(0)));
+  const Tree after = Tarn::Inventory::loadInventory(settleSource(options.operand(1)));
   const Difference difference{options, before, after, compareInventories(before, after, options.ignoredFields)};
   const std::string output = options.format == Format::Json ? asJson(difference) : asText(difference);
   return {output, {}, !difference.changes.empty()};

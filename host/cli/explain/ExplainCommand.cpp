@@ -8,6 +8,7 @@
 #include "host/cli/Options.h"
 #include "host/cli/explain/Explanation.h"
 #include "host/cli/explain/ExplanationWriters.h"
+#include "platform/common/NearestName.h"
 #include "platform/instrumentation/ProcessTree.h"
 #include "platform/instrumentation/Source.h"
 
@@ -33,15 +34,12 @@ void checkSelection(const std::vector<std::string>& selection, const std::vector
       continue;
     }
     std::vector<std::string_view> known;
-    std::string text = "explain: no property '";
-    text.append(name).append("'; there are");
     for (const PropertySource* source : sources) {
       if (std::ranges::find(known, source->property) == known.end()) {
-        text.append(known.empty() ? " " : ", ").append(source->property);
         known.push_back(source->property);
       }
     }
-    throw UsageError(text);
+    throw UsageError("explain: no property '" + name + "'; " + Tarn::Common::suggestNames(name, known));
   }
 }
 
@@ -65,7 +63,8 @@ Outcome explainValues(const LibraryFiles& files, const Options& options) {
   Outcome outcome;
   outcome.errors = explainer.failures();
   if (options.format == Format::Json) {
-    outcome.output = writeExplanationsAsJson(tree, instances, source);
+    const std::string& given = options.inventory.empty() ? source : options.inventory;
+    outcome.output = writeExplanationsAsJson(tree, instances, given);
   } else if (options.operand(0).empty()) {
     outcome.output = writeShortExplanations(tree, instances);
   } else {

@@ -60,7 +60,7 @@ TEST(Corvcim, EnumeratesInstances) {
 }
 
 TEST(Corvcim, EnumeratesWithAPropertyListAndANamespace) {
-  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "mof", "ei", "root/test:HALDA_CPUProcessor", "MaxClockSpeed,Stepping"}),
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-o", "mof", "ei", "ROOT/CIMV2:HALDA_CPUProcessor", "MaxClockSpeed,Stepping"}),
             success("instance of HALDA_CPUProcessor {\n"
                     "  CreationClassName = \"HALDA_CPUProcessor\";\n"
                     "  DeviceID = \"P0\";\n"
@@ -76,9 +76,9 @@ TEST(Corvcim, EnumeratesWithAPropertyListAndANamespace) {
 TEST(Corvcim, EnumeratesNames) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"ein", "HALDA_CPUProcessorCore"}),
             success(corePath("P0.C0") + '\n' + corePath("P0.C1") + '\n'));
-  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-n", "root/x", "ein", "halda_cpuprocessorCORE"}),
-            success("root/x:HALDA_CPUProcessorCore.InstanceID=\"P0.C0\"\n"
-                    "root/x:HALDA_CPUProcessorCore.InstanceID=\"P0.C1\"\n"));
+  EXPECT_EQ(corvcimOn(twoCoreMachine(), {"-n", "Root/CIMv2", "ein", "halda_cpuprocessorCORE"}),
+            success("Root/CIMv2:HALDA_CPUProcessorCore.InstanceID=\"P0.C0\"\n"
+                    "Root/CIMv2:HALDA_CPUProcessorCore.InstanceID=\"P0.C1\"\n"));
 }
 
 TEST(Corvcim, AClassOfTheSchemaStandsForThoseDerivedFromIt) {

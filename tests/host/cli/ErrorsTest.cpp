@@ -171,8 +171,9 @@ TEST(CorvcimErrors, WhatALibraryLogsToStandardErrorIsShown) {
 }
 
 TEST(CorvcimErrors, WhatALibraryWritesToStandardErrorIsSaidOnceWhereNothingElseSaysIt) {
-  const std::string direct = "\"$corvcim\" -l " TEST_PROVIDER " -n write ein HALDA_CPUMemory";
-  const std::string inProcesses = "\"$corvcim\" -l " TEST_PROVIDER " -n write ein CIM_LogicalDevice";
+  const std::string program = "TEST_PROVIDER_ACTION=write \"$corvcim\" -l " TEST_PROVIDER;
+  const std::string direct = program + " ein HALDA_CPUMemory";
+  const std::string inProcesses = program + " ein CIM_LogicalDevice";
 
   EXPECT_EQ(shell(direct + " > /dev/null"), (Finished{0, "", "corvcim: the provider library wrote: strange\\x07\n"}));
   EXPECT_EQ(shell(inProcesses + " > /dev/null"),
@@ -180,8 +181,9 @@ TEST(CorvcimErrors, WhatALibraryWritesToStandardErrorIsSaidOnceWhereNothingElseS
 }
 
 TEST(CorvcimErrors, WhatALibraryWroteBeforeItCrashedIsShown) {
-  const Finished direct = corvcim({"-l", TEST_PROVIDER, "-n", "write-abort", "ein", "HALDA_CPUMemory"});
-  const Finished inProcess = corvcim({"-l", TEST_PROVIDER, "-n", "write-abort", "ein", "CIM_LogicalDevice"});
+  const std::string program = "TEST_PROVIDER_ACTION=write-abort \"$corvcim\" -l " TEST_PROVIDER;
+  const Finished direct = shell(program + " ein HALDA_CPUMemory");
+  const Finished inProcess = shell(program + " ein CIM_LogicalDevice");
 
   EXPECT_EQ(
       direct,

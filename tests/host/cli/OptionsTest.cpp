@@ -35,21 +35,21 @@ TEST(Options, NothingMeansTheOverviewOfThisMachine) {
 
 TEST(Options, LongOptionsTakeTheirValueAsAWordOrAfterAnEqualsSign) {
   const Options options = parse({"--library", "a.so", "--companion=b.so", "--inventory", "json:x=y", "--language=de_AT",
-                                 "--namespace=root/test", "--output", "text"});
+                                 "--namespace=ROOT/cimv2", "--output", "text"});
 
   EXPECT_EQ(options.library, "a.so");
   EXPECT_EQ(options.companion, "b.so");
   EXPECT_EQ(options.inventory, "json:x=y");
   EXPECT_EQ(options.language, "de_AT");
-  EXPECT_EQ(options.nameSpace, "root/test");
+  EXPECT_EQ(options.nameSpace, "ROOT/cimv2");
 }
 
 TEST(Options, ShortOptionsTakeTheirValueAsAWordOrGlued) {
-  const Options options = parse({"-l", "a.so", "-ilive", "-nroot/x", "-ojson", "classes"});
+  const Options options = parse({"-l", "a.so", "-ilive", "-nRoot/CIMv2", "-ojson", "classes"});
 
   EXPECT_EQ(options.library, "a.so");
   EXPECT_EQ(options.inventory, "live");
-  EXPECT_EQ(options.nameSpace, "root/x");
+  EXPECT_EQ(options.nameSpace, "Root/CIMv2");
   EXPECT_EQ(options.format, Format::Json);
 }
 
@@ -166,13 +166,50 @@ TEST(Options, DiffNamesWhatIsMissing) {
 
 TEST(Options, ASourceThatThereIsNotIsNamed) {
   const std::string forms =
-      " names no source of an inventory: it can be live, root:DIRECTORY, snapshot:FILE, json:FILE or smbios:FILE; see "
-      "'corvcim --help'";
+      " is neither a file nor another source of an inventory: it can be live, root:DIRECTORY, snapshot:FILE, "
+      "json:FILE, smbios:FILE, hwloc:FILE, the name of a file, or - for standard input; see 'corvcim --help'";
 
   EXPECT_EQ(complaint({"-i", "machine.json", "tree"}), "--inventory: 'machine.json'" + forms);
   EXPECT_EQ(complaint({"--inventory=", "tree"}), "--inventory: ''" + forms);
   EXPECT_EQ(complaint({"diff", "live", "json:"}), "diff: 'json:'" + forms);
   EXPECT_EQ(complaint({"diff", "machine.json", "live"}), "diff: 'machine.json'" + forms);
+}
+
+TEST(Options, FilesDescriptionsAndStandardInputAreSources) {
+  EXPECT_EQ(parse({"-i", "-", "tree"}).inventory, "-");
+  EXPECT_EQ(parse({"-i", "/dev/null", "tree"}).inventory, "/dev/null");
+  EXPECT_EQ(parse({"-i", "hwloc:machine.xml", "tree"}).inventory, "hwloc:machine.xml");
+  EXPECT_THAT(parse({"diff", "-", "/"}).operands, ElementsAre("-", "/"));
+}
+
+TEST(Options, ANameThatIsNearlyRightIsSuggested) {
+  EXPECT_EQ(complaint({"clases"}), "unknown verb 'clases'; did you mean classes?");
+  EXPECT_EQ(complaint({"--invntory=live"}), "unknown option '--invntory=live'; did you mean --inventory?");
+}
+
+TEST(Options, NamespacesWithoutClassesAreRefused) {
+  EXPECT_EQ(complaint({"-n", "root/x", "tree"}),
+            "no class is served in the namespace 'root/x': it can be root/cimv2; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-nroot/x", "tree"}), complaint({"-n", "root/x", "tree"}));
+  EXPECT_EQ(complaint({"-nl", "tree"}), "unknown option '-nl'; see 'corvcim --help'");
+  EXPECT_EQ(parse({"--as-is", "-n", "root/x", "ei", "A"}).nameSpace, "root/x");
+}
+
+TEST(Options, RequestsGoAsTheyAreOnDemand) {
+  EXPECT_FALSE(parse({"ei", "A"}).asIs);
+  EXPECT_TRUE(parse({"ri", "--as-is", "A.K=1"}).asIs);
+  EXPECT_EQ(parse({"ai", "-ac", "", "A.K=1"}).association.associationClass, "");
+  EXPECT_EQ(parse({"ai", "A.K=1"}).association.associationClass, std::nullopt);
+  EXPECT_EQ(complaint({"tree", "--as-is"}),
+            "tree takes no option '--as-is': it belongs to ei, ein, gi, ai, ain, ri and rin; see 'corvcim --help'");
+}
+
+TEST(Options, LanguagesAreThoseOfTheTexts) {
+  EXPECT_EQ(parse({"--language", "fr_CA.UTF-8", "tree"}).language, "fr_CA.UTF-8");
+  EXPECT_EQ(complaint({"--language", "fi", "tree"}),
+            "unknown language 'fi': it can be de, en, es, fr, ja, zh_CN; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"--language=", "tree"}),
+            "unknown language '': it can be de, en, es, fr, ja, zh_CN; see 'corvcim --help'");
 }
 
 TEST(Options, SnapshotMayNameAFileAndKeepIdentifiers) {

@@ -51,8 +51,10 @@ Finished shell(const std::string& command) {
   const Directory directory;
   const std::string script = directory.write("script",
                                              "unset CORVANE_INVENTORY CORVANE_LANGUAGE CORVANE_TRACE\n"
-                                             "export CORVANE_CONFIG=/dev/null CORVANE_LOG=6000:none LC_ALL=C.UTF-8\n"
-                                             "corvcim=" CORVCIM_PROGRAM "\n" +
+                                             "export CORVANE_LOG=6000:none LC_ALL=C.UTF-8 CORVANE_CONFIG=" +
+                                                 directory.write("configuration", "") +
+                                                 "\n"
+                                                 "corvcim=" CORVCIM_PROGRAM "\n" +
                                                  command + '\n');
   const std::string redirected =
       "bash " + script + " < /dev/null > " + directory.file("output") + " 2> " + directory.file("errors");

@@ -155,9 +155,7 @@ TEST(HwlocSynthetic, VariablesOfTheEnvironmentDoNotCount) {
 }
 
 TEST(HwlocSynthetic, SourcesOfTheLibraryAreNotConverted) {
-  const std::string end =
-      "it names no description to convert; --from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION, and --inventory "
-      "what the library reads";
+  const std::string end = "it names no description to convert; --from takes hwloc:FILE or hwloc-synthetic:DESCRIPTION";
 
   EXPECT_EQ(complaint("live"), "cannot convert the inventory: \"live\": " + end);
   EXPECT_EQ(complaint("hwloc-synthetic:"), "cannot convert the inventory: \"hwloc-synthetic:\": " + end);

@@ -128,13 +128,14 @@ TEST_F(Logger, ReportsABrokenConfigurationOnceAndObeysTheRest) {
   trace(6000, "not traced");
   EXPECT_THAT(
       recordedSystemLog(),
-      ElementsAre(Field(&SystemLogRecord::text,
-                        MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
-                                     ":2: unknown key \"log.levle\"; the line is ignored \\(did you mean log.level\\?\\)")),
-                  Field(&SystemLogRecord::text,
-                        MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
-                                     ":4: \"printer\" is not valid: expected none, stderr, syslog or file:PATH")),
-                  SystemLogRecord{LOG_INFO, "Corvane.Test function file.cpp:12 logged"}));
+      ElementsAre(
+          Field(&SystemLogRecord::text,
+                MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
+                             ":2: unknown key \"log.levle\"; the line is ignored \\(did you mean log.level\\?\\)")),
+          Field(&SystemLogRecord::text,
+                MatchesRegex("Corvane.Logger report Logger.cpp:[0-9]+ Configuration: " + path("corvane.conf") +
+                             ":4: \"printer\" is not valid: expected none, stderr, syslog or file:PATH")),
+          SystemLogRecord{LOG_INFO, "Corvane.Test function file.cpp:12 logged"}));
 }
 
 TEST_F(Logger, FallsBackToItsDefaultWhereAFileCannotBeOpened) {

@@ -90,6 +90,22 @@ TEST(Source, IsNamedWhetherItIsThereOrNot) {
   }
 }
 
+TEST(Source, HasTheLocationsThatItsTextNames) {
+  const std::vector<std::pair<std::string, std::vector<std::string_view>>> rows = {
+      {"live", {}},
+      {"nonsense", {}},
+      {"json:a:b", {"a:b"}},
+      {"root:/x", {"/x"}},
+      {"snapshot:s", {"s"}},
+      {"smbios:a+live", {"a"}},
+      {"smbios:a+b", {"a+b"}},
+      {"smbios:a+live+b+root:/x", {"a+live+b", "/x"}},
+  };
+  for (const auto& [text, locations] : rows) {
+    EXPECT_EQ(locationsOf(text), locations) << text;
+  }
+}
+
 TEST(Source, ADumpsNameMayHoldAPlusSign) {
   const ScratchDirectory directory;
   const std::string file = directory.write("a+live+b.bin", contentsOf(dump));
