@@ -26,6 +26,8 @@ class FileDescriptor {
 
   explicit operator bool() const { return number_ >= 0; }
   [[nodiscard]] int number() const { return number_; }
+  /// Leaves the descriptor open.
+  void release() { number_ = -1; }
 
  private:
   int number_;

@@ -1,31 +1,29 @@
-#include "platform/cvlog/FileSink.h"
-
 #include <fcntl.h>
 #include <sys/file.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
-#include <sys/sysmacros.h>
-#include <unistd.h>
 
 #include <cerrno>
 #include <csignal>
+#include <cstdio>
 #include <filesystem>
 #include <optional>
 #include <stdexcept>
+#include <string_view>
 #include <system_error>
+#include <utility>
 
-#include "platform/cvlog/HeldBackSignal.h"
-#include "platform/cvlog/HeldFlag.h"
-#include "platform/cvlog/Level.h"
-#include "platform/cvlog/SystemLogSink.h"
-#include "platform/cvlog/WriteLine.h"
+#include "platform/common/FileDescriptor.h"
+#include "platform/cvlog/Sink.h"
 
 namespace CVLog {
 namespace {
 
+using std::chrono::system_clock;
 using Tarn::Common::FileDescriptor;
+using Status = struct stat;
 
-// Non-blocking, or a pipe without a reader would hold the broker.
+// Non-blocking: a pipe without a reader must not stop the broker.
 constexpr int appending = O_WRONLY | O_APPEND | O_CLOEXEC | O_NOCTTY | O_NONBLOCK;
 constexpr mode_t modeOfNew = S_IRUSR | S_IWUSR | S_IRGRP;
 
@@ -33,37 +31,19 @@ constexpr mode_t modeOfNew = S_IRUSR | S_IWUSR | S_IRGRP;
   throw std::system_error(errno, std::generic_category(), what);
 }
 
-std::optional<struct stat> statusOf(int descriptor) {
-  struct stat status {};
-  return fstat(descriptor, &status) == 0 ? std::optional(status) : std::nullopt;
+/// All zero if there is no such file.
+Status statusOf(int descriptor) {
+  Status status{};
+  return fstat(descriptor, &status) == 0 ? status : Status{};
 }
 
-std::optional<struct stat> statusOf(const std::string& path) {
-  struct stat status {};
-  return stat(path.c_str(), &status) == 0 ? std::optional(status) : std::nullopt;
+Status statusOf(const std::string& path) {
+  Status status{};
+  return stat(path.c_str(), &status) == 0 ? status : Status{};
 }
 
-/// The device, number and size of the file of that name. Who asks for the times of a file, as stat does, makes the next
-/// write to it slower.
-std::optional<struct stat> sizeAndIdentityOf(const std::string& path) {
-  struct statx extended {};
-  // What another machine may have done to a file in the meantime is not worth waiting for.
-  if (statx(AT_FDCWD, path.c_str(), AT_STATX_DONT_SYNC, STATX_INO | STATX_SIZE, &extended) != 0) {
-    return errno == ENOENT ? std::nullopt : statusOf(path);  // some sandboxes refuse statx
-  }
-  struct stat status {};
-  status.st_dev = makedev(extended.stx_dev_major, extended.stx_dev_minor);
-  status.st_ino = extended.stx_ino;
-  status.st_size = static_cast<off_t>(extended.stx_size);
-  return status;
-}
-
-bool isRegular(const std::optional<struct stat>& status) {
-  return status && S_ISREG(status->st_mode);
-}
-
-bool isSameFile(const std::optional<struct stat>& a, const std::optional<struct stat>& b) {
-  return a && b && a->st_dev == b->st_dev && a->st_ino == b->st_ino;
+bool isSameFile(const Status& a, const Status& b) {
+  return a.st_ino != 0 && a.st_dev == b.st_dev && a.st_ino == b.st_ino;
 }
 
 FileDescriptor openLog(const std::string& path) {
@@ -71,216 +51,188 @@ FileDescriptor openLog(const std::string& path) {
   if (!file) {
     fail("log file " + path + " cannot be opened");
   }
-  const std::optional<struct stat> status = statusOf(file.number());
-  if (!isRegular(status) && !(status && S_ISCHR(status->st_mode))) {
+  const mode_t mode = statusOf(file.number()).st_mode;
+  if (!S_ISREG(mode) && !S_ISCHR(mode)) {
     throw std::runtime_error("log file " + path + " is not a regular file");
   }
   return file;
 }
 
-/// Opens the file of that name in the place of another, or makes it with the owner, group and mode of the other, so
-/// that who could write to that one can write to this.
-FileDescriptor openSuccessor(const std::string& path, const struct stat& predecessor) {
-  FileDescriptor next(open(path.c_str(), appending | O_CREAT | O_EXCL, modeOfNew));
-  if (!next) {
-    next = FileDescriptor(open(path.c_str(), appending));
-    if (!next && errno == ENOENT) {  // a symbolic link that leads nowhere: O_EXCL follows none
-      next = FileDescriptor(open(path.c_str(), appending | O_CREAT, modeOfNew));
-    }
-    if (!next) {
-      fail("cannot be opened again");
-    }
-    return next;
-  }
-  constexpr uid_t asItIs = -1;
-  constexpr mode_t permissions = S_IRWXU | S_IRWXG | S_IRWXO;
-  // Only a privileged process gives files away; the group may be one of the owner's.
-  if (fchown(next.number(), predecessor.st_uid, predecessor.st_gid) == 0 ||
-      fchown(next.number(), asItIs, predecessor.st_gid) == 0) {
-    fchmod(next.number(), predecessor.st_mode & permissions);
-  }
-  return next;
-}
-
-/// The lock of a file, where nobody else has it.
-class FileLock {
- public:
-  explicit FileLock(int descriptor) : descriptor_(descriptor), isHeld_(flock(descriptor, LOCK_EX | LOCK_NB) == 0) {
-    if (!isHeld_ && errno != EWOULDBLOCK) {
-      fail("cannot be locked for its rotation");
-    }
-  }
-  FileLock(const FileLock&) = delete;
-  FileLock& operator=(const FileLock&) = delete;
-  // Closing is not enough: a child that was forked in the meantime has the descriptor, too.
-  ~FileLock() { flock(descriptor_, LOCK_UN); }
-
-  explicit operator bool() const { return isHeld_; }
-
- private:
-  int descriptor_;
-  bool isHeld_;
-};
-
-/// Whether the path stands for something that is open or has a name elsewhere, such as /dev/stderr: what it leads to is
-/// not the logger's to rename.
+/// Whether the path is a second name for something that is open or has a name elsewhere, such as /dev/stderr.
 bool isAnotherName(std::string_view path) {
   return path.starts_with("/dev/") || path.starts_with("/proc/");
 }
 
-/// Whether a write can end the process (see HeldBackSignal).
 bool hasSizeLimit() {
   rlimit limit{};
   return getrlimit(RLIMIT_FSIZE, &limit) != 0 || limit.rlim_cur != RLIM_INFINITY;
 }
 
-/// The path without symbolic links: what is rotated is the file, not a link to it.
+/// Gives the file the owner, group and mode of another, so that whoever could write to that one can write to this.
+void takeAccessOf(const Status& before, int descriptor) {
+  constexpr uid_t unchanged = -1;
+  constexpr mode_t permissions = S_IRWXU | S_IRWXG | S_IRWXO;
+  // Only a privileged process may change the owner; the group may be one of the owner's.
+  if (fchown(descriptor, before.st_uid, before.st_gid) == 0 || fchown(descriptor, unchanged, before.st_gid) == 0) {
+    fchmod(descriptor, before.st_mode & permissions);
+  }
+}
+
+std::string oldFile(const std::string& path, unsigned number) {
+  return path + '.' + std::to_string(number);
+}
+
+bool isTaken(const std::string& path) {
+  Status status{};
+  return lstat(path.c_str(), &status) == 0 || errno != ENOENT;
+}
+
+/// Renames FILE to FILE.1, FILE.1 to FILE.2 before that, and so on up to FILE.keep, which is dropped.
+void makeOld(const std::string& path, unsigned keep) {
+  // Only up to the first gap: a failed attempt leaves one, and the next must not drop the oldest file for it.
+  unsigned last = 1;
+  while (last < keep && isTaken(oldFile(path, last))) {
+    ++last;
+  }
+  for (unsigned number = last; number != 0; --number) {
+    const std::string from = number == 1 ? path : oldFile(path, number - 1);
+    if (std::rename(from.c_str(), oldFile(path, number).c_str()) != 0) {
+      fail("cannot be rotated: " + from + " cannot be renamed to " + oldFile(path, number));
+    }
+  }
+}
+
+/// The path without symbolic links: the file is rotated, not a link to it.
 std::string realPath(const std::string& path) {
   std::error_code error;
   const std::filesystem::path real = std::filesystem::canonical(path, error);
   return error ? path : real.string();
 }
 
-}  // namespace
+/// Closing is not enough: a child that was forked in the meantime has the descriptor, too.
+struct Unlock {
+  int descriptor;
+  ~Unlock() { flock(descriptor, LOCK_UN); }
+};
 
-FileSink::FileSink(const std::string& path, Rotation rotation, Clock::duration retryAfter)
-    : path_(std::filesystem::absolute(path).string()),
-      rotation_(rotation),
-      retryAfter_(retryAfter),
-      file_(openLog(path)),
-      isFollowed_(isRegular(statusOf(file_.number())) && !isAnotherName(path_)),
-      mayBeTooLarge_(hasSizeLimit()) {
-  if (const std::optional<struct stat> status = statusOf(file_.number())) {
-    identity_.set(*status);
-  }
-}
+class FileSink final : public Sink {
+ public:
+  FileSink(const std::string& path, const Rotation& rotation)
+      : path_(std::filesystem::absolute(path).string()),
+        rotation_(rotation),
+        file_(openLog(path)),
+        identity_(statusOf(file_.number())),
+        isFollowed_(S_ISREG(identity_.st_mode) && !isAnotherName(path_)),
+        signalOfTooLarge_(hasSizeLimit() ? SIGXFSZ : 0) {}
+  FileSink(const FileSink&) = delete;
+  FileSink& operator=(const FileSink&) = delete;
+  ~FileSink() override { releaseIfForeign(); }
 
-void FileSink::write(const Message& message) {
-  std::string line = formatLine(message) + '\n';
-  if (isFollowed_) {
-    followName(line.size());
+  void write(const Message& message) override {
+    const std::string line = formatLine(message) + '\n';
+    if (isFollowed_) {
+      followName(line.size(), message.time);
+    }
+    writeLine(file_.number(), line, signalOfTooLarge_);
   }
-  std::optional<HeldBackSignal> held;
-  if (mayBeTooLarge_) {
-    held.emplace(SIGXFSZ);
-  }
-  const End before = end_.load(std::memory_order_relaxed);
-  if (before != End::OfLine && isTorn(before)) {
-    line.insert(line.begin(), '\n');
-  }
-  const std::size_t written = writeLine(file_.number(), line);
-  if (written != line.size()) {
-    end_.store(written == 0 ? End::Unknown : End::Torn, std::memory_order_relaxed);
-  } else if (before != End::OfLine) {
-    end_.store(End::OfLine, std::memory_order_relaxed);
-  }
-}
 
-bool FileSink::isTorn(End known) const {
-  if (isFollowed_) {
-    const FileDescriptor file(open(path_.c_str(), O_RDONLY | O_CLOEXEC | O_NOCTTY | O_NONBLOCK));
-    const std::optional<struct stat> status = statusOf(file.number());
-    char last = '\n';
-    if (status && identity_.isThatOf(*status) &&
-        (status->st_size == 0 || pread(file.number(), &last, 1, status->st_size - 1) == 1)) {
-      return last != '\n';
+ private:
+  /// A process that closes descriptors it does not know may have given the number to another file.
+  void releaseIfForeign() {
+    if (!isSameFile(identity_, statusOf(file_.number()))) {
+      file_.release();
+      identity_ = {};
     }
   }
-  return known == End::Torn;
-}
 
-void FileSink::followName(std::size_t lineSize) {
-  const std::optional<struct stat> named = sizeAndIdentityOf(path_);
-  const bool isStale = !named || !identity_.isThatOf(*named);
-  if (!isStale && !wouldOutgrow(named->st_size, lineSize)) {
-    return;
-  }
-  const Clock::rep retryAt = retryAt_.load(std::memory_order_relaxed);
-  if (retryAt != 0 && Clock::now().time_since_epoch().count() < retryAt) {
-    return;
-  }
-  const HeldFlag replacing(isBeingReplaced_);
-  if (!replacing) {
-    return;
-  }
-  const std::optional<struct stat> current = statusOf(file_.number());
-  if (!current || !identity_.isThatOf(*current)) {
-    return;  // the process has closed the descriptor; its number may be anything now
-  }
-  try {
-    if (isStale) {
-      adopt(openSuccessor(path_, *current));
-    } else if (!rotate(lineSize)) {
+  void followName(std::size_t lineSize, system_clock::time_point now) {
+    releaseIfForeign();
+    const Status named = statusOf(path_);
+    const bool isMoved = !isSameFile(identity_, named);
+    if ((!isMoved && !wouldOutgrow(named, lineSize)) || isTooEarly(now)) {
       return;
     }
-    retryAt_.store(0, std::memory_order_relaxed);
-  } catch (const std::exception& error) {
-    retryAt_.store((Clock::now() + retryAfter_).time_since_epoch().count(), std::memory_order_relaxed);
-    if (retryAt == 0) {
-      report(error.what());
+    try {
+      if (isMoved) {
+        openAgain(path_);
+      } else {
+        rotate(lineSize);
+      }
+      failedAt_.reset();
+    } catch (const std::exception& error) {
+      if (!std::exchange(failedAt_, now)) {
+        const std::string text =
+            "log file " + path_ + ' ' + error.what() + "; messages go to the file that is open, however large";
+        writeToSystemLog(ownMessage(levelWarning, "FileSink.cpp", text));
+      }
     }
   }
-}
 
-bool FileSink::Identity::isThatOf(const struct stat& status) const {
-  return device_.load(std::memory_order_relaxed) == status.st_dev &&
-         number_.load(std::memory_order_relaxed) == status.st_ino;
-}
-
-void FileSink::Identity::set(const struct stat& status) {
-  device_.store(status.st_dev, std::memory_order_relaxed);
-  number_.store(status.st_ino, std::memory_order_relaxed);
-}
-
-bool FileSink::wouldOutgrow(off_t size, std::size_t lineSize) const {
-  return rotation_.size != 0 && size > 0 && static_cast<std::uint64_t>(size) + lineSize > rotation_.size;
-}
-
-bool FileSink::rotate(std::size_t lineSize) {
-  // Opened anew: a lock belongs to what open(2) made, and that of file_ may be shared with a forked process.
-  const FileDescriptor locked(open(path_.c_str(), appending));
-  if (!locked) {
-    fail("cannot be opened for its rotation");
+  /// After a failure, attempts are a minute apart. A clock that was set back allows one, too.
+  [[nodiscard]] bool isTooEarly(system_clock::time_point now) const {
+    return failedAt_ && now >= *failedAt_ && now < *failedAt_ + std::chrono::minutes(1);
   }
-  const FileLock lock(locked.number());
-  if (!lock) {
-    return false;  // somebody else is at it
+
+  [[nodiscard]] bool wouldOutgrow(const Status& file, std::size_t lineSize) const {
+    return rotation_.size != 0 && file.st_size > 0 &&
+           static_cast<std::uint64_t>(file.st_size) + lineSize > rotation_.size;
   }
-  const std::optional<struct stat> current = statusOf(locked.number());
-  if (!current) {
-    fail("cannot be rotated");
-  }
-  if (!isSameFile(current, statusOf(path_))) {
-    adopt(openSuccessor(path_, *current));  // somebody else was faster
-  } else if (!wouldOutgrow(current->st_size, lineSize)) {
-    adopt(locked);  // somebody else was faster still
-  } else {
+
+  void rotate(std::size_t lineSize) {
     const std::string real = realPath(path_);
-    makeOld(real, rotation_.keep);
-    adopt(openSuccessor(real, *current));
+    // Never removed: without the file that others have locked, two processes could hold a lock each.
+    const std::string beside = real + ".lock";
+    const FileDescriptor lock(
+        open(beside.c_str(), O_RDONLY | O_CREAT | O_NOFOLLOW | O_CLOEXEC | O_NOCTTY | O_NONBLOCK, modeOfNew));
+    if (!lock || flock(lock.number(), LOCK_EX | LOCK_NB) != 0) {
+      if (lock && errno == EWOULDBLOCK) {
+        return;
+      }
+      fail("cannot be locked for its rotation with " + beside);
+    }
+    const Unlock unlock{lock.number()};
+    // Another process may have rotated the file before the lock was free.
+    const Status named = statusOf(path_);
+    if (isSameFile(identity_, named) && wouldOutgrow(named, lineSize)) {
+      makeOld(real, rotation_.keep);
+    }
+    openAgain(real);
   }
-  return true;
-}
 
-void FileSink::adopt(const FileDescriptor& next) {
-  const std::optional<struct stat> status = statusOf(next.number());
-  if (!isRegular(status)) {
-    throw std::runtime_error("is not a regular file any more");
+  void openAgain(const std::string& path) {
+    FileDescriptor next(open(path.c_str(), appending | O_CREAT | O_EXCL, modeOfNew));
+    if (next) {
+      if (file_) {
+        takeAccessOf(statusOf(file_.number()), next.number());
+      }
+    } else {
+      // The name is taken, perhaps by a symbolic link that leads to no file yet.
+      next = FileDescriptor(open(path.c_str(), appending | O_CREAT, modeOfNew));
+    }
+    if (!next) {
+      fail("cannot be opened again");
+    }
+    const Status status = statusOf(next.number());
+    if (!S_ISREG(status.st_mode)) {
+      throw std::runtime_error("is not a regular file any more");
+    }
+    file_ = std::move(next);
+    identity_ = status;
   }
-  int number = -1;
-  do {
-    number = dup3(next.number(), file_.number(), O_CLOEXEC);
-  } while (number < 0 && errno == EINTR);
-  if (number < 0) {
-    fail("cannot be replaced");
-  }
-  identity_.set(*status);
-}
 
-void FileSink::report(std::string_view why) const {
-  const std::string text =
-      "log file " + path_ + ' ' + std::string(why) + "; messages go to the file that is open, however large";
-  SystemLogSink().write(ownMessage(levelWarning, "FileSink.cpp", text));
+  const std::string path_;  // absolute
+  const Rotation rotation_;
+  FileDescriptor file_;
+  Status identity_;             // of the file that was opened
+  const bool isFollowed_;       // a regular file under a name of its own
+  const int signalOfTooLarge_;  // SIGXFSZ if the process has a limit for the size of files, else 0
+  std::optional<system_clock::time_point> failedAt_;  // if the last attempt to open or rename a file failed
+};
+
+}  // namespace
+
+std::unique_ptr<Sink> openFile(const std::string& path, const Rotation& rotation) {
+  return std::make_unique<FileSink>(path, rotation);
 }
 
 }  // namespace CVLog

@@ -1,26 +1,38 @@
 #ifndef CORVANE_PLATFORM_CVLOG_LEVEL_H
 #define CORVANE_PLATFORM_CVLOG_LEVEL_H
 
-#include <optional>
+#include <iterator>
 #include <string_view>
 
 namespace CVLog {
 
-/// The levels with a name. Any number is a level; it has the name of the nearest named level below it,
-/// and "debug" where there is none.
 inline constexpr int levelDebug = 3000;
 inline constexpr int levelInfo = 4000;
 inline constexpr int levelWarning = 5000;
 inline constexpr int levelError = 6000;
 
-/// "error", "warning", "info" or "debug".
-std::string_view levelName(int level);
+struct NamedLevel {
+  int level;
+  std::string_view name;
+  int severity;  ///< in the system log (RFC 5424), which is also the priority for syslog(3)
+};
 
-/// The priority that syslog(3) gives messages of this level: LOG_ERR, LOG_WARNING, LOG_INFO or LOG_DEBUG.
-int syslogPriority(int level);
+inline constexpr NamedLevel namedLevels[] = {
+    {levelError, "error", 3},
+    {levelWarning, "warning", 4},
+    {levelInfo, "info", 6},
+    {levelDebug, "debug", 7},
+};
 
-/// A level as the configuration writes it: one of the names in any case, or a number from 0 on.
-std::optional<int> parseLevel(std::string_view text);
+/// Any number is a level. It is treated as the nearest named level below it, and as debug if there is none.
+constexpr const NamedLevel& namedLevel(int level) {
+  for (const NamedLevel& row : namedLevels) {
+    if (level >= row.level) {
+      return row;
+    }
+  }
+  return *(std::end(namedLevels) - 1);
+}
 
 }  // namespace CVLog
 

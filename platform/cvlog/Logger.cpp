@@ -1,16 +1,23 @@
-#include "platform/cvlog/Logger.h"
+#include <cvlog/CVLogger.h>
+#include <pthread.h>
+#include <unistd.h>
 
+#include <cerrno>
+#include <ctime>
+#include <exception>
 #include <limits>
+#include <memory>
+#include <optional>
 #include <stdexcept>
+#include <string>
 #include <string_view>
 #include <utility>
+#include <vector>
 
+#include "platform/common/ConfigurationFile.h"
 #include "platform/common/Environment.h"
-#include "platform/cvlog/FileSink.h"
-#include "platform/cvlog/HeldFlag.h"
-#include "platform/cvlog/RateLimitedSink.h"
-#include "platform/cvlog/StandardErrorSink.h"
-#include "platform/cvlog/SystemLogSink.h"
+#include "platform/cvlog/Settings.h"
+#include "platform/cvlog/Sink.h"
 
 namespace CVLog {
 namespace {
@@ -19,127 +26,201 @@ using Tarn::Common::ConfigurationFile;
 using Tarn::Common::ConfigurationProblem;
 using Tarn::Common::environmentOverride;
 
-constexpr int noLevel = std::numeric_limits<int>::max();
-
-std::unique_ptr<Sink> openDestination(const SinkSettings& settings) {
-  const Destination& destination = settings.destination;
-  switch (destination.kind) {
-    case DestinationKind::StandardError:
-      return std::make_unique<StandardErrorSink>();
-    case DestinationKind::SystemLog:
-      return std::make_unique<SystemLogSink>();
-    case DestinationKind::File:
-      return std::make_unique<FileSink>(destination.path, settings.rotation);
-    case DestinationKind::None:
-      break;
-  }
-  return nullptr;
-}
-
-std::unique_ptr<Sink> openSink(const SinkSettings& settings) {
-  std::unique_ptr<Sink> sink = openDestination(settings);
-  if (sink && settings.perMinute != 0) {
-    return std::make_unique<RateLimitedSink>(std::move(sink), settings.perMinute);
-  }
-  return sink;
-}
-
 constexpr std::string_view thisFile = "Logger.cpp";
+
+/// Leaves errno as it is, and delays the cancellation of the thread until the logger is done.
+class Undisturbed {
+ public:
+  Undisturbed() { pthread_setcancelstate(PTHREAD_CANCEL_DISABLE, &cancelState_); }
+  Undisturbed(const Undisturbed&) = delete;
+  Undisturbed& operator=(const Undisturbed&) = delete;
+  ~Undisturbed() {
+    pthread_setcancelstate(cancelState_, nullptr);
+    errno = errno_;
+  }
+
+ private:
+  int errno_ = errno;
+  int cancelState_ = PTHREAD_CANCEL_ENABLE;
+};
+
+/// Admits one thread of the process at a time. A process that is forked while a thread is inside has a copy of
+/// half-changed data and nobody who completes it: there nobody is admitted any more, and nobody waits.
+class Admission {
+ public:
+  Admission(std::atomic<pid_t>& inside, bool waits) : inside_(inside) {
+    const pid_t self = getpid();
+    pid_t other = 0;
+    while (!(isGranted_ = inside_.compare_exchange_strong(other, self, std::memory_order_acquire))) {
+      if (other != self || !waits) {
+        return;
+      }
+      inside_.wait(other, std::memory_order_relaxed);
+      other = 0;
+    }
+  }
+  Admission(const Admission&) = delete;
+  Admission& operator=(const Admission&) = delete;
+  ~Admission() {
+    if (isGranted_) {
+      inside_.store(0, std::memory_order_release);
+      inside_.notify_one();
+    }
+  }
+
+  explicit operator bool() const { return isGranted_; }
+
+ private:
+  std::atomic<pid_t>& inside_;
+  bool isGranted_ = false;
+};
 
 }  // namespace
 
-Logger& Logger::instance() {
-  static Logger logger(ConfigurationFile::ofThisProcess(), environmentOverride("CORVANE_LOG"),
-                       environmentOverride("CORVANE_TRACE"));
-  return logger;
-}
+/// The settings of a sink that are in force, and the sink.
+struct Route {
+  SinkSettings wanted{};
+  bool isFallback = true;  ///< the default, because the settings wanted cannot be had
+  int level = 0;           ///< the lowest that is accepted
+  std::unique_ptr<Sink> sink{};
 
-Logger::Logger(ConfigurationFile file, std::optional<std::string> logOverride, std::optional<std::string> traceOverride)
-    : file_(std::move(file)),
-      logOverride_(std::move(logOverride)),
-      traceOverride_(std::move(traceOverride)),
-      routes_(makeRoutes(nullptr)) {
-  setThresholds(routes_.inForce());
-  CVLogger::isClosed_.store(false, std::memory_order_relaxed);
-}
+  [[nodiscard]] int threshold() const { return sink ? level : std::numeric_limits<int>::max(); }
 
-Logger::~Logger() {
-  CVLogger::isClosed_.store(true, std::memory_order_relaxed);
-  CVLogger::logThreshold_.store(noLevel, std::memory_order_relaxed);
-  CVLogger::traceThreshold_.store(noLevel, std::memory_order_relaxed);
-}
-
-void Logger::followConfiguration() {
-  const HeldFlag following(isFollowing_);
-  if (!following) {
-    return;
-  }
-  if (file_.hasChanged()) {
-    routes_.replace(makeRoutes(&routes_.inForce()));
-    setThresholds(routes_.inForce());
-    noteThatFileWasRead();
-  }
-  routes_.discardUnused();
-}
-
-int Logger::Route::threshold() const {
-  return sink ? level : noLevel;
-}
-
-void Logger::setThresholds(const Routes& routes) {
-  CVLogger::logThreshold_.store(routes.log.threshold(), std::memory_order_relaxed);
-  CVLogger::traceThreshold_.store(routes.trace.threshold(), std::memory_order_relaxed);
-}
-
-std::unique_ptr<const Logger::Routes> Logger::makeRoutes(const Routes* before) {
-  const Settings settings = makeSettings(file_.read(), logOverride_, traceOverride_);
-  std::vector<ConfigurationProblem> problems = settings.problems;
-  auto routes = std::make_unique<Routes>();
-  routes->log = makeRoute(settings.log, defaultLog(), before != nullptr ? &before->log : nullptr, problems);
-  routes->trace = makeRoute(settings.trace, defaultTrace(), before != nullptr ? &before->trace : nullptr, problems);
-  report(problems);
-  return routes;
-}
-
-Logger::Route Logger::makeRoute(const SinkSettings& wanted, const SinkSettings& fallback, const Route* before,
-                                std::vector<ConfigurationProblem>& problems) {
-  if (before != nullptr && !before->isFallback && wanted.differsOnlyInLevel(before->wanted)) {
-    return {.wanted = wanted, .isFallback = false, .level = wanted.level, .sink = before->sink};
-  }
-  try {
-    return {.wanted = wanted, .isFallback = false, .level = wanted.level, .sink = openSink(wanted)};
-  } catch (const std::runtime_error& error) {
-    problems.push_back({error.what(), "the default destination is used"});
-    return {.wanted = wanted, .isFallback = true, .level = fallback.level, .sink = openSink(fallback)};
-  }
-}
-
-void Logger::report(const std::vector<ConfigurationProblem>& problems) {
-  if (problems.empty()) {
-    return;
-  }
-  // Not the configured sink: what is broken may be just that.
-  const std::unique_ptr<Sink> sink = openSink(defaultLog());
-  for (const ConfigurationProblem& problem : problems) {
-    const std::string text = "Configuration: " + problem.where + ": " + problem.why;
-    sink->write(ownMessage(levelError, thisFile, text));
-  }
-}
-
-void Logger::noteThatFileWasRead() {
-  const std::string text = "Configuration: " + file_.path() + " was read again";
-  const Message message = ownMessage(levelInfo, thisFile, text);
-  log(message);
-  trace(message);
-}
-
-void Logger::deliver(Route Routes::*sink, const Message& message) {
-  routes_.with([&](const Routes& routes) {
-    const Route& route = routes.*sink;
-    if (route.sink && message.level >= route.level) {
-      route.sink->write(message);
+  void write(const Message& message) const {
+    if (sink && message.level >= level) {
+      sink->write(message);
     }
-  });
+  }
+
+  /// A sink whose settings stay the same stays as it is, with its open file and the count of its limit.
+  void change(const SinkSettings& next, const SinkSettings& fallback, std::vector<ConfigurationProblem>& problems) {
+    wanted.level = next.level;  // a change of the level alone needs no other sink
+    if (!isFallback && wanted == next) {
+      level = next.level;
+      return;
+    }
+    try {
+      *this = {.wanted = next, .isFallback = false, .level = next.level, .sink = openSink(next)};
+    } catch (const std::runtime_error& error) {
+      problems.push_back({error.what(), "the default destination is used"});
+      *this = {.wanted = next, .isFallback = true, .level = fallback.level, .sink = openSink(fallback)};
+    }
+  }
+};
+
+/// The two sinks of this process and the thresholds in front of them.
+class Logger {
+ public:
+  static Logger& instance() {
+    static Logger logger;
+    return logger;
+  }
+
+  Logger() { readConfiguration(); }
+  Logger(const Logger&) = delete;
+  Logger& operator=(const Logger&) = delete;
+  /// A thread may still log while the library is unloaded.
+  ~Logger() {
+    CVLogger::isClosed_.store(true, std::memory_order_relaxed);
+    setThresholds({}, {});
+  }
+
+  void deliver(bool isTrace, const Message& message) {
+    if (const Admission admission(inside_, true); admission) {
+      (isTrace ? trace_ : log_).write(message);
+    }
+  }
+
+  /// Costs one system call if the configuration file has not changed, and nothing while another thread logs.
+  void followConfiguration() {
+    const Admission admission(inside_, false);
+    if (admission && file_.hasChanged()) {
+      readConfiguration();
+      noteThatFileWasRead();
+    }
+  }
+
+ private:
+  static void setThresholds(const Route& log, const Route& trace) {
+    CVLogger::logThreshold_.store(log.threshold(), std::memory_order_relaxed);
+    CVLogger::traceThreshold_.store(trace.threshold(), std::memory_order_relaxed);
+  }
+
+  void readConfiguration() {
+    const Settings settings = makeSettings(file_.read(), logOverride_, traceOverride_);
+    std::vector<ConfigurationProblem> problems = settings.problems;
+    log_.change(settings.log, defaultLog(), problems);
+    trace_.change(settings.trace, {}, problems);
+    setThresholds(log_, trace_);
+    report(problems);
+  }
+
+  static void report(const std::vector<ConfigurationProblem>& problems) {
+    if (problems.empty()) {
+      return;
+    }
+    // Not to the configured sink: that may be what is wrong.
+    const std::unique_ptr<Sink> sink = openSink(defaultLog());
+    for (const ConfigurationProblem& problem : problems) {
+      const std::string text = "Configuration: " + problem.where + ": " + problem.why;
+      sink->write(ownMessage(levelError, thisFile, text));
+    }
+  }
+
+  void noteThatFileWasRead() const {
+    const std::string text = "Configuration: " + file_.path() + " was read again";
+    const Message message = ownMessage(levelInfo, thisFile, text);
+    log_.write(message);
+    trace_.write(message);
+  }
+
+  std::atomic<pid_t> inside_{0};  // the process whose thread is inside; 0 if there is none
+  ConfigurationFile file_ = ConfigurationFile::ofThisProcess();
+  const std::optional<std::string> logOverride_ = environmentOverride("CORVANE_LOG");
+  const std::optional<std::string> traceOverride_ = environmentOverride("CORVANE_TRACE");
+  Route log_;
+  Route trace_;
+};
+
+void CVLogger::followConfiguration() {
+  constexpr unsigned never = -1;
+  static std::atomic<unsigned> lastLook{never};
+  timespec time{};
+  clock_gettime(CLOCK_MONOTONIC_COARSE, &time);  // without a system call
+  const auto now = static_cast<unsigned>(time.tv_sec);
+  if (lastLook.load(std::memory_order_relaxed) == now) [[likely]] {
+    return;
+  }
+  if (isClosed_.load(std::memory_order_relaxed) || lastLook.exchange(now, std::memory_order_relaxed) == now) {
+    return;
+  }
+  const Undisturbed undisturbed;
+  try {
+    Logger::instance().followConfiguration();
+  } catch (const std::exception&) {
+    // Out of memory: the configuration in force stays until the file changes again.
+  }
+}
+
+void CVLogger::deliver(bool isTrace, const char* function, const char* file, int line, const std::string& component,
+                       int level, const std::string& text) {
+  if (isClosed_.load(std::memory_order_relaxed)) {
+    return;
+  }
+  const auto textOrNothing = [](const char* name) { return name == nullptr ? std::string_view() : name; };
+  const Undisturbed undisturbed;
+  try {
+    const Message message = {.time = std::chrono::system_clock::now(),
+                             .level = level,
+                             .component = component,
+                             .function = textOrNothing(function),
+                             .file = textOrNothing(file),
+                             .line = line,
+                             .text = text};
+    Logger::instance().deliver(isTrace, message);
+  } catch (const std::exception&) {
+    // Out of memory: the message is lost.
+  }
 }
 
 }  // namespace CVLog

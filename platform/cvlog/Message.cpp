@@ -3,55 +3,33 @@
 #include <array>
 #include <cstdio>
 
+#include "platform/common/Ascii.h"
 #include "platform/common/Hex.h"
 #include "platform/cvlog/Level.h"
 
 namespace CVLog {
 namespace {
 
-using std::chrono::days;
-using std::chrono::floor;
-using std::chrono::hh_mm_ss;
-using std::chrono::milliseconds;
-using std::chrono::system_clock;
-using std::chrono::year_month_day;
-
-bool mustEscape(char c) {
-  const auto byte = static_cast<unsigned char>(c);
-  return byte < 0x20 || byte == 0x7f || c == '\\';
-}
-
-void appendEscapedByte(std::string& line, char c) {
-  switch (c) {
-    case '\\':
+void appendEscaped(std::string& line, std::string_view text) {
+  for (const char c : text) {
+    if (c == '\\') {
       line += "\\\\";
-      return;
-    case '\n':
+    } else if (c == '\n') {
       line += "\\n";
-      return;
-    case '\r':
+    } else if (c == '\r') {
       line += "\\r";
-      return;
-    case '\t':
+    } else if (c == '\t') {
       line += "\\t";
-      return;
-    default:
+    } else if (Tarn::Common::isControl(c)) {
       line += "\\x";
       Tarn::Common::appendHex(line, static_cast<unsigned char>(c));
-  }
-}
-
-void appendEscaped(std::string& line, std::string_view text) {
-  for (char c : text) {
-    if (mustEscape(c)) {
-      appendEscapedByte(line, c);
     } else {
       line += c;
     }
   }
 }
 
-/// A field before the text: never empty and without blanks, so that a line splits at blanks.
+/// A field before the text. It is never empty and has no blanks, so that a line splits at blanks.
 void appendField(std::string& line, std::string_view text) {
   const std::size_t start = line.size();
   appendEscaped(line, text.empty() ? "-" : text);
@@ -61,8 +39,9 @@ void appendField(std::string& line, std::string_view text) {
   line += ' ';
 }
 
-// Calendar arithmetic instead of gmtime: the C library's conversions read the process's time zone.
-void appendTime(std::string& line, system_clock::time_point time) {
+// Not gmtime: the C library's conversions read the process's time zone.
+void appendTime(std::string& line, std::chrono::system_clock::time_point time) {
+  using namespace std::chrono;
   const auto today = floor<days>(time);
   const year_month_day date(today);
   const hh_mm_ss clock(floor<milliseconds>(time - today));
@@ -82,19 +61,11 @@ void appendSourceAndText(std::string& line, const Message& message) {
   appendEscaped(line, message.text);
 }
 
-// Time, level and the blanks between the fields.
-constexpr std::size_t lineOverhead = 64;
-
-std::string roomFor(const Message& message) {
-  std::string line;
-  line.reserve(lineOverhead + message.component.size() + message.function.size() + message.file.size() +
-               message.text.size());
-  return line;
-}
+constexpr std::size_t timeLevelAndBlanks = 64;
 
 }  // namespace
 
-Message ownMessage(int level, std::string_view file, std::string_view text, system_clock::time_point time,
+Message ownMessage(int level, std::string_view file, std::string_view text, std::chrono::system_clock::time_point time,
                    std::string_view function, int line) {
   return {.time = time,
           .level = level,
@@ -106,15 +77,17 @@ Message ownMessage(int level, std::string_view file, std::string_view text, syst
 }
 
 std::string formatLine(const Message& message) {
-  std::string line = roomFor(message);
+  std::string line;
+  line.reserve(timeLevelAndBlanks + message.component.size() + message.function.size() + message.file.size() +
+               message.text.size());
   appendTime(line, message.time);
-  line.append(levelName(message.level)).append(" ");
+  line.append(namedLevel(message.level).name).append(" ");
   appendSourceAndText(line, message);
   return line;
 }
 
 std::string formatForSystemLog(const Message& message) {
-  std::string line = roomFor(message);
+  std::string line;
   appendSourceAndText(line, message);
   return line;
 }

@@ -1,6 +1,7 @@
 #ifndef CORVANE_PLATFORM_CVLOG_SETTINGS_H
 #define CORVANE_PLATFORM_CVLOG_SETTINGS_H
 
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -8,7 +9,6 @@
 
 #include "platform/common/Configuration.h"
 #include "platform/cvlog/Level.h"
-#include "platform/cvlog/Rotation.h"
 
 namespace CVLog {
 
@@ -16,26 +16,24 @@ enum class DestinationKind { None, StandardError, SystemLog, File };
 
 struct Destination {
   DestinationKind kind = DestinationKind::None;
-  std::string path;  ///< of a file
+  std::string path{};  ///< of a file
 
   friend bool operator==(const Destination&, const Destination&) = default;
 };
 
-// A forgotten trace must not fill a disk: 80 MiB at most, with the defaults.
-inline constexpr Rotation defaultRotation = {.size = std::uint64_t{16} << 20U, .keep = 4};
+struct Rotation {
+  std::uint64_t size = 0;  ///< of the largest file in bytes; 0 is no limit
+  unsigned keep = 1;       ///< old files, at least 1
 
-/// What one sink takes and where it goes.
+  friend bool operator==(const Rotation&, const Rotation&) = default;
+};
+
+/// The default trace has no destination: with one, it accepts everything.
 struct SinkSettings {
-  int level = levelDebug;  ///< the lowest level that is taken
-  Destination destination;
-  unsigned perMinute = 0;               ///< messages; 0 is no limit
-  Rotation rotation = defaultRotation;  ///< of a file
-
-  /// The level stands in front of the sink: another one needs no other sink.
-  bool differsOnlyInLevel(SinkSettings other) const {
-    other.level = level;
-    return other == *this;
-  }
+  int level = levelDebug;  ///< the lowest level that is accepted
+  Destination destination{};
+  unsigned perMinute = 0;                                             ///< messages; 0 is no limit
+  Rotation rotation = {.size = std::uint64_t{16} << 20U, .keep = 4};  ///< at most 80 MiB for a forgotten trace
 
   friend bool operator==(const SinkSettings&, const SinkSettings&) = default;
 };
@@ -43,23 +41,18 @@ struct SinkSettings {
 // The system log belongs to the whole machine; a provider that fails all the time must not fill it.
 inline constexpr unsigned systemLogPerMinute = 60;
 
-/// Errors go to the system log.
 inline SinkSettings defaultLog() {
-  return {.level = levelError, .destination = {DestinationKind::SystemLog, {}}, .perMinute = systemLogPerMinute};
-}
-/// Nothing is traced; a trace that only has a destination takes everything.
-inline SinkSettings defaultTrace() {
-  return {};
+  return {.level = levelError, .destination = {DestinationKind::SystemLog}, .perMinute = systemLogPerMinute};
 }
 
 struct Settings {
   SinkSettings log = defaultLog();
-  SinkSettings trace = defaultTrace();
-  std::vector<Tarn::Common::ConfigurationProblem> problems;
+  SinkSettings trace{};
+  std::vector<Tarn::Common::ConfigurationProblem> problems{};
 };
 
-/// The settings that the configuration file and the two overrides (the values of CORVANE_LOG and
-/// CORVANE_TRACE) make. A value that cannot be understood is noted and the one it would have replaced stays.
+/// The settings from the configuration file and the two overrides, the values of CORVANE_LOG and CORVANE_TRACE. A value
+/// that is not valid is noted as a problem and has no effect.
 Settings makeSettings(const Tarn::Common::Configuration& file, const std::optional<std::string>& logOverride,
                       const std::optional<std::string>& traceOverride);
 

@@ -11,7 +11,7 @@ namespace CVLog {
 ///
 /// Levels rise with importance; a sink takes the messages that reach its threshold. Both are configured
 /// with the first message, never at load, and follow their configuration from then on. All calls are safe
-/// from several threads, throw nothing and do not wait but for the destination's own write. A message that
+/// from several threads, throw nothing, and wait only for another message that is being written. A message that
 /// its sink does not take costs one comparison, and those that look after the configuration a coarse clock.
 class CVLogger {
  public:
@@ -23,7 +23,7 @@ class CVLogger {
       followConfiguration();
     }
     if (logTakes(level)) [[unlikely]] {
-      deliverToLog(function, file, line, component, level, text);
+      deliver(false, function, file, line, component, level, text);
     }
   }
   /// Delivers one message to the trace sink; the arguments are those of logLevelMessage.
@@ -31,7 +31,7 @@ class CVLogger {
                                 int level, char* /*extra*/, int /*extraLength*/, int /*reserved*/,
                                 const std::string& text) {
     if (traceTakes(level)) [[unlikely]] {
-      deliverToTrace(function, file, line, component, level, text);
+      deliver(true, function, file, line, component, level, text);
     }
   }
 
@@ -47,10 +47,8 @@ class CVLogger {
   // has changed. Each operation of a provider begins with one; the many below would only pay for the clock.
   static constexpr int kLooksAfterConfiguration = 4000;
   static void followConfiguration();
-  static void deliverToLog(const char* function, const char* file, int line, const std::string& component, int level,
-                           const std::string& text);
-  static void deliverToTrace(const char* function, const char* file, int line, const std::string& component, int level,
-                             const std::string& text);
+  static void deliver(bool isTrace, const char* function, const char* file, int line, const std::string& component,
+                      int level, const std::string& text);
 
   // Until the configuration is read every message passes, so that the first one has it read.
   static constexpr int kNotConfigured = std::numeric_limits<int>::min();

@@ -1,8 +1,12 @@
 #include "platform/cvlog/Message.h"
 
 #include <gtest/gtest.h>
+#include <syslog.h>
 
+#include <climits>
 #include <string>
+
+#include "platform/cvlog/Level.h"
 
 namespace {
 
@@ -66,6 +70,17 @@ TEST(Message, KeepsItsFieldsApart) {
   message.line = -1;
   message.text = "";
   EXPECT_EQ(formatForSystemLog(message), R"(- operator\x20new\n a\x20b.cpp:-1 )");
+}
+
+TEST(Message, LevelHasTheNameAndSeverityOfTheNamedLevelBelowIt) {
+  const CVLog::NamedLevel rows[] = {{INT_MAX, "error", LOG_ERR},    {6000, "error", LOG_ERR},
+                                    {5999, "warning", LOG_WARNING}, {5000, "warning", LOG_WARNING},
+                                    {4999, "info", LOG_INFO},       {4000, "info", LOG_INFO},
+                                    {3999, "debug", LOG_DEBUG},     {INT_MIN, "debug", LOG_DEBUG}};
+  for (const CVLog::NamedLevel& row : rows) {
+    EXPECT_EQ(CVLog::namedLevel(row.level).name, row.name) << row.level;
+    EXPECT_EQ(CVLog::namedLevel(row.level).severity, row.severity) << row.level;
+  }
 }
 
 }  // namespace
