@@ -1,14 +1,20 @@
 #include "companion/ComputerSystemInstance.h"
 
 #include <cmpimacs.h>
-#include <strings.h>
 
 #include <tarn/Common.h>
 #include <tarn/Locale.h>
 #include <string>
 
+#include "include/CmpiObjects.h"
+
 namespace Tarn::ComputerSystemProvider {
 namespace {
+
+using CPUProvider::addKey;
+using CPUProvider::equalIgnoringCase;
+using CPUProvider::isNull;
+using CPUProvider::setProperty;
 
 constexpr int messageCatalogue = 2;
 constexpr CMPIUint16 notApplicable = 12;  // RequestedState of what no client can switch
@@ -24,22 +30,21 @@ struct Target {
 
 void setText(const Target& target, const char* name, const std::string& text) {
   if (!text.empty()) {
-    CMSetProperty(target.instance, name, text.c_str(), CMPI_chars);
+    setProperty(target.instance, name, text.c_str());
   }
 }
 
 void setNumber(const Target& target, const char* name, CMPIUint16 value) {
-  CMSetProperty(target.instance, name, &value, CMPI_uint16);
+  setProperty(target.instance, name, CPUProvider::uint16Value, value);
 }
 
 void setList(const Target& target, const char* name, CMPIUint16 value) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
-  CMPIArray* array = CMNewArray(target.broker, 1, CMPI_uint16, &status);
-  if (isNull(array) || status.rc != CMPI_RC_OK) {
-    return;
+  const CMPIUint16 values[] = {value};
+  CMPIArray* array = CPUProvider::newUint16Array(target.broker, values, &status);
+  if (!isNull(array) && status.rc == CMPI_RC_OK) {
+    setProperty(target.instance, name, CPUProvider::uint16ArrayValue, array);
   }
-  CMSetArrayElementAt(array, 0, &value, CMPI_uint16);
-  CMSetProperty(target.instance, name, &array, CMPI_uint16A);
 }
 
 void setMessage(const Target& target, const char* name, const wchar_t* identifier) {
@@ -69,7 +74,7 @@ constexpr Property properties[] = {
 
 bool contains(const char* const* names, const char* name) {
   for (; *names != nullptr; ++names) {
-    if (strcasecmp(*names, name) == 0) {
+    if (equalIgnoringCase(*names, name)) {
       return true;
     }
   }
@@ -93,15 +98,13 @@ bool isRefused(const Object* object, CMPIStatus* status) {
 
 CMPIObjectPath* makePath(const CMPIBroker* broker, const CMPIObjectPath* request, const ComputerSystem& system,
                          CMPIStatus* status) {
-  const CMPIString* nameSpace = CMGetNameSpace(request, nullptr);
-  const char* nameSpaceText = isNull(nameSpace) ? nullptr : CMGetCharPtr(nameSpace);
-  CMPIObjectPath* path = CMNewObjectPath(broker, nameSpaceText == nullptr ? "" : nameSpaceText, className, status);
+  CMPIObjectPath* path = CMNewObjectPath(broker, CPUProvider::namespaceOf(request), className, status);
   if (isRefused(path, status)) {
     return nullptr;
   }
   CMSetHostname(path, system.name.c_str());
-  CMAddKey(path, keyNames[0], className, CMPI_chars);
-  CMAddKey(path, keyNames[1], system.name.c_str(), CMPI_chars);
+  addKey(path, keyNames[0], className);
+  addKey(path, keyNames[1], system.name.c_str());
   return path;
 }
 

@@ -9,12 +9,6 @@ namespace Tarn::ComputerSystemProvider {
 
 inline constexpr const char* className = "HALDA_ComputerSystem";
 
-/// Brokers also say "no object" with one that has no handle.
-template <class Object>
-bool isNull(const Object* object) {
-  return object == nullptr || object->hdl == nullptr;
-}
-
 /// The object path of the system in the namespace and of the host of `request`, or NULL when the
 /// broker refuses; `status` then says why. The path belongs to the request.
 CMPIObjectPath* makePath(const CMPIBroker* broker, const CMPIObjectPath* request, const ComputerSystem& system,

@@ -4,7 +4,6 @@
 #include <cmpift.h>
 #include <cmpimacs.h>
 #include <cxxabi.h>
-#include <strings.h>
 
 #include <atomic>
 #include <exception>
@@ -12,6 +11,7 @@
 
 #include "companion/ComputerSystem.h"
 #include "companion/ComputerSystemInstance.h"
+#include "include/CmpiObjects.h"
 
 namespace Tarn::ComputerSystemProvider {
 namespace {
@@ -44,11 +44,9 @@ const char* keyText(const CMPIObjectPath* path, const char* name) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
   const CMPIData key = CMGetKey(path, name, &status);
   const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
-  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
-  if (status.rc != CMPI_RC_OK || !mayBeString || (key.state & noValue) != 0 || isNull(key.value.string)) {
-    return nullptr;
-  }
-  return CMGetCharPtr(key.value.string);
+  return status.rc == CMPI_RC_OK && mayBeString && CPUProvider::hasValue(key)
+             ? CPUProvider::charsOrNull(key.value.string)
+             : nullptr;
 }
 
 CMPIStatus checkKeys(const CMPIObjectPath* path, const ComputerSystem& system) {
@@ -58,7 +56,7 @@ CMPIStatus checkKeys(const CMPIObjectPath* path, const ComputerSystem& system) {
     return statusOf(CMPI_RC_ERR_INVALID_PARAMETER,
                     "the path of a computer system needs the keys CreationClassName and Name");
   }
-  if (strcasecmp(creationClass, className) != 0 || system.name != name) {
+  if (!CPUProvider::equalIgnoringCase(creationClass, className) || system.name != name) {
     return statusOf(CMPI_RC_ERR_NOT_FOUND, std::string("no system has CreationClassName \"") + creationClass +
                                                "\" and Name \"" + name + "\"; this machine is \"" + system.name + "\"");
   }

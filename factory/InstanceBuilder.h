@@ -82,7 +82,7 @@ void chars(const InstanceTarget& target, const Property<Record>& property, Recor
   if (property.traceName != nullptr) {
     factoryEvents.variable(property.traceName, value.c_str(), __builtin_LINE(), target.function);
   }
-  CMSetProperty(target.instance, property.name, value.c_str(), CMPI_chars);
+  setProperty(target.instance, property.name, value.c_str());
 }
 
 template <class Record>
@@ -90,7 +90,7 @@ void localized(const InstanceTarget& target, const Property<Record>& property, R
   constexpr int processorTexts = 2;
   const std::wstring library = Locale::getResourceLibrary(processorTexts, Locale::getLanguageId());
   const std::string text = make_string(ResourceString(library, property.messageId).str());
-  CMSetProperty(target.instance, property.name, text.c_str(), CMPI_chars);
+  setProperty(target.instance, property.name, text.c_str());
 }
 
 template <auto Getter, class Record>
@@ -99,7 +99,7 @@ void uint16(const InstanceTarget& target, const Property<Record>& property, Reco
   if (property.traceName != nullptr) {
     factoryEvents.variable(property.traceName, value, __builtin_LINE(), target.function);
   }
-  CMSetProperty(target.instance, property.name, &value, CMPI_uint16);
+  setProperty(target.instance, property.name, uint16Value, value);
 }
 
 template <auto Getter, class Record>
@@ -111,28 +111,23 @@ void uint16UnlessZero(const InstanceTarget& target, const Property<Record>& prop
 
 template <auto Getter, class Record>
 void uint32(const InstanceTarget& target, const Property<Record>& property, Record& record) {
-  const CMPIUint32 value = (record.*Getter)();
-  CMSetProperty(target.instance, property.name, &value, CMPI_uint32);
+  setProperty(target.instance, property.name, uint32Value, (record.*Getter)());
 }
 
 template <auto Getter, class Record>
 void uint64(const InstanceTarget& target, const Property<Record>& property, Record& record) {
-  const CMPIUint64 value = (record.*Getter)();
-  CMSetProperty(target.instance, property.name, &value, CMPI_uint64);
+  setProperty(target.instance, property.name, uint64Value, (record.*Getter)());
 }
 
 template <auto Getter, class Record>
 void boolean(const InstanceTarget& target, const Property<Record>& property, Record& record) {
-  const CMPIBoolean value = (record.*Getter)() ? 1 : 0;
-  CMSetProperty(target.instance, property.name, &value, CMPI_boolean);
+  setProperty(target.instance, property.name, booleanValue, (record.*Getter)() ? 1 : 0);
 }
 
 /// An array that the broker cannot make leaves the property out.
 template <auto Getter, class Record>
 void uint16Array(const InstanceTarget& target, const Property<Record>& property, Record& record) {
-  const std::vector<unsigned short> values = (record.*Getter)();
-  const auto count = static_cast<unsigned short>(values.size());
-  CMPIArray* array = CMNewArray(target.broker, count, CMPI_uint16, target.rc);
+  CMPIArray* array = newUint16Array(target.broker, (record.*Getter)(), target.rc);
   if (isNull(array)) {
     const ArrayFailure& failure = target.arrayFailure;
     if (failure.setsStatus) {
@@ -141,10 +136,7 @@ void uint16Array(const InstanceTarget& target, const Property<Record>& property,
     factoryEvents.message(failure.level, failure.text, __builtin_LINE(), target.function);
     return;
   }
-  for (unsigned short i = 0; i < count; ++i) {
-    CMSetArrayElementAt(array, i, &values[i], CMPI_uint16);
-  }
-  CMSetProperty(target.instance, property.name, &array, CMPI_uint16A);
+  setProperty(target.instance, property.name, uint16ArrayValue, array);
 }
 
 /// Makes the instance of one record. NULL when there is no object path; the broker's own answer when
@@ -167,7 +159,7 @@ CMPIInstance* makeInstance(const InstanceClass<Record>& instanceClass, const CMP
   }
   const ObjectKeys keys(instanceClass.keyStyle, instanceClass.name, (record.*instanceClass.identifier)(), systemName);
   for (const ObjectKeys::Key& key : keys) {
-    CMSetProperty(instance, key.name, key.value, CMPI_chars);
+    setProperty(instance, key.name, key.value);
   }
 
   const InstanceTarget target{broker, instance, rc, instanceClass.arrayFailure, function};

@@ -83,7 +83,7 @@ unsigned short appendPaths(const PathClass<Record>& pathClass, const std::map<st
     }
     const ObjectKeys keys(pathClass.keyStyle, pathClass.name, (record.*pathClass.identifier)(), systemName);
     for (const ObjectKeys::Key& key : keys) {
-      CMAddKey(path, key.name, key.value, CMPI_chars);
+      addKey(path, key.name, key.value);
     }
     objPaths.push_back(path);
   }

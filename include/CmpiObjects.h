@@ -8,11 +8,14 @@
 #include <tarn/Common.h>
 
 #include <algorithm>
+#include <cstring>
+#include <iterator>
 #include <string>
 #include <string_view>
+#include <type_traits>
 
-/// The few things that are said again and again about CMPI objects. A broker may answer NULL
-/// wherever it answers an object; nothing here dereferences it.
+/// Small helpers over CMPI objects and values. A broker may answer NULL wherever it answers an object;
+/// nothing here dereferences it.
 namespace Tarn::CPUProvider {
 
 /// Brokers also say "no object" with one that has no handle.
@@ -21,7 +24,8 @@ bool isNull(const Object* object) {
   return object == nullptr || object->hdl == nullptr;
 }
 
-/// Whether there is a value at all. What the value holds where there is none is anybody's guess.
+/// Whether a key or property has a value. Elements of an enumeration are tested by their pointer instead: some
+/// brokers deliver them in the state of a null value.
 inline bool hasValue(const CMPIData& data) {
   constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
   return (data.state & noValue) == 0;
@@ -44,6 +48,73 @@ inline const char* namespaceOf(const CMPIObjectPath* path, CMPIStatus* rc = null
 
 inline const char* classNameOf(const CMPIObjectPath* path, CMPIStatus* rc = nullptr) {
   return charsOf(CMGetClassName(path, rc));
+}
+
+/// A value for a broker to read. Brokers may copy the whole union whatever the value's type is, so all of it is
+/// initialized.
+template <class Content>
+CMPIValue wholeValue(Content CMPIValue::*member, std::type_identity_t<Content> content) {
+  CMPIValue value;
+  std::memset(&value, 0, sizeof(value));
+  value.*member = content;
+  return value;
+}
+
+/// A type of values: its code, and the member of the union that holds it.
+template <class Content>
+struct ValueType {
+  CMPIType code;
+  Content CMPIValue::*member;
+};
+
+inline constexpr ValueType booleanValue{CMPI_boolean, &CMPIValue::boolean};
+inline constexpr ValueType uint16Value{CMPI_uint16, &CMPIValue::uint16};
+inline constexpr ValueType uint32Value{CMPI_uint32, &CMPIValue::uint32};
+inline constexpr ValueType uint64Value{CMPI_uint64, &CMPIValue::uint64};
+inline constexpr ValueType uint16ArrayValue{CMPI_uint16A, &CMPIValue::array};
+
+template <class Content>
+void setProperty(CMPIInstance* instance, const char* name, const ValueType<Content>& type,
+                 std::type_identity_t<Content> content) {
+  const CMPIValue value = wholeValue(type.member, content);
+  CMSetProperty(instance, name, &value, type.code);
+}
+
+// A text is no value: CMPI takes the address of its characters.
+
+inline void setProperty(CMPIInstance* instance, const char* name, const char* text) {
+  CMSetProperty(instance, name, reinterpret_cast<const CMPIValue*>(text), CMPI_chars);
+}
+
+inline void addKey(CMPIObjectPath* path, const char* name, const char* text) {
+  CMAddKey(path, name, reinterpret_cast<const CMPIValue*>(text), CMPI_chars);
+}
+
+/// The broker copies the path; only the union's member is mutable.
+inline CMPIValue referenceTo(const CMPIObjectPath* path) {
+  return wholeValue(&CMPIValue::ref, const_cast<CMPIObjectPath*>(path));
+}
+
+inline void setProperty(CMPIInstance* instance, const char* name, const CMPIObjectPath* path) {
+  const CMPIValue value = referenceTo(path);
+  CMSetProperty(instance, name, &value, CMPI_ref);
+}
+
+inline void addKey(CMPIObjectPath* key, const char* name, const CMPIObjectPath* path) {
+  const CMPIValue value = referenceTo(path);
+  CMAddKey(key, name, &value, CMPI_ref);
+}
+
+/// An array of numbers; what the broker answers when it cannot make one.
+template <class Numbers>
+CMPIArray* newUint16Array(const CMPIBroker* broker, const Numbers& numbers, CMPIStatus* rc) {
+  const auto count = static_cast<unsigned short>(std::size(numbers));
+  CMPIArray* array = CMNewArray(broker, count, CMPI_uint16, rc);
+  for (unsigned short i = 0; !isNull(array) && i < count; ++i) {
+    const CMPIValue value = wholeValue(&CMPIValue::uint16, numbers[i]);
+    CMSetArrayElementAt(array, i, &value, CMPI_uint16);
+  }
+  return array;
 }
 
 /// Class names compare without regard to case (ASCII).

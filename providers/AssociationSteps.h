@@ -74,8 +74,8 @@ inline CMPIObjectPath* newAssociationPath(const Association& association, const 
 
 inline void setEnds(const Association& association, CMPIInstance* instance, const CMPIObjectPath* first,
                     const CMPIObjectPath* second) {
-  CMSetProperty(instance, association.first.name, &first, CMPI_ref);
-  CMSetProperty(instance, association.second.name, &second, CMPI_ref);
+  setProperty(instance, association.first.name, first);
+  setProperty(instance, association.second.name, second);
 }
 
 /// What the factory is asked for the elements that belong to the one with a key.
@@ -185,8 +185,8 @@ bool forEachPair(const Association& association, const PairWalk& walk, const Wal
 /// Delivers the name of each pair of a walk: the association's path with the two ends as its keys.
 inline auto deliverName(const Association& association, const CMPIResult* result) {
   return [&association, result](CMPIObjectPath* path, const CMPIObjectPath* first, const CMPIObjectPath* second) {
-    CMAddKey(path, association.first.name, &first, CMPI_ref);
-    CMAddKey(path, association.second.name, &second, CMPI_ref);
+    addKey(path, association.first.name, first);
+    addKey(path, association.second.name, second);
     CMReturnObjectPath(result, path);
     return true;
   };

@@ -12,11 +12,11 @@ bool describeCache(const Association& association, CPUObjFactory* factory, CMPII
     association.events.message(LevelError, "Error retrieving CPU AssociatedCacheMemory data", line, function);
     return false;
   }
-  CMSetProperty(instance, "Level", &data.level, CMPI_uint16);
-  CMSetProperty(instance, "WritePolicy", &data.writePolicy, CMPI_uint16);
-  CMSetProperty(instance, "ReadPolicy", &data.readPolicy, CMPI_uint16);
-  CMSetProperty(instance, "CacheType", &data.cacheType, CMPI_uint16);
-  CMSetProperty(instance, "Associativity", &data.associativity, CMPI_uint16);
+  setProperty(instance, "Level", uint16Value, data.level);
+  setProperty(instance, "WritePolicy", uint16Value, data.writePolicy);
+  setProperty(instance, "ReadPolicy", uint16Value, data.readPolicy);
+  setProperty(instance, "CacheType", uint16Value, data.cacheType);
+  setProperty(instance, "Associativity", uint16Value, data.associativity);
   return true;
 }
 

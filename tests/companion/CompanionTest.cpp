@@ -17,6 +17,7 @@
 #include "platform/instrumentation/tree/PropertyTable.h"
 #include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/host/cli/Program.h"
+#include "tests/support/UnionCopyingBroker.h"
 
 namespace Corvcim {
 namespace {
@@ -58,6 +59,17 @@ class Companion : public testing::Test {
 
 std::vector<NamedValue> keys() {
   return {{"CreationClassName", Value::string("HALDA_ComputerSystem")}, {"Name", Value::string(Tarn::getSystemName())}};
+}
+
+TEST_F(Companion, InitializesEveryValueToTheEndOfItsUnion) {
+  const Support::UnionCopyingBroker copying(broker_.handle());
+  using CreateMI = CMPIInstanceMI* (*)(const CMPIBroker*, const CMPIContext*, CMPIStatus*);
+  const auto createMI = reinterpret_cast<CreateMI>(library_->find(std::string(provider) + "_Create_InstanceMI"));
+
+  broker_.enumerateInstances(createMI(copying.handle(), nullptr, nullptr), classPath());
+
+  EXPECT_GT(copying.copies(), 0U);
+  EXPECT_EQ(copying.partialValues(), std::vector<std::string>());
 }
 
 TEST_F(Companion, TellsAboutTheSystem) {
