@@ -16,8 +16,9 @@ struct SystemQuery {
 namespace detail {
 
 /// Hands each element of the broker's answer, an instance or a path, to `handle`. Brokers answer a failed call
-/// with a failing status, and then with an enumeration or without one. What they fail to give is left out; one
-/// that has given nothing for very long would never come to the end, and is not asked on.
+/// with a failing status, and then with an enumeration or without one. An element counts when its pointer is not
+/// NULL, whatever its state: some brokers deliver every element in the state of a null value. The walk ends after
+/// 1,000 replies in a row without an element, if the enumeration still claims to have more.
 template <class Element, class Handle>
 bool forEachAnswer(const Association& association, const CMPIEnumeration* enumeration, const CMPIStatus& status,
                    Element* CMPIValue::*kind, Handle handle, unsigned int line, const char* function) {
@@ -26,20 +27,21 @@ bool forEachAnswer(const Association& association, const CMPIEnumeration* enumer
     association.events.message(LevelError, "Call to CBEnumInstances of target Class Failed.", line, function);
     return false;
   }
-  constexpr int patience = 1000;
-  int callsInVain = 0;
-  while (callsInVain < patience && !isNull(enumeration) && CMHasNext(enumeration, nullptr) != 0) {
+  constexpr int maxEmptyReplies = 1000;
+  int emptyReplies = 0;
+  while (!isNull(enumeration) && CMHasNext(enumeration, nullptr) != 0) {
+    if (emptyReplies == maxEmptyReplies) {
+      association.events.message(LevelError, "1000 calls in a row gave no computer system: the enumeration is given up",
+                                 line, function);
+      break;
+    }
     CMPIStatus unused = succeeded();  // what counts is whether there is an element
     const CMPIData data = CMGetNext(enumeration, &unused);
-    const bool isElement = hasValue(data) && !isNull(data.value.*kind);
+    const bool isElement = !isNull(data.value.*kind);
     if (isElement && !handle(data.value.*kind)) {
       return false;
     }
-    callsInVain = isElement ? 0 : callsInVain + 1;
-  }
-  if (callsInVain == patience) {
-    association.events.message(LevelError, "1000 calls in a row gave no computer system: the enumeration is given up",
-                               line, function);
+    emptyReplies = isElement ? 0 : emptyReplies + 1;
   }
   return true;
 }

@@ -1,4 +1,4 @@
-// Brokers that never come to the end of an enumeration of computer systems.
+// Enumerations of computer systems with very many replies that contain no element.
 
 #include <cmpimacs.h>
 
@@ -12,12 +12,13 @@ using Corvcim::Response;
 using Support::EventList;
 using Support::outcome;
 
-/// What the endless enumeration of a broker gives, and how often it was asked.
+/// What the enumeration of a broker gives, and how often it was asked. Every reply has the state of a null value.
 struct Endless {
   const CMPIBroker* broker = nullptr;
   CMPIStatus status{CMPI_RC_OK, nullptr};  ///< of its calls
   bool ofInstances = false;
   unsigned int calls = 0;
+  unsigned int end = 0;  ///< after how many calls the enumeration has no more elements; 0: never
 
   /// The first system comes with the thousandth call and the second with the two thousandth: no call gives
   /// another.
@@ -33,11 +34,9 @@ CMPIData nextOfEndless(const CMPIEnumeration* /*enumeration*/, CMPIStatus* statu
   }
   CMPIData element{};
   element.state = CMPI_nullValue;
-  element.value.uint64 = 1;  // no pointer: what is no value is not to be looked at
   if (endless.givesElement()) {
     CMPIObjectPath* path =
         CMNewObjectPath(endless.broker, Support::testNameSpace.c_str(), systemClass.c_str(), nullptr);
-    element.state = CMPI_goodValue;
     if (endless.ofInstances) {
       element.value.inst = CMNewInstance(endless.broker, path, nullptr);
     } else {
@@ -51,14 +50,16 @@ CMPIEnumeration* endlessEnumeration() {
   static const CMPIEnumerationFT table = [] {
     CMPIEnumerationFT functions{};
     functions.getNext = nextOfEndless;
-    functions.hasNext = [](const CMPIEnumeration*, CMPIStatus*) { return CMPIBoolean{1}; };
+    functions.hasNext = [](const CMPIEnumeration*, CMPIStatus*) {
+      return CMPIBoolean{endless.end == 0 || endless.calls < endless.end};
+    };
     return functions;
   }();
   static CMPIEnumeration enumeration{&endless, &table};
   return &enumeration;
 }
 
-/// A broker that never comes to the end of an enumeration of systems.
+/// A broker with such an enumeration.
 class EndlessEnumeration : public Support::ProviderTest, public ::testing::WithParamInterface<CMPIrc> {
  protected:
   EndlessEnumeration() : record_(*broker.handle()), services_(*record_.bft) {
@@ -78,8 +79,8 @@ class EndlessEnumeration : public Support::ProviderTest, public ::testing::WithP
 
   const Support::ProviderFunctions& provider() const { return Support::providerOf(systemDevice); }
 
-  Response ask(OperationKind kind, const ObjectPath& path) {
-    endless = {&record_, {GetParam(), nullptr}, kind == OperationKind::Associators, 0};
+  Response ask(OperationKind kind, const ObjectPath& path, unsigned int end = 0) {
+    endless = {&record_, {GetParam(), nullptr}, kind == OperationKind::Associators, 0, end};
     Corvcim::Operation operation{kind, path, {}, {}};
     if (!Corvcim::isAssociationOperation(kind)) {
       return broker.perform(provider().createInstanceMI(&record_, nullptr, nullptr), operation);
@@ -122,6 +123,20 @@ TEST_P(EndlessEnumeration, DoesNotFailTheEnumerationOfAssociations) {
   EXPECT_EQ(outcome(names), "CMPI_RC_OK no message done");
   Support::expectEvents(provider(), EventList(provider(), "EnumInstanceNames").entering().error(givenUp).exiting());
   EXPECT_EQ(ask(OperationKind::EnumerateInstances, Support::classPath(systemDevice)).instances.size(), 4U);
+}
+
+TEST_P(EndlessEnumeration, IsNotGivenUpIfItEndsAfterAThousandCallsInVain) {
+  for (const OperationKind kind : associationOperations) {
+    const Response response = ask(kind, Support::processorPath("cpu0"), 3000);
+    EXPECT_EQ(response.instances.size() + response.paths.size(), 2U) << Corvcim::operationName(kind);
+    EXPECT_EQ(endless.calls, 3000U);
+    EventList events(provider(), std::string(Corvcim::operationName(kind)));
+    events.entering();
+    if (isAssociators(kind)) {
+      events.variable("((targetClass)->ft->getCharPtr((targetClass),(&rc)))", systemClass);
+    }
+    Support::expectEvents(provider(), events.exiting());
+  }
 }
 
 }  // namespace
