@@ -1,7 +1,6 @@
 #ifndef TARN_ASSOCIATIONSTEPS_H
 #define TARN_ASSOCIATIONSTEPS_H
 
-#include <span>
 #include <string_view>
 #include <type_traits>
 
@@ -27,12 +26,6 @@ struct Association {
   /// What no property list filters away. Brokers take it as mutable pointers, and write none of them.
   mutable const char* filterKeys[3] = {first.name, second.name, nullptr};
 };
-
-/// The elements that the 16-bit count of results reaches.
-template <class Element>
-std::span<Element> counted(std::vector<Element>& elements) {
-  return std::span(elements).first(countOf(elements));
-}
 
 /// What is said of a failure: to the client, unless that is NULL, and in the log.
 struct FailureTexts {

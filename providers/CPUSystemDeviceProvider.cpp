@@ -257,8 +257,10 @@ CMPIStatus answerReferences(const CMPIObjectPath* cop, const CMPIContext* contex
       return navigation.status;
     }
     for (CMPIObjectPath* processor : counted(processors)) {
-      stampPath(processor, cop);
-      link(processor, false);
+      if (!isNull(processor)) {
+        stampPath(processor, cop);
+        link(processor, false);
+      }
     }
   } else if (targetClass == computerSystemClass) {
     const auto linkSystem = [&](const CMPIObjectPath* system) { return link(system, true); };

@@ -53,7 +53,10 @@ CMPIStatus enumInstances(const CacheAssociation& provider, const AssociationRequ
   events.providerEntry(request.line, request.function);
   Instances instances;
   if (provider.makeInstances(request.cop, request.properties, instances) == 0) {
-    deliver(request.result, instances);
+    // Also the associations that the broker could not make.
+    for (const CMPIInstance* instance : counted(instances)) {
+      CMReturnInstance(request.result, instance);
+    }
   }
   CMReturnDone(request.result);
   events.providerExit(request.line, request.function);

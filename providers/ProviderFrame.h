@@ -6,6 +6,7 @@
 #include <CmpiObjects.h>
 #include <Trace.h>
 
+#include <span>
 #include <string>
 #include <vector>
 
@@ -77,17 +78,27 @@ unsigned short countOf(const std::vector<Element>& elements) {
   return static_cast<unsigned short>(elements.size());
 }
 
-inline void deliver(const CMPIResult* result, const Instances& instances) {
-  const unsigned short count = countOf(instances);
-  for (unsigned short i = 0; i < count; ++i) {
-    CMReturnInstance(result, instances.at(i));
+/// The elements that the 16-bit count of results reaches.
+template <class Element>
+std::span<Element> counted(std::vector<Element>& elements) {
+  return std::span(elements).first(countOf(elements));
+}
+
+// What could not be made is left out: some brokers end the process that returns NULL to them.
+
+inline void deliver(const CMPIResult* result, Instances& instances) {
+  for (const CMPIInstance* instance : counted(instances)) {
+    if (!isNull(instance)) {
+      CMReturnInstance(result, instance);
+    }
   }
 }
 
-inline void deliver(const CMPIResult* result, const Paths& paths) {
-  const unsigned short count = countOf(paths);
-  for (unsigned short i = 0; i < count; ++i) {
-    CMReturnObjectPath(result, paths.at(i));
+inline void deliver(const CMPIResult* result, Paths& paths) {
+  for (const CMPIObjectPath* path : counted(paths)) {
+    if (!isNull(path)) {
+      CMReturnObjectPath(result, path);
+    }
   }
 }
 

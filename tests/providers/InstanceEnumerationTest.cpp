@@ -102,14 +102,16 @@ TEST_P(Enumeration, CollectsAgainOnlyAfterAFailure) {
   EXPECT_EQ(collections(), 0U);
 }
 
-TEST_P(Enumeration, HandsOverTheInstanceThatTheBrokerCouldNotMake) {
+TEST_P(Enumeration, InstanceThatTheBrokerCouldNotMakeIsLeftOut) {
   broker.services().record(true);
-  broker.failNth("newInstance", 1);
-  const auto response = enumerateInstances(row().className);
-  EXPECT_EQ(pathsOf(response), Paths{path(row().identifiers[1])});
-  EXPECT_EQ(outcome(response), "CMPI_RC_OK no message done");
-  EXPECT_EQ(Support::detailsOf(broker.services().takeRecord(), "returnInstance"),
-            (std::vector<std::string>{"NULL", row().className}));
+  for (const auto result : {Corvcim::FailureResult::Null, Corvcim::FailureResult::HandleLess}) {
+    broker.failNth("newInstance", 1, {.result = result});
+    const auto response = enumerateInstances(row().className);
+    EXPECT_EQ(pathsOf(response), Paths{path(row().identifiers[1])});
+    EXPECT_EQ(outcome(response), "CMPI_RC_OK no message done");
+    EXPECT_EQ(Support::detailsOf(broker.services().takeRecord(), "returnInstance"),
+              std::vector<std::string>{row().className});
+  }
 }
 
 TEST_P(Enumeration, InstanceThatTheBrokerRefusesDoesNotEndTheRequest) {
