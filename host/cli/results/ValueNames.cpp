@@ -100,7 +100,8 @@ constexpr CodeName associativities[] = {{0, "Unknown"},
                                         {6, "8-way Set-Associative"},
                                         {7, "16-way Set-Associative"}};
 
-constexpr CodeName upgradeMethods[] = {{1, "Other"},
+constexpr CodeName upgradeMethods[] = {{0, "Unknown"},
+                                       {1, "Other"},
                                        {2, "Unknown"},
                                        {3, "Daughter Board"},
                                        {4, "ZIF Socket"},

@@ -55,7 +55,7 @@ TEST(Corvcim, EnumeratesInstances) {
                     "  AddressWidth             64 bits\n"
                     "  Stepping                 8\n"
                     "  UniqueId                 0FA9\n"
-                    "  UpgradeMethod            0\n"
+                    "  UpgradeMethod            0 (Unknown)\n"
                     "  NumberOfEnabledCores     2\n"));
 }
 

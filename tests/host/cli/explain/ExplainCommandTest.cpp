@@ -196,7 +196,7 @@ TEST(ExplainCommand, WhatCouldNotBeReadIsSaidWhereItIsMissed) {
             "  Stepping       \"\"\n"
             "    inventory  Stepping is not known\n"
             "    library    empty where it is not known\n"
-            "  UpgradeMethod  0\n"
+            "  UpgradeMethod  0 (Unknown)\n"
             "    inventory  UpgradeMethod is not known\n"
             "    not read   /sys/firmware/dmi/tables/DMI: permission denied; run as root\n"
             "    library    0 where it is not known\n"
