@@ -40,9 +40,10 @@ if(CORVANE_FUZZ)
 endif()
 
 # The product's sources, compiled against one implementation of the six platform headers.
-# SEAM is the directory that holds these headers.
+# SEAM is the directory that holds these headers; DEFINE are the options of the build that are on, such as
+# CORVANE_BROKER_GUARD.
 function(corvane_product_objects name)
-  cmake_parse_arguments(ARG "GUARD" "SEAM" "" ${ARGN})
+  cmake_parse_arguments(ARG "" "SEAM" "DEFINE" ${ARGN})
   file(GLOB sources CONFIGURE_DEPENDS
     ${PROJECT_SOURCE_DIR}/model/*.cpp ${PROJECT_SOURCE_DIR}/factory/*.cpp ${PROJECT_SOURCE_DIR}/providers/*.cpp)
   add_library(${name} OBJECT ${sources})
@@ -50,7 +51,5 @@ function(corvane_product_objects name)
   set_target_properties(${name} PROPERTIES UNITY_BUILD OFF)
   target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
   target_link_libraries(${name} PRIVATE corvane_options PUBLIC cmpi)
-  if(ARG_GUARD)
-    target_compile_definitions(${name} PRIVATE CORVANE_BROKER_GUARD)
-  endif()
+  target_compile_definitions(${name} PRIVATE ${ARG_DEFINE})
 endfunction()

@@ -43,6 +43,11 @@ constexpr InstanceClass<Memory> memoryInstances{
 
 }  // namespace
 
+const char* selectionOfCoresAndCaches(std::string_view name) {
+  const char* selection = selectionOf(coreInstances.properties, name);
+  return selection != nullptr ? selection : selectionOf(memoryInstances.properties, name);
+}
+
 CMPIInstance* CPUObjFactory::makeCPUProcCoreInstance(const CMPIBroker* broker, const CMPIObjectPath* ref,
                                                      ProcessorCore procCore, const char** properties, bool isObjPath,
                                                      CMPIStatus* rc) {

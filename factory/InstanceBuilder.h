@@ -51,6 +51,20 @@ struct InstanceClass {
   ArrayFailure arrayFailure;
 };
 
+/// The name that selects a property of a class, by that name in any case of its letters; NULL if the class has none.
+template <class Record>
+const char* selectionOf(std::span<const Property<Record>> properties, std::string_view name) {
+  for (const Property<Record>& property : properties) {
+    if (equalIgnoringCase(property.selection, name)) {
+      return property.selection;
+    }
+  }
+  return nullptr;
+}
+
+/// The same for the classes of cores and caches.
+const char* selectionOfCoresAndCaches(std::string_view name);
+
 /// Which properties a request wants beside the keys. Names compare exactly.
 class Selection {
  public:

@@ -53,6 +53,16 @@ constexpr InstanceClass<P> capabilitiesInstances{
 
 }  // namespace
 
+const char* selectionName(const char* name) {
+  for (const char* selection : {selectionOf(processorInstances.properties, name),
+                                selectionOf(capabilitiesInstances.properties, name), selectionOfCoresAndCaches(name)}) {
+    if (selection != nullptr) {
+      return selection;
+    }
+  }
+  return name;
+}
+
 CMPIInstance* CPUObjFactory::makeCPUProcInstance(const CMPIBroker* broker, const CMPIObjectPath* ref, Processor proc,
                                                  const char** properties, bool isObjPath, CMPIStatus* rc) {
   const ParameterList parameters{{" broker=", broker},       {" ref=", ref},

@@ -170,6 +170,10 @@ class CPUObjFactory {
   void collect(bool isProc, bool isMem, bool isProcCore);
 };
 
+/// The name by which the builders' property lists select the property that `name` names in any case of its
+/// letters; `name` itself if no class has that property.
+const char* selectionName(const char* name);
+
 }  // namespace Tarn::CPUProvider
 
 #endif

@@ -25,11 +25,11 @@ inline std::mutex brokerGuard;
 /// Holds the library for as long as it lives.
 using GuardLock = std::lock_guard<std::mutex>;
 
-template <auto Operation, const CMPIBroker*& Broker>
+template <auto Operation, const auto& Provider>
 struct Guarded;
 
-template <class... Arguments, CMPIStatus (*Operation)(Arguments...), const CMPIBroker*& Broker>
-struct Guarded<Operation, Broker> {
+template <class... Arguments, CMPIStatus (*Operation)(Arguments...), const auto& Provider>
+struct Guarded<Operation, Provider> {
   static CMPIStatus call(Arguments... arguments) {
     const GuardLock lock(brokerGuard);
     CMPIStatus status = {CMPI_RC_OK, nullptr};
@@ -38,17 +38,17 @@ struct Guarded<Operation, Broker> {
     } catch (const abi::__forced_unwind&) {
       throw;  // a cancelled thread has to unwind to its end
     } catch (const std::exception& error) {
-      setFailure(Broker, &status, error.what());
+      setFailure(Provider.broker, &status, error.what());
     } catch (...) {
-      setFailure(Broker, &status, "Unknown exception");
+      setFailure(Provider.broker, &status, "Unknown exception");
     }
     return status;
   }
 };
 
-/// What a function table holds for an operation of the file whose broker is `Broker`.
-template <auto Operation, const CMPIBroker*& Broker>
-inline constexpr auto entry = &Guarded<Operation, Broker>::call;
+/// An operation of the provider that `Provider` describes, behind the guard.
+template <auto Operation, const auto& Provider>
+inline constexpr auto guarded = &Guarded<Operation, Provider>::call;
 
 /// Calls into the broker, which may run other requests of this library before it returns.
 template <class Call>
@@ -72,8 +72,8 @@ Interface* registerBroker(const CMPIBroker*& broker, const CMPIBroker* caller, I
 
 #else
 
-template <auto Operation, const CMPIBroker*& Broker>
-inline constexpr auto entry = Operation;
+template <auto Operation, const auto& Provider>
+inline constexpr auto guarded = Operation;
 
 template <class Call>
 auto upCall(Call call) {

@@ -127,25 +127,25 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUAssociatedCacheMemoryProvider",
-    entry<CPUAssociatedCacheMemory_Cleanup, broker>,
-    entry<CPUAssociatedCacheMemory_EnumInstanceNames, broker>,
-    entry<CPUAssociatedCacheMemory_EnumInstances, broker>,
-    entry<CPUAssociatedCacheMemory_GetInstance, broker>,
-    entry<CPUAssociatedCacheMemory_CreateInstance, broker>,
-    entry<CPUAssociatedCacheMemory_ModifyInstance, broker>,
-    entry<CPUAssociatedCacheMemory_DeleteInstance, broker>,
-    entry<CPUAssociatedCacheMemory_ExecQuery, broker>,
+    entry<CPUAssociatedCacheMemory_Cleanup, association>,
+    entry<CPUAssociatedCacheMemory_EnumInstanceNames, association>,
+    entry<CPUAssociatedCacheMemory_EnumInstances, association>,
+    entry<CPUAssociatedCacheMemory_GetInstance, association>,
+    entry<CPUAssociatedCacheMemory_CreateInstance, association>,
+    entry<CPUAssociatedCacheMemory_ModifyInstance, association>,
+    entry<CPUAssociatedCacheMemory_DeleteInstance, association>,
+    entry<CPUAssociatedCacheMemory_ExecQuery, association>,
 };
 
 static const CMPIAssociationMIFT assocMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "associationCPUAssociatedCacheMemoryProvider",
-    entry<CPUAssociatedCacheMemory_AssociationCleanup, broker>,
-    entry<CPUAssociatedCacheMemory_Associators, broker>,
-    entry<CPUAssociatedCacheMemory_AssociatorNames, broker>,
-    entry<CPUAssociatedCacheMemory_References, broker>,
-    entry<CPUAssociatedCacheMemory_ReferenceNames, broker>,
+    entry<CPUAssociatedCacheMemory_AssociationCleanup, association>,
+    entry<CPUAssociatedCacheMemory_Associators, association>,
+    entry<CPUAssociatedCacheMemory_AssociatorNames, association>,
+    entry<CPUAssociatedCacheMemory_References, association>,
+    entry<CPUAssociatedCacheMemory_ReferenceNames, association>,
 };
 
 }  // namespace Tarn::CPUProvider

@@ -176,25 +176,25 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUConcreteComponentProvider",
-    entry<CPUConcreteComponent_Cleanup, broker>,
-    entry<CPUConcreteComponent_EnumInstanceNames, broker>,
-    entry<CPUConcreteComponent_EnumInstances, broker>,
-    entry<CPUConcreteComponent_GetInstance, broker>,
-    entry<CPUConcreteComponent_CreateInstance, broker>,
-    entry<CPUConcreteComponent_ModifyInstance, broker>,
-    entry<CPUConcreteComponent_DeleteInstance, broker>,
-    entry<CPUConcreteComponent_ExecQuery, broker>,
+    entry<CPUConcreteComponent_Cleanup, association>,
+    entry<CPUConcreteComponent_EnumInstanceNames, association>,
+    entry<CPUConcreteComponent_EnumInstances, association>,
+    entry<CPUConcreteComponent_GetInstance, association>,
+    entry<CPUConcreteComponent_CreateInstance, association>,
+    entry<CPUConcreteComponent_ModifyInstance, association>,
+    entry<CPUConcreteComponent_DeleteInstance, association>,
+    entry<CPUConcreteComponent_ExecQuery, association>,
 };
 
 static const CMPIAssociationMIFT assocMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "associationCPUConcreteComponentProvider",
-    entry<CPUConcreteComponent_AssociationCleanup, broker>,
-    entry<CPUConcreteComponent_Associators, broker>,
-    entry<CPUConcreteComponent_AssociatorNames, broker>,
-    entry<CPUConcreteComponent_References, broker>,
-    entry<CPUConcreteComponent_ReferenceNames, broker>,
+    entry<CPUConcreteComponent_AssociationCleanup, association>,
+    entry<CPUConcreteComponent_Associators, association>,
+    entry<CPUConcreteComponent_AssociatorNames, association>,
+    entry<CPUConcreteComponent_References, association>,
+    entry<CPUConcreteComponent_ReferenceNames, association>,
 };
 
 }  // namespace Tarn::CPUProvider

@@ -129,25 +129,25 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUCoreAssociatedCacheMemoryProvider",
-    entry<CPUCoreAssociatedCacheMemory_Cleanup, broker>,
-    entry<CPUCoreAssociatedCacheMemory_EnumInstanceNames, broker>,
-    entry<CPUCoreAssociatedCacheMemory_EnumInstances, broker>,
-    entry<CPUCoreAssociatedCacheMemory_GetInstance, broker>,
-    entry<CPUCoreAssociatedCacheMemory_CreateInstance, broker>,
-    entry<CPUCoreAssociatedCacheMemory_ModifyInstance, broker>,
-    entry<CPUCoreAssociatedCacheMemory_DeleteInstance, broker>,
-    entry<CPUCoreAssociatedCacheMemory_ExecQuery, broker>,
+    entry<CPUCoreAssociatedCacheMemory_Cleanup, association>,
+    entry<CPUCoreAssociatedCacheMemory_EnumInstanceNames, association>,
+    entry<CPUCoreAssociatedCacheMemory_EnumInstances, association>,
+    entry<CPUCoreAssociatedCacheMemory_GetInstance, association>,
+    entry<CPUCoreAssociatedCacheMemory_CreateInstance, association>,
+    entry<CPUCoreAssociatedCacheMemory_ModifyInstance, association>,
+    entry<CPUCoreAssociatedCacheMemory_DeleteInstance, association>,
+    entry<CPUCoreAssociatedCacheMemory_ExecQuery, association>,
 };
 
 static const CMPIAssociationMIFT assocMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "associationCPUCoreAssociatedCacheMemoryProvider",
-    entry<CPUCoreAssociatedCacheMemory_AssociationCleanup, broker>,
-    entry<CPUCoreAssociatedCacheMemory_Associators, broker>,
-    entry<CPUCoreAssociatedCacheMemory_AssociatorNames, broker>,
-    entry<CPUCoreAssociatedCacheMemory_References, broker>,
-    entry<CPUCoreAssociatedCacheMemory_ReferenceNames, broker>,
+    entry<CPUCoreAssociatedCacheMemory_AssociationCleanup, association>,
+    entry<CPUCoreAssociatedCacheMemory_Associators, association>,
+    entry<CPUCoreAssociatedCacheMemory_AssociatorNames, association>,
+    entry<CPUCoreAssociatedCacheMemory_References, association>,
+    entry<CPUCoreAssociatedCacheMemory_ReferenceNames, association>,
 };
 
 }  // namespace Tarn::CPUProvider

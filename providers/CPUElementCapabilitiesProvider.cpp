@@ -178,25 +178,25 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUElementCapabilitiesProvider",
-    entry<CPUElementCapabilities_Cleanup, broker>,
-    entry<CPUElementCapabilities_EnumInstanceNames, broker>,
-    entry<CPUElementCapabilities_EnumInstances, broker>,
-    entry<CPUElementCapabilities_GetInstance, broker>,
-    entry<CPUElementCapabilities_CreateInstance, broker>,
-    entry<CPUElementCapabilities_ModifyInstance, broker>,
-    entry<CPUElementCapabilities_DeleteInstance, broker>,
-    entry<CPUElementCapabilities_ExecQuery, broker>,
+    entry<CPUElementCapabilities_Cleanup, association>,
+    entry<CPUElementCapabilities_EnumInstanceNames, association>,
+    entry<CPUElementCapabilities_EnumInstances, association>,
+    entry<CPUElementCapabilities_GetInstance, association>,
+    entry<CPUElementCapabilities_CreateInstance, association>,
+    entry<CPUElementCapabilities_ModifyInstance, association>,
+    entry<CPUElementCapabilities_DeleteInstance, association>,
+    entry<CPUElementCapabilities_ExecQuery, association>,
 };
 
 static const CMPIAssociationMIFT assocMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "associationCPUElementCapabilitiesProvider",
-    entry<CPUElementCapabilities_AssociationCleanup, broker>,
-    entry<CPUElementCapabilities_Associators, broker>,
-    entry<CPUElementCapabilities_AssociatorNames, broker>,
-    entry<CPUElementCapabilities_References, broker>,
-    entry<CPUElementCapabilities_ReferenceNames, broker>,
+    entry<CPUElementCapabilities_AssociationCleanup, association>,
+    entry<CPUElementCapabilities_Associators, association>,
+    entry<CPUElementCapabilities_AssociatorNames, association>,
+    entry<CPUElementCapabilities_References, association>,
+    entry<CPUElementCapabilities_ReferenceNames, association>,
 };
 
 }  // namespace Tarn::CPUProvider

@@ -50,14 +50,14 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUMemoryProvider",
-    entry<CPUMemory_Cleanup, broker>,
-    entry<CPUMemory_EnumInstanceNames, broker>,
-    entry<CPUMemory_EnumInstances, broker>,
-    entry<CPUMemory_GetInstance, broker>,
-    entry<CPUMemory_CreateInstance, broker>,
-    entry<CPUMemory_ModifyInstance, broker>,
-    entry<CPUMemory_DeleteInstance, broker>,
-    entry<CPUMemory_ExecQuery, broker>,
+    entry<CPUMemory_Cleanup, provider>,
+    entry<CPUMemory_EnumInstanceNames, provider>,
+    entry<CPUMemory_EnumInstances, provider>,
+    entry<CPUMemory_GetInstance, provider>,
+    entry<CPUMemory_CreateInstance, provider>,
+    entry<CPUMemory_ModifyInstance, provider>,
+    entry<CPUMemory_DeleteInstance, provider>,
+    entry<CPUMemory_ExecQuery, provider>,
 };
 
 }  // namespace Tarn::CPUProvider

@@ -52,14 +52,14 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUProcessorCapProvider",
-    entry<CPUProcessorCapabilities_Cleanup, broker>,
-    entry<CPUProcessorCapabilities_EnumInstanceNames, broker>,
-    entry<CPUProcessorCapabilities_EnumInstances, broker>,
-    entry<CPUProcessorCapabilities_GetInstance, broker>,
-    entry<CPUProcessorCapabilities_CreateInstance, broker>,
-    entry<CPUProcessorCapabilities_ModifyInstance, broker>,
-    entry<CPUProcessorCapabilities_DeleteInstance, broker>,
-    entry<CPUProcessorCapabilities_ExecQuery, broker>,
+    entry<CPUProcessorCapabilities_Cleanup, provider>,
+    entry<CPUProcessorCapabilities_EnumInstanceNames, provider>,
+    entry<CPUProcessorCapabilities_EnumInstances, provider>,
+    entry<CPUProcessorCapabilities_GetInstance, provider>,
+    entry<CPUProcessorCapabilities_CreateInstance, provider>,
+    entry<CPUProcessorCapabilities_ModifyInstance, provider>,
+    entry<CPUProcessorCapabilities_DeleteInstance, provider>,
+    entry<CPUProcessorCapabilities_ExecQuery, provider>,
 };
 
 }  // namespace Tarn::CPUProvider

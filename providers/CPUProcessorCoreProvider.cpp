@@ -52,14 +52,14 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUProcessorCoreProvider",
-    entry<CPUProcessorCore_Cleanup, broker>,
-    entry<CPUProcessorCore_EnumInstanceNames, broker>,
-    entry<CPUProcessorCore_EnumInstances, broker>,
-    entry<CPUProcessorCore_GetInstance, broker>,
-    entry<CPUProcessorCore_CreateInstance, broker>,
-    entry<CPUProcessorCore_ModifyInstance, broker>,
-    entry<CPUProcessorCore_DeleteInstance, broker>,
-    entry<CPUProcessorCore_ExecQuery, broker>,
+    entry<CPUProcessorCore_Cleanup, provider>,
+    entry<CPUProcessorCore_EnumInstanceNames, provider>,
+    entry<CPUProcessorCore_EnumInstances, provider>,
+    entry<CPUProcessorCore_GetInstance, provider>,
+    entry<CPUProcessorCore_CreateInstance, provider>,
+    entry<CPUProcessorCore_ModifyInstance, provider>,
+    entry<CPUProcessorCore_DeleteInstance, provider>,
+    entry<CPUProcessorCore_ExecQuery, provider>,
 };
 
 }  // namespace Tarn::CPUProvider

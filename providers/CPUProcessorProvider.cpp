@@ -52,14 +52,14 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUProcessorProvider",
-    entry<CPUProcessor_Cleanup, broker>,
-    entry<CPUProcessor_EnumInstanceNames, broker>,
-    entry<CPUProcessor_EnumInstances, broker>,
-    entry<CPUProcessor_GetInstance, broker>,
-    entry<CPUProcessor_CreateInstance, broker>,
-    entry<CPUProcessor_ModifyInstance, broker>,
-    entry<CPUProcessor_DeleteInstance, broker>,
-    entry<CPUProcessor_ExecQuery, broker>,
+    entry<CPUProcessor_Cleanup, provider>,
+    entry<CPUProcessor_EnumInstanceNames, provider>,
+    entry<CPUProcessor_EnumInstances, provider>,
+    entry<CPUProcessor_GetInstance, provider>,
+    entry<CPUProcessor_CreateInstance, provider>,
+    entry<CPUProcessor_ModifyInstance, provider>,
+    entry<CPUProcessor_DeleteInstance, provider>,
+    entry<CPUProcessor_ExecQuery, provider>,
 };
 
 }  // namespace Tarn::CPUProvider

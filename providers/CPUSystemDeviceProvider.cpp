@@ -293,25 +293,25 @@ static const CMPIInstanceMIFT instMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "instanceCPUSystemDeviceProvider",
-    entry<CPUSystemDevice_Cleanup, broker>,
-    entry<CPUSystemDevice_EnumInstanceNames, broker>,
-    entry<CPUSystemDevice_EnumInstances, broker>,
-    entry<CPUSystemDevice_GetInstance, broker>,
-    entry<CPUSystemDevice_CreateInstance, broker>,
-    entry<CPUSystemDevice_ModifyInstance, broker>,
-    entry<CPUSystemDevice_DeleteInstance, broker>,
-    entry<CPUSystemDevice_ExecQuery, broker>,
+    entry<CPUSystemDevice_Cleanup, association>,
+    entry<CPUSystemDevice_EnumInstanceNames, association>,
+    entry<CPUSystemDevice_EnumInstances, association>,
+    entry<CPUSystemDevice_GetInstance, association>,
+    entry<CPUSystemDevice_CreateInstance, association>,
+    entry<CPUSystemDevice_ModifyInstance, association>,
+    entry<CPUSystemDevice_DeleteInstance, association>,
+    entry<CPUSystemDevice_ExecQuery, association>,
 };
 
 static const CMPIAssociationMIFT assocMIFT__ = {
     interfaceVersion,
     interfaceVersion,
     "associationCPUSystemDeviceProvider",
-    entry<CPUSystemDevice_AssociationCleanup, broker>,
-    entry<CPUSystemDevice_Associators, broker>,
-    entry<CPUSystemDevice_AssociatorNames, broker>,
-    entry<CPUSystemDevice_References, broker>,
-    entry<CPUSystemDevice_ReferenceNames, broker>,
+    entry<CPUSystemDevice_AssociationCleanup, association>,
+    entry<CPUSystemDevice_Associators, association>,
+    entry<CPUSystemDevice_AssociatorNames, association>,
+    entry<CPUSystemDevice_References, association>,
+    entry<CPUSystemDevice_ReferenceNames, association>,
 };
 
 }  // namespace Tarn::CPUProvider

@@ -1,7 +1,7 @@
 #ifndef TARN_INSTANCEPROVIDER_H
 #define TARN_INSTANCEPROVIDER_H
 
-#include "ProviderFrame.h"
+#include "FrontDoor.h"
 
 /// The family of the four providers of plain instances. Each says in an InstanceProvider what is its
 /// own; the three operations below say what they do with it.

@@ -4,7 +4,7 @@
 #include <iterator>
 #include <optional>
 
-#include "AssociationSteps.h"
+#include "FrontDoor.h"
 
 /// The steps of the operations that start from one object: Associators, References and their names.
 namespace Tarn::CPUProvider {

@@ -14,6 +14,7 @@
 #include "host/broker/Value.h"
 #include "host/cli/ClassList.h"
 #include "host/cli/results/ValueNames.h"
+#include "include/CPUClassNames.h"
 #include "tests/schema/Mof.h"
 
 namespace Corvcim {
@@ -151,6 +152,34 @@ TEST(Classes, KeysOfTheParentsAreKeysHere) {
       }
     }
   }
+}
+
+// A broker that compares names letter by letter takes the parent's spelling.
+TEST(Classes, MofSpellsPropertiesAsTheParentDoes) {
+  for (const Mof::Class& each : allClasses()) {
+    for (const Mof::Property& property : each.properties) {
+      if (const PropertyDefinition* inherited = inheritedProperty(*findClass(each.name), property.name)) {
+        EXPECT_EQ(property.name, inherited->name) << each.name;
+      }
+    }
+  }
+}
+
+TEST(Classes, LibraryKnowsEachParentOfItsClasses) {
+  Lines expected;
+  for (const ClassDefinition& definition : classDefinitions()) {
+    for (std::string_view each = definition.name; !parentOf(each).empty(); each = parentOf(each)) {
+      expected.insert(std::string(each) + " : " + std::string(parentOf(each)));
+    }
+  }
+
+  Lines known;
+  for (const Tarn::CPUProvider::ClassParent& each : Tarn::CPUProvider::classParents) {
+    known.insert(std::string(each.name) + " : " + each.parent);
+  }
+
+  EXPECT_EQ(known, expected);
+  EXPECT_EQ(std::size(Tarn::CPUProvider::classParents), expected.size());
 }
 
 TEST(DmtfClasses, FormOneTreeWithThreeKindsOfTop) {

@@ -37,6 +37,8 @@ CORVANE_OPERATION(CMPICount, CMGetKeyCount, (const CMPIObjectPath* path, CMPISta
                   path->ft->getKeyCount(path, rc))
 CORVANE_OPERATION(CMPIString*, CMGetNameSpace, (const CMPIObjectPath* path, CMPIStatus* rc),
                   path->ft->getNameSpace(path, rc))
+CORVANE_OPERATION(CMPIStatus, CMSetClassName, (const CMPIObjectPath* path, const char* name),
+                  path->ft->setClassName(path, name))
 CORVANE_OPERATION(CMPIStatus, CMSetHostname, (const CMPIObjectPath* path, const char* name),
                   path->ft->setHostname(path, name))
 CORVANE_OPERATION(CMPIStatus, CMSetNameSpace, (const CMPIObjectPath* path, const char* name),
@@ -71,6 +73,10 @@ CORVANE_OPERATION(CMPIStatus, CMReturnObjectPath, (const CMPIResult* result, con
                   result->ft->returnObjectPath(result, path))
 
 #undef CORVANE_OPERATION
+
+/* Operations of every kind of object, which the standard leaves as macros. */
+#define CMClone(object, rc) ((object)->ft->clone((object), (rc)))
+#define CMRelease(object) ((object)->ft->release((object)))
 
 static inline void CMSetStatusWithChars(const CMPIBroker* broker, CMPIStatus* status, const CMPIrc code,
                                         const char* text) {
