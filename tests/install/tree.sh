@@ -2,7 +2,7 @@
 # scripts/check-packages.
 # shellcheck shell=bash disable=SC2154
 
-install_tests=${BASH_SOURCE[0]%/*}
+install_tests=$(cd "${BASH_SOURCE[0]%/*}" && pwd)
 
 # elf FILE CLASS: the first bytes of a program of 32 (1) or 64 (2) bits.
 elf() {
