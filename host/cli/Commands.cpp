@@ -116,7 +116,7 @@ Outcome askLibraries(const Options& options) {
   }
   if (options.verb->verb == Verb::Overview) {
     Dispatcher dispatcher(files);
-    return showOverview(dispatcher, options.nameSpace, options.format);
+    return showOverview(dispatcher, options);
   }
   return performOperation(files, options);
 }

@@ -92,10 +92,8 @@ Operation withoutEmptyFilters(Operation operation) {
 std::string write(const Options& options, const Operation& operation, const Response& response) {
   const Format format = options.format;
   if (hasColumns(format)) {
-    const std::optional<std::vector<std::string>> columns =
-        options.hasPropertyList ? std::optional(options.properties) : std::nullopt;
     const std::vector<Instance> rows = givesPaths(operation.kind) ? keysOf(response.paths) : response.instances;
-    return format == Format::Csv ? rowsAsCsv(rows, columns) : rowsAsTable(rows, columns);
+    return rowsAs(format, rows, columnsAskedFor(options));
   }
   if (givesPaths(operation.kind)) {
     return writePaths(format, response.paths);

@@ -2,17 +2,16 @@
 
 #include <algorithm>
 #include <array>
-#include <functional>
 #include <optional>
 #include <string_view>
 #include <utility>
 
 #include "host/cli/InventoryText.h"
-#include "host/cli/NodeFields.h"
 #include "host/cli/Operations.h"
-#include "host/cli/ProcessorState.h"
+#include "host/cli/OverviewParts.h"
 #include "host/cli/Quantities.h"
 #include "host/cli/Text.h"
+#include "host/cli/results/TableWriter.h"
 #include "host/cli/results/ValueNames.h"
 #include "platform/instrumentation/ProcessTree.h"
 
@@ -43,24 +42,6 @@ std::string listed(std::initializer_list<std::string> texts) {
   return line;
 }
 
-/// A processor with its state and its node, which is nullptr where the inventory does not have it.
-struct Shown {
-  const OverviewProcessor* overview;
-  ProcessorState state;
-  const Node* node;
-};
-
-std::vector<Shown> worstFirst(const OverviewData& data, const Tree& tree) {
-  std::vector<Shown> shown;
-  for (const OverviewProcessor& overview : data.processors) {
-    ProcessorState state = stateOf(overview.processor, overview.capabilities, tree);
-    const Node* node = processorNode(tree, state.path);
-    shown.push_back({&overview, std::move(state), node});
-  }
-  std::ranges::stable_sort(shown, std::greater(), [](const Shown& each) { return each.state.severity; });
-  return shown;
-}
-
 std::string clockText(const Instance& processor, std::string_view property, std::string_view what) {
   const std::uint64_t clock = propertyNumber(processor, property).value_or(0);
   return clock == 0 ? std::string() : formatMegahertz(clock) + ' ' + std::string(what);
@@ -70,11 +51,6 @@ std::string clockText(const Instance& processor, std::string_view property, std:
 std::string withKernels(const std::string& answered, const std::string& kernels) {
   const bool isWithheld = answered == "Unknown" && !kernels.empty() && kernels != answered;
   return isWithheld ? "Unknown to clients; the kernel reports " + kernels : answered;
-}
-
-std::string kernelModel(const Shown& shown, const Tree& tree) {
-  const std::string* model = shown.node == nullptr ? nullptr : tree.text(*shown.node, Lexicon::PropProcessorName);
-  return model == nullptr ? "" : toPrintable(*model);
 }
 
 std::string modelText(const Shown& shown, const Tree& tree) {
@@ -96,44 +72,6 @@ std::string widthText(const Instance& processor) {
   const std::uint64_t address = propertyNumber(processor, "AddressWidth").value_or(0);
   return listed({data == 0 ? "" : std::to_string(data) + " data bits",
                  address == 0 ? "" : std::to_string(address) + " address bits"});
-}
-
-struct CacheKind {
-  std::string name;    ///< "L1d"; "cache" where the level is not known
-  std::uint64_t size;  ///< bytes; 0 where it is not known
-  std::size_t count;
-
-  std::string label() const { return size == 0 ? name : name + ' ' + formatBytes(size); }
-};
-
-std::string cacheName(const Instance& association) {
-  constexpr std::uint64_t firstLevelCode = 3;
-  constexpr std::uint64_t lastLevelCode = 5;
-  constexpr std::uint64_t instruction = 2;
-  constexpr std::uint64_t data = 3;
-  const std::uint64_t level = propertyNumber(association, "Level").value_or(0);
-  const std::uint64_t type = propertyNumber(association, "CacheType").value_or(0);
-  if (level < firstLevelCode || level > lastLevelCode) {
-    return "cache";
-  }
-  return "L" + std::to_string(level - firstLevelCode + 1) + (type == instruction ? "i" : type == data ? "d" : "");
-}
-
-std::vector<CacheKind> cacheKinds(const std::vector<OverviewCache>& caches) {
-  std::vector<CacheKind> kinds;
-  for (const auto& [cache, association] : caches) {
-    const CacheKind kind = {
-        cacheName(association),
-        propertyNumber(cache, "BlockSize").value_or(0) * propertyNumber(cache, "NumberOfBlocks").value_or(0), 1};
-    const auto same = std::ranges::find(kinds, kind.label(), &CacheKind::label);
-    if (same == kinds.end()) {
-      kinds.push_back(kind);
-    } else {
-      ++same->count;
-    }
-  }
-  std::ranges::sort(kinds, {}, &CacheKind::label);
-  return kinds;
 }
 
 std::string cacheText(const std::vector<OverviewCache>& caches) {
@@ -227,14 +165,6 @@ std::vector<std::pair<std::string, std::size_t>> countStates(const std::vector<S
   return counts;
 }
 
-std::vector<ProcessorState> statesOf(const std::vector<Shown>& processors) {
-  std::vector<ProcessorState> states;
-  for (const Shown& shown : processors) {
-    states.push_back(shown.state);
-  }
-  return states;
-}
-
 /// "4 sockets (1 failed, 2 in use, 1 empty socket): 24 cores, 16 enabled, 48 threads"; empty for a lone processor.
 std::string totalLine(const std::vector<Shown>& processors, std::span<const Node* const> unreported) {
   const std::size_t count = processors.size() + unreported.size();
@@ -268,10 +198,6 @@ std::string systemLine(const Instance& system) {
   return (name.empty() ? "This machine" : name) + (make.empty() ? "" : ": " + make) + '\n';
 }
 
-bool isVirtual(const OverviewData& data) {
-  return propertyText(data.system, "Model").find("Virtual") != std::string::npos;
-}
-
 /// What a virtual machine may lack, by the ends of the files' names.
 constexpr std::array<std::pair<std::string_view, std::string_view>, 3> virtualLacks = {
     {{"/smbios_entry_point", "firmware tables"},
@@ -300,46 +226,25 @@ std::string unreadText(const Tree& tree, bool isOnVirtual) {
          (others.empty() ? "" : '\n' + others);
 }
 
-OrderedJson countOrNull(std::optional<std::uint64_t> count) {
-  return count ? OrderedJson(*count) : OrderedJson();
-}
-
-OrderedJson numberOrNull(const Instance& instance, std::string_view property) {
-  return countOrNull(propertyNumber(instance, property));
-}
-
-OrderedJson cachesAsJson(const std::vector<OverviewCache>& caches) {
-  OrderedJson list = OrderedJson::array();
-  for (const CacheKind& kind : cacheKinds(caches)) {
-    list.push_back({{"name", kind.name},
-                    {"size", kind.size == 0 ? OrderedJson() : OrderedJson(kind.size)},
-                    {"count", kind.count}});
+void checkColumns(const std::vector<Instance>& rows, const ColumnList& columns) {
+  for (const std::string& name : columns.value_or(std::vector<std::string>())) {
+    if (!rows.empty() && rows.front().property(name) == nullptr) {
+      std::vector<std::string> known;
+      for (const NamedValue& property : rows.front().properties) {
+        known.push_back(property.name);
+      }
+      throw UsageError("the overview has no column '" + name + "': there are " + joined(known));
+    }
   }
-  return list;
 }
 
-void addCounts(OrderedJson& json, const CoreCounts& counts) {
-  json["cores"] = countOrNull(counts.cores);
-  json["enabledCores"] = countOrNull(counts.enabled);
-  json["threads"] = countOrNull(counts.threads);
-}
-
-OrderedJson processorAsJson(const Shown& shown, const Tree& tree) {
-  const Instance& processor = shown.overview->processor;
-  OrderedJson json = {{"path", shown.state.path},
-                      {"severity", severityName(shown.state.severity)},
-                      {"reasons", shown.state.reasons},
-                      {"model", textOrNull(propertyText(processor, "Name"))},
-                      {"inventoryModel", textOrNull(kernelModel(shown, tree))},
-                      {"stepping", textOrNull(propertyText(processor, "Stepping"))}};
-  constexpr std::string_view numbers[] = {"Family",        "CPUStatus", "EnabledState",      "HealthState",
-                                          "MaxClockSpeed", "DataWidth", "CurrentClockSpeed", "AddressWidth"};
-  for (const std::string_view property : numbers) {
-    json[std::string(property)] = numberOrNull(processor, property);
+std::string write(const OverviewData& data, const Tree& tree, const Options& options) {
+  if (hasColumns(options.format)) {
+    const std::vector<Instance> rows = overviewRows(data, tree);
+    checkColumns(rows, columnsAskedFor(options));
+    return rowsAs(options.format, rows, columnsAskedFor(options));
   }
-  addCounts(json, shown.state.counts);
-  json["caches"] = cachesAsJson(shown.overview->caches);
-  return json;
+  return options.format == Format::Json ? writeOverviewAsJson(data, tree) : writeOverview(data, tree);
 }
 
 }  // namespace
@@ -357,29 +262,8 @@ std::string writeOverview(const OverviewData& data, const Tree& tree) {
   return text + unreportedLine(others) + unreadText(tree, isVirtual(data));
 }
 
-std::string writeOverviewAsJson(const OverviewData& data, const Tree& tree) {
-  const std::vector<Shown> processors = worstFirst(data, tree);
-  const std::vector<ProcessorState> states = statesOf(processors);
-  OrderedJson json = {{"system",
-                       {{"name", textOrNull(propertyText(data.system, "Name"))},
-                        {"manufacturer", textOrNull(propertyText(data.system, "Manufacturer"))},
-                        {"model", textOrNull(propertyText(data.system, "Model"))},
-                        {"virtual", isVirtual(data)}}}};
-  addCounts(json, totalOf(states));
-  json["processors"] = OrderedJson::array();
-  for (const Shown& shown : processors) {
-    json["processors"].push_back(processorAsJson(shown, tree));
-  }
-  json["notReported"] = OrderedJson::array();
-  for (const Node* node : unreported(states, tree)) {
-    json["notReported"].push_back({{"path", node->path()}, {"status", node->status}});
-  }
-  json["unread"] = unreadAsJson(tree.unread());
-  return jsonDocument(json);
-}
-
-Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace, Format format) {
-  const OverviewData data = gatherOverview(dispatcher, nameSpace);
+Outcome showOverview(Dispatcher& dispatcher, const Options& options) {
+  const OverviewData data = gatherOverview(dispatcher, options.nameSpace);
   Outcome outcome;
   outcome.errors = data.failures;
   if (data.processors.empty()) {
@@ -387,11 +271,9 @@ Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace, Forma
       return {"", {*error}};
     }
   }
-  if (!data.processorsAreKnown) {
-    return outcome;
+  if (data.processorsAreKnown) {
+    outcome.output = write(data, *Tarn::Inventory::processTree(), options);
   }
-  const auto tree = Tarn::Inventory::processTree();
-  outcome.output = format == Format::Json ? writeOverviewAsJson(data, *tree) : writeOverview(data, *tree);
   return outcome;
 }
 

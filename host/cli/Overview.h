@@ -2,6 +2,7 @@
 #define HOST_CLI_OVERVIEW_H
 
 #include <string>
+#include <vector>
 
 #include "host/cli/Commands.h"
 #include "host/cli/OverviewData.h"
@@ -10,7 +11,8 @@
 namespace Corvcim {
 
 /// One screen about the processors, from what the providers tell, and what could not be read.
-Outcome showOverview(Dispatcher& dispatcher, const std::string& nameSpace, Format format);
+/// Throws UsageError for a column that a table of processors does not have.
+Outcome showOverview(Dispatcher& dispatcher, const Options& options);
 
 /// The screen itself. Processors that differ in nothing but their identity share one paragraph, those in the worst
 /// state come first. What the library does not report comes from the inventory: states of parts, empty sockets, what
@@ -19,6 +21,9 @@ std::string writeOverview(const OverviewData& data, const Tarn::Inventory::Tree&
 
 /// The same for programs, each processor by itself: codes and numbers in base units, null for what is not known.
 std::string writeOverviewAsJson(const OverviewData& data, const Tarn::Inventory::Tree& tree);
+
+/// A row for each processor, with the same properties for all.
+std::vector<Instance> overviewRows(const OverviewData& data, const Tarn::Inventory::Tree& tree);
 
 }  // namespace Corvcim
 

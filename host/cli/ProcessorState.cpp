@@ -161,14 +161,14 @@ std::string coreText(const CoreCounts& counts) {
     add(counted(*counts.cores, "core"));
   }
   if (counts.enabled) {
-    const bool isAll = counts.cores == counts.enabled && *counts.enabled > 1;
+    const bool isAll = counts.cores == counts.enabled && *counts.enabled > 1 && counts.withoutCore == 0;
     add(isAll ? "all enabled" : *counts.enabled == 0 ? "none enabled" : std::to_string(*counts.enabled) + " enabled");
   }
   if (counts.threads) {
     add(counted(*counts.threads, "thread"));
   }
   if (counts.withoutCore != 0) {
-    add(std::to_string(counts.withoutCore) + " of them of unknown cores");
+    add(std::to_string(counts.withoutCore) + " of them on no known core");
   }
   return text;
 }

@@ -7,6 +7,7 @@ constexpr Format textOnly[] = {Format::Text};
 constexpr Format classFormats[] = {Format::Text, Format::Mof, Format::Json};
 constexpr Format dataFormats[] = {Format::Text, Format::Table, Format::Csv, Format::Mof, Format::Json};
 constexpr Format plainFormats[] = {Format::Text, Format::Json};
+constexpr Format overviewFormats[] = {Format::Text, Format::Table, Format::Csv, Format::Json};
 constexpr Format drawingFormats[] = {Format::Text, Format::Json, Format::Svg, Format::Dot};
 
 constexpr std::string_view pathDetails =
@@ -66,7 +67,7 @@ constexpr std::string_view healthDetails =
     "the command line and errors of the program are UNKNOWN.\n";
 
 constexpr VerbSyntax overview = {
-    .name = "", .verb = Verb::Overview, .summary = "one screen about the processors", .formats = plainFormats};
+    .name = "", .verb = Verb::Overview, .summary = "one screen about the processors", .formats = overviewFormats};
 
 constexpr VerbSyntax syntaxes[] = {
     {.name = "classes",

@@ -241,6 +241,8 @@ MachineProcessor readProcessor(const Tree& tree, NodeIndex index) {
     }
   }
   processor.coreCount = cores.size();
+  processor.enabledCount =
+      static_cast<std::size_t>(std::ranges::count(cores, Tarn::Inventory::Status::inUse, &MachinePart::status));
   readParts(processor, std::move(caches), std::move(cores));
   processor.numaNodes = numaNodesOf(tree, node.cpus);
   labelNuma(tree, processor.parts, processor.numaNodes);
@@ -257,6 +259,14 @@ std::size_t Machine::coreCount() const {
   std::size_t count = 0;
   for (const MachineProcessor& processor : processors) {
     count += processor.coreCount;
+  }
+  return count;
+}
+
+std::size_t Machine::enabledCount() const {
+  std::size_t count = 0;
+  for (const MachineProcessor& processor : processors) {
+    count += processor.enabledCount;
   }
   return count;
 }

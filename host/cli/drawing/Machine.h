@@ -42,6 +42,7 @@ struct MachineProcessor {
   unsigned int status = 0;
   unsigned int maxClock = 0;  ///< MHz; 0 where unknown
   std::size_t coreCount = 0;
+  std::size_t enabledCount = 0;         ///< cores in use
   std::size_t threadCount = 0;          ///< 0 where unknown
   std::vector<unsigned int> numaNodes;  ///< of the CPUs; empty where the machine has fewer than two
   std::vector<MachinePart> parts;       ///< empty for an empty socket
@@ -56,6 +57,7 @@ struct Machine {
   std::vector<MachineProcessor> processors;
 
   std::size_t coreCount() const;
+  std::size_t enabledCount() const;
 };
 
 /// "NUMA node 1", "NUMA nodes 0, 1"; empty for none.

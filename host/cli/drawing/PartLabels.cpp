@@ -1,5 +1,6 @@
 #include "host/cli/drawing/PartLabels.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/cli/Quantities.h"
@@ -7,6 +8,14 @@
 #include "host/cli/Text.h"
 
 namespace Corvcim {
+namespace {
+
+/// "8 cores", "8 cores, 6 enabled".
+std::string coreTotal(std::size_t cores, std::size_t enabled) {
+  return counted(cores, "core") + (enabled == cores ? "" : ", " + std::to_string(enabled) + " enabled");
+}
+
+}  // namespace
 
 std::string labelOf(const CacheUnit& cache) {
   return cache.size == 0 ? cache.name : cache.name + ' ' + formatBytes(cache.size);
@@ -47,7 +56,7 @@ std::string labelsOf(std::span<const CacheUnit> caches) {
 std::vector<std::string> factsOf(const MachineProcessor& processor) {
   std::vector<std::string> facts;
   if (processor.coreCount != 0) {
-    facts.push_back(counted(processor.coreCount, "core"));
+    facts.push_back(coreTotal(processor.coreCount, processor.enabledCount));
   }
   if (processor.threadCount != 0) {
     facts.push_back(counted(processor.threadCount, "thread"));
@@ -71,8 +80,13 @@ std::string summaryOf(const Machine& machine) {
   }
   std::string summary = machine.model;
   const auto add = [&summary](const std::string& fact) { summary += (summary.empty() ? "" : " · ") + fact; };
-  add(counted(machine.processors.size(), "processor"));
-  add(counted(machine.coreCount(), "core"));
+  const auto empty = static_cast<std::size_t>(
+      std::ranges::count(machine.processors, Tarn::Inventory::Status::emptySocket, &MachineProcessor::status));
+  add(counted(machine.processors.size() - empty, "processor"));
+  if (empty != 0) {
+    add(counted(empty, "empty socket"));
+  }
+  add(coreTotal(machine.coreCount(), machine.enabledCount()));
   if (threads != 0) {
     add(counted(threads, "thread"));
   }

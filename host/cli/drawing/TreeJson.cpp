@@ -47,6 +47,7 @@ std::string drawTreeJson(const Machine& machine) {
                           {"name", textOrNull(processor.name)},
                           {"status", processor.status},
                           {"cores", processor.coreCount},
+                          {"enabledCores", processor.enabledCount},
                           {"threads", numberOrNull(processor.threadCount)},
                           {"maxClock", numberOrNull(processor.maxClock)},
                           {"numaNodes", processor.numaNodes},

@@ -106,6 +106,10 @@ std::string fieldOf(const Value* value) {
 
 }  // namespace
 
+ColumnList columnsAskedFor(const Options& options) {
+  return options.hasPropertyList ? ColumnList(options.properties) : std::nullopt;
+}
+
 std::vector<Instance> keysOf(std::span<const ObjectPath> paths) {
   std::vector<Instance> rows;
   for (const ObjectPath& path : paths) {
@@ -142,6 +146,10 @@ std::string rowsAsCsv(std::span<const Instance> rows, const ColumnList& columns)
     }
   }
   return text;
+}
+
+std::string rowsAs(Format format, std::span<const Instance> rows, const ColumnList& columns) {
+  return format == Format::Csv ? rowsAsCsv(rows, columns) : rowsAsTable(rows, columns);
 }
 
 }  // namespace Corvcim

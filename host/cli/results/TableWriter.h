@@ -7,11 +7,15 @@
 #include <vector>
 
 #include "host/broker/Instance.h"
+#include "host/cli/Options.h"
 
 namespace Corvcim {
 
 /// The columns that were asked for, by the names of properties; nothing for all.
 using ColumnList = std::optional<std::vector<std::string>>;
+
+/// What the options say of columns.
+ColumnList columnsAskedFor(const Options& options);
 
 /// Paths as instances that have nothing but their keys.
 std::vector<Instance> keysOf(std::span<const ObjectPath> paths);
@@ -26,6 +30,9 @@ std::string rowsAsTable(std::span<const Instance> rows, const ColumnList& column
 /// Codes and numbers stand as they are, references as paths, lists as JSON writes them. What is not known is an empty
 /// field, an empty text is "".
 std::string rowsAsCsv(std::span<const Instance> rows, const ColumnList& columns);
+
+/// As one of them: the format is Table or Csv.
+std::string rowsAs(Format format, std::span<const Instance> rows, const ColumnList& columns);
 
 }  // namespace Corvcim
 

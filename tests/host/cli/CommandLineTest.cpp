@@ -232,6 +232,20 @@ TEST(Corvcim, OverviewAsJsonHasEveryProcessor) {
             R"({"count":64,"name":"L2","size":524288},{"count":8,"name":"L3","size":33554432}])");
 }
 
+TEST(Corvcim, OverviewAsATableHasARowForEachProcessor) {
+  EXPECT_EQ(corvcimOn(smallBoard(), {"-o", "table"}),
+            success("Path  Severity  CPUStatus   HealthState  Cores  EnabledCores  Threads  MaxClockSpeed  Family      "
+                    "Model\n"
+                    "P0    DEGRADED  1 (In Use)  5 (OK)       4      3             4        1500 MHz       179 (Xeon)  "
+                    "Board CPU 4\n"));
+  EXPECT_EQ(corvcimOn(smallBoard(), {"-o", "csv", "--columns", "model,Path"}),
+            success("model,Path\r\nBoard CPU 4,P0\r\n"));
+  EXPECT_EQ(corvcimOn(smallBoard(), {"-o", "csv", "--columns", "Cors"}),
+            (Finished{2, "",
+                      "corvcim: the overview has no column 'Cors': there are Path, Severity, CPUStatus, HealthState, "
+                      "Cores, EnabledCores, Threads, MaxClockSpeed, Family, Model\n"}));
+}
+
 TEST(Corvcim, HealthIsALineForEachProcessorAndAStatus) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"health"}), success("OK P0: 2 cores, all enabled, 2 threads\n"));
   EXPECT_EQ(corvcimOn(smallBoard(), {"health"}), (Finished{1, "DEGRADED P0: 4 cores, 3 enabled, 4 threads\n", ""}));

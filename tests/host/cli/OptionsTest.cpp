@@ -142,8 +142,8 @@ TEST(Options, FormatsBelongToVerbs) {
             "ei has no output format 'svg': it can be text, table, csv, mof or json; see 'corvcim --help'");
   EXPECT_EQ(complaint({"tree", "-o", "mof"}),
             "tree has no output format 'mof': it can be text, json, svg or dot; see 'corvcim --help'");
-  EXPECT_EQ(complaint({"-o", "csv"}),
-            "the overview has no output format 'csv': it can be text or json; see 'corvcim --help'");
+  EXPECT_EQ(complaint({"-o", "svg"}),
+            "the overview has no output format 'svg': it can be text, table, csv or json; see 'corvcim --help'");
 }
 
 TEST(Options, AssociationOptionsBelongToAssociationVerbs) {

@@ -200,7 +200,7 @@ TEST(Overview, CpusWithoutAKnownCoreAreCounted) {
   const Tree tree =
       TreeBuilder().processor("P0").cpus({0, 1, 2, 3}).core("P0.C0").cpus({0}).core("P0.C1").cpus({1}).build();
 
-  EXPECT_NE(writeOverview(data, tree).find("  Cores   2 cores, all enabled, 4 threads, 2 of them of unknown cores\n"),
+  EXPECT_NE(writeOverview(data, tree).find("  Cores   2 cores, 2 enabled, 4 threads, 2 of them on no known core\n"),
             std::string::npos);
 }
 
@@ -249,6 +249,7 @@ TEST(Overview, OfAVirtualMachineSaysWhatTheKernelReportsAndOnceWhatIsNotThere) {
 TEST(OverviewAsJson, HasNumbersInBaseUnitsAndNullForWhatIsNotKnown) {
   OverviewData data = virtualData();
   data.processors[0].caches = {cache(5, 4, 262144), cache(3, 3, 0)};
+  assignValue(data.processors[0].processor.properties, "MaxClockSpeed", Value::uint32(0));
   const Tree tree =
       TreeBuilder().processor("P0").text(Tarn::NodeLexicon::PropProcessorName, "X").processor("S").status(15).build();
 
@@ -274,9 +275,9 @@ TEST(OverviewAsJson, HasNumbersInBaseUnitsAndNullForWhatIsNotKnown) {
       "CPUStatus": 1,
       "EnabledState": 2,
       "HealthState": 5,
-      "MaxClockSpeed": 2300,
-      "DataWidth": 64,
       "CurrentClockSpeed": 800,
+      "MaxClockSpeed": null,
+      "DataWidth": 64,
       "AddressWidth": 64,
       "cores": 2,
       "enabledCores": 2,

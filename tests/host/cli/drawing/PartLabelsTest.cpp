@@ -5,6 +5,8 @@
 
 #include <vector>
 
+#include "tests/host/cli/Machines.h"
+
 namespace Corvcim {
 namespace {
 
@@ -13,6 +15,11 @@ TEST(PartLabels, EqualCachesAreCounted) {
   const CacheUnit off = {"L2", 1U << 20U, 16};
 
   EXPECT_EQ(labelsOf(std::vector<CacheUnit>{first, first, off}), "2 × L2 1 MiB, L2 1 MiB (disabled)");
+}
+
+TEST(PartLabels, TheSummaryCountsEmptySocketsAndDisabledCoresAsSuch) {
+  EXPECT_EQ(summaryOf(readMachine(Testing::smallBoard(), "x")),
+            "BoardBox · 1 processor · 1 empty socket · 4 cores, 3 enabled · 4 threads");
 }
 
 }  // namespace

@@ -94,7 +94,7 @@ TEST(TreeText, DualSocketServerFitsAScreen) {
 TEST(TreeText, StatesAndUnknownSharingAreSaid) {
   EXPECT_EQ(drawn(Testing::smallBoard()),
             "host: BoardBox\n"
-            "├─ processor P0: Board CPU 4; 4 cores; 4 threads; up to 1.5 GHz\n"
+            "├─ processor P0: Board CPU 4; 4 cores, 3 enabled; 4 threads; up to 1.5 GHz\n"
             "│  ├─ L2 1 MiB: shared by 4 cores\n"
             "│  │  ├─ core P0.C0: CPU 0; L1d 32 KiB, L1i 48 KiB\n"
             "│  │  ├─ core P0.C1: CPU 1; L1d 32 KiB, L1i 48 KiB\n"
@@ -155,6 +155,7 @@ TEST(TreeJson, NestsPartsAsTheDrawingsDo) {
       "name": null,
       "status": 1,
       "cores": 2,
+      "enabledCores": 1,
       "threads": null,
       "maxClock": null,
       "numaNodes": [
