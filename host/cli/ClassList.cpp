@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "host/ClassTable.h"
+#include "host/broker/Dispatcher.h"
 #include "host/broker/Value.h"
 #include "host/cli/Text.h"
 #include "host/cli/results/Json.h"
@@ -158,8 +159,7 @@ std::string writeClassList(Format format) {
 std::string writeClass(Format format, std::string_view name) {
   const Classes classes = classesServing(name);
   if (classes.empty()) {
-    throw std::runtime_error("classes: no class " + quotedText(name) +
-                             " is served here; 'corvcim classes' lists those that are");
+    throw std::runtime_error("classes: no class " + quotedText(name) + " is served here; " + suggestClasses(name));
   }
   if (format == Format::Json) {
     return classes.size() == 1 ? jsonDocument(classAsJson(*classes.front())) : classesAsJson(classes);

@@ -198,17 +198,22 @@ std::string_view wordAt(std::string_view words, std::size_t index) {
   return words.substr(0, words.find(' '));
 }
 
+const VerbSyntax& verbNamed(const std::string& name) {
+  const VerbSyntax* verb = findVerb(name);
+  if (verb == nullptr) {
+    std::vector<std::string_view> names;
+    std::ranges::transform(verbs(), std::back_inserter(names), &VerbSyntax::name);
+    failNear("unknown verb " + quoted(name), name, names);
+  }
+  return *verb;
+}
+
 /// The words that are no options: the verb and its operands.
 void takeOperands(Options& options, const std::vector<std::string>& operands) {
   if (operands.empty()) {
     return;
   }
-  const VerbSyntax* verb = findVerb(operands.front());
-  if (verb == nullptr) {
-    std::vector<std::string_view> names;
-    std::ranges::transform(verbs(), std::back_inserter(names), &VerbSyntax::name);
-    failNear("unknown verb " + quoted(operands.front()), operands.front(), names);
-  }
+  const VerbSyntax* verb = &verbNamed(operands.front());
   options.verb = verb;
   const std::size_t count = operands.size() - 1;
   if (options.wantsHelp) {
@@ -219,6 +224,11 @@ void takeOperands(Options& options, const std::vector<std::string>& operands) {
   }
   if (count > verb->maximumOperands) {
     fail(*verb, "unexpected argument " + quoted(operands[verb->maximumOperands + 1]));
+  }
+  if (verb->verb == Verb::Help) {
+    options.wantsHelp = true;
+    options.verb = count == 0 ? &overviewSyntax() : &verbNamed(operands[1]);
+    return;
   }
   options.operands.assign(operands.begin() + 1, operands.end());
   if (verb->verb == Verb::Diff) {

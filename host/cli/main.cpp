@@ -41,27 +41,14 @@ bool isForTerminal(const Corvcim::Options& options) {
          options.verb->verb != Corvcim::Verb::Snapshot;
 }
 
-/// The help of the program, of the verb before --help, or of the one after the verb help.
-std::string helpText(const Corvcim::Options& options) {
-  const Corvcim::VerbSyntax* verb = options.verb;
-  if (verb->verb == Corvcim::Verb::Help && !options.operands.empty()) {
-    verb = Corvcim::findVerb(options.operand(0));
-    if (verb == nullptr) {
-      throw Corvcim::UsageError("help: unknown verb '" + std::string(options.operand(0)) + "'; see 'corvcim --help'");
-    }
-  } else if (verb->verb == Corvcim::Verb::Help && !options.wantsHelp) {
-    return Corvcim::programHelp();
-  }
-  return verb->name.empty() ? Corvcim::programHelp() : Corvcim::verbHelp(*verb);
-}
-
 int run(const Corvcim::Options& options, Corvcim::Charset charset) {
   if (options.wantsVersion) {
     Corvcim::writeOutput(Corvcim::versionText());
     return Success;
   }
-  if (options.wantsHelp || options.verb->verb == Corvcim::Verb::Help) {
-    Corvcim::writeOutput(helpText(options));
+  if (options.wantsHelp) {
+    const bool isAboutVerb = !options.verb->name.empty();
+    Corvcim::writeOutput(isAboutVerb ? Corvcim::verbHelp(*options.verb) : Corvcim::programHelp());
     return Success;
   }
   Corvcim::useCharset(isForTerminal(options) ? charset : Corvcim::Charset::Utf8);

@@ -363,15 +363,15 @@ TEST(Corvcim, ShowsOneClassWithTypesKeysUnitsAndValueNames) {
       EXPECT_EQ(property["values"]["25"], "Critical Failure");
     }
   }
-  EXPECT_EQ(corvcim({"classes", "HALDA_Disk"}),
-            failed("classes: no class \"HALDA_Disk\" is served here; 'corvcim classes' lists those that are"));
+  EXPECT_EQ(corvcim({"classes", "HALDA_CPUMemry"}),
+            failed("classes: no class \"HALDA_CPUMemry\" is served here; did you mean HALDA_CPUMemory?"));
 }
 
 TEST(Corvcim, HelpOfAVerbIsThatAfterIt) {
   EXPECT_EQ(corvcim({"help"}), corvcim({"--help"}));
   EXPECT_EQ(corvcim({"help", "ein"}), corvcim({"ein", "--help"}));
   EXPECT_EQ(corvcim({"help", "enumerate"}),
-            (Finished{2, "", "corvcim: help: unknown verb 'enumerate'; see 'corvcim --help'\n"}));
+            (Finished{2, "", "corvcim: unknown verb 'enumerate'; see 'corvcim --help'\n"}));
 }
 
 TEST(Corvcim, DeclaresTheClassesAsMof) {
