@@ -16,7 +16,7 @@ Outcome showOverview(Dispatcher& dispatcher, const Options& options);
 
 /// The screen itself. Processors that differ in nothing but their identity share one paragraph, those in the worst
 /// state come first. What the library does not report comes from the inventory: states of parts, empty sockets, what
-/// the kernel says of a virtual machine's processors, and what could not be read.
+/// the kernel reports of a virtual machine's processors, and what could not be read.
 std::string writeOverview(const OverviewData& data, const Tarn::Inventory::Tree& tree);
 
 /// The same for programs, each processor by itself: codes and numbers in base units, null for what is not known.

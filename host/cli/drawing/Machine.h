@@ -27,7 +27,7 @@ struct MachinePart {
   std::string corePath;            ///< of a core
   std::string coreKind;            ///< of a core, where the processor has several kinds: "P-core", "Cortex-A72 core"
   std::vector<unsigned int> numaNodes;  ///< of the CPUs; empty where the machine has fewer than two
-  std::string numa;                     ///< "NUMA node 1"; empty where the part around this one says so
+  std::string numa;                     ///< "NUMA node 1"; empty if the part around this one lies in the same
   unsigned int status = 0;              ///< of a core, as the inventory tells it
   Tarn::Inventory::CpuSet cpus;         ///< logical CPUs; empty where unknown
   std::size_t coreCount = 1;            ///< cores in this part
