@@ -42,10 +42,7 @@ first_of() {
   property=$1
   shift
   for path; do
-    if test "$property" "$root$path"; then
-      printf '%s\n' "$path"
-      return 0
-    fi
+    if test "$property" "$root$path"; then say "$path" && return 0; fi
   done
   return 1
 }
@@ -54,7 +51,7 @@ first_of() {
 expand() {
   for pattern; do
     for path in "$root"$pattern; do
-      [ ! -e "$path" ] || printf '%s\n' "${path#"$root"}"
+      [ ! -e "$path" ] || say "${path#"$root"}"
     done
   done
 }
@@ -98,7 +95,7 @@ our_links() {
   for directory; do
     for library in $libraries; do
       case $(readlink "$root$directory/lib$library.so" || :) in
-        /*"/cmpi/lib$library.so") printf '%s\n' "$directory/lib$library.so" ;;
+        /*"/cmpi/lib$library.so") say "$directory/lib$library.so" ;;
       esac
     done
   done

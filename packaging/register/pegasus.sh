@@ -80,6 +80,12 @@ pegasus_has_module() {
   grep -qs "^0 .*\.Name=\"$1\"" "$root$pegasus_repository/root#PG_InterOp/instances/PG_ProviderModule.idx"
 }
 
+pegasus_registered_modules() {
+  for module in $(pegasus_modules "$@"); do
+    ! pegasus_has_module "$module" || say "$module"
+  done
+}
+
 # pegasus_servers CLASS: the modules that serve it.
 pegasus_servers() {
   file=$root$pegasus_repository/root#PG_InterOp/instances/PG_ProviderCapabilities
@@ -111,12 +117,12 @@ pegasus_provider_directory() {
     directory=$(sed -n 's/^providerDir=\([^:]*\).*/\1/p' "$root$pegasus_configuration/$file" | head -n 1)
     case $directory in
       '') ;;
-      /*) printf '%s\n' "$directory" && return 0 ;;
-      *) printf '%s\n' "$pegasus_state/$directory" && return 0 ;;
+      /*) say "$directory" && return 0 ;;
+      *) say "$pegasus_state/$directory" && return 0 ;;
     esac
   done
   set -- $pegasus_provider_places
-  [ $# -eq 0 ] || printf '%s\n' "$1"
+  [ $# -eq 0 ] || say "$1"
 }
 
 pegasus_check_install() {
@@ -130,7 +136,7 @@ pegasus_check_install() {
       fail "the DMTF schema in $root$pegasus_repository/root#cimv2 has no $class; compile CIM schema 2.22 or later into root/cimv2, then run this again"
   done
   for unit in $units; do
-    pegasus_lacks_module "$unit" >/dev/null || pegasus_is_compiled "$data/pegasus/$unit.mof" || pegasus_need_server
+    pegasus_has_registration "$unit" || [ -z "$(pegasus_registered_modules "$unit")" ] || pegasus_need_server
   done
 }
 
@@ -139,7 +145,7 @@ pegasus_need_server() {
 }
 
 # The record has the checksum of each file that was compiled: what is equal is not compiled again.
-pegasus_mark() { printf '%s %s\n' "$(cksum <"$root$1")" "$1"; }
+pegasus_mark() { say "$(cksum <"$root$1") $1"; }
 pegasus_is_compiled() { grep -qsxF "$(pegasus_mark "$1")" "$root$pegasus_record"; }
 
 # pegasus_compile NAMESPACE FILE: through the server if it runs, else into the repository. Classes that another
@@ -176,6 +182,9 @@ pegasus_lacks_class() {
   return 1
 }
 
+pegasus_has_registration() { pegasus_is_compiled "$data/pegasus/$1.mof" && ! pegasus_lacks_module "$1" >/dev/null; }
+pegasus_has_schema() { pegasus_is_compiled "$data/schema/$1.mof" && ! pegasus_lacks_class "$1" >/dev/null; }
+
 # A file that is recorded with another checksum; what was compiled by hand has none.
 pegasus_is_outdated() {
   for file in "$data/pegasus/$1.mof" "$data/schema/$1.mof"; do
@@ -198,8 +207,7 @@ pegasus_problem() {
 # pegasus_remove_modules UNIT...
 pegasus_remove_modules() {
   pegasus_cimprovider=$root$(pegasus_tool cimprovider)
-  for module in $(pegasus_modules "$@"); do
-    pegasus_has_module "$module" || continue
+  for module in $(pegasus_registered_modules "$@"); do
     # Disabling ends the module's process; a module that is disabled already refuses.
     $dry_run || "$pegasus_cimprovider" -d -m "$module" >/dev/null 2>&1 || :
     step "remove module $module" "$pegasus_cimprovider" -r -m "$module"
@@ -210,25 +218,20 @@ pegasus_remove_modules() {
 pegasus_install() {
   link_libraries "$pegasus_providers"
   for unit in $units; do
-    if ! pegasus_is_compiled "$data/pegasus/$unit.mof" || pegasus_lacks_module "$unit" >/dev/null; then
+    if ! pegasus_has_registration "$unit"; then
       # The compiler does not replace an instance.
       pegasus_remove_modules "$unit"
       pegasus_compile "$interop" "$data/pegasus/$unit.mof"
     fi
-    if ! pegasus_is_compiled "$data/schema/$unit.mof" || pegasus_lacks_class "$unit" >/dev/null; then
-      pegasus_compile "$namespace" "$data/schema/$unit.mof"
-    fi
+    pegasus_has_schema "$unit" || pegasus_compile "$namespace" "$data/schema/$unit.mof"
   done
 }
 
 pegasus_is_registered() {
-  for module in $(pegasus_modules corvane-computersystem corvane-cpu); do
-    ! pegasus_has_module "$module" || return 0
-  done
   for class in $(classes_of "$data/schema/corvane-cpu.mof"); do
     ! pegasus_has_class "$class" || return 0
   done
-  [ -n "$(our_links $(pegasus_provider_directory))" ]
+  [ -n "$(pegasus_registered_modules corvane-computersystem corvane-cpu)$(our_links $(pegasus_provider_directory))" ]
 }
 
 pegasus_remove() {

@@ -21,7 +21,6 @@ sfcb_check_tools() {
   advice="install the broker completely first"
   need_file "$sfcb_config" "SFCB is there by half" "$advice"
   need_directory "$sfcb_stage" "SFCB is there by half" "$advice"
-  need_directory "$sfcb_registration" "SFCB is there by half" "$advice"
   [ -n "$sfcb_daemon" ] || fail "SFCB is there by half: no sfcbd in $root$sfcb_prefix/sbin; $advice"
   sfcb_repos=$(first_of -x "$sfcb_prefix/bin/sfcbrepos" "$sfcb_prefix/sbin/sfcbrepos") ||
     fail "SFCB is there by half: no sfcbrepos in $root$sfcb_prefix/bin; $advice"
@@ -37,13 +36,13 @@ sfcb_check_tools() {
 # sfcb_files UNIT...: seen from the staging directory.
 sfcb_files() {
   for unit; do
-    printf '%s\n' "mofs/$namespace/$unit.mof" "regs/$unit.reg"
+    say "mofs/$namespace/$unit.mof regs/$unit.reg"
   done
 }
 
 # What a staged file is a copy of.
 sfcb_source() {
-  case $1 in *.mof) printf '%s\n' "$data/schema/${1##*/}" ;; *) printf '%s\n' "$data/sfcb/${1##*/}" ;; esac
+  case $1 in *.mof) say "$data/schema/${1##*/}" ;; *) say "$data/sfcb/${1##*/}" ;; esac
 }
 
 # sfcbstage pipes a MOF file through a preprocessor that drops its comments.
@@ -55,7 +54,7 @@ sfcb_all_files() { sfcb_files corvane-computersystem corvane-cpu; }
 # The staged files of this product, of whatever version and by whomever they were staged.
 sfcb_staged() {
   for file in $(sfcb_all_files); do
-    ! grep -qsE '^class HALDA_|location:[[:blank:]]*corvc' "$root$sfcb_stage/$file" || printf '%s\n' "$file"
+    ! grep -qsE '^class HALDA_|location:[[:blank:]]*corvc' "$root$sfcb_stage/$file" || say "$file"
   done
 }
 
@@ -63,11 +62,9 @@ sfcb_staged() {
 sfcb_others() {
   pattern=$1
   shift
-  for path; do
-    if ! is_listed "${path#"$root$sfcb_stage/"}" $(sfcb_all_files) && grep -qsiE "$pattern" "$path"; then
-      printf '%s\n' "$path"
-      return 0
-    fi
+  # shellcheck disable=SC2013
+  for path in $(grep -lsiE "$pattern" "$@"); do
+    is_listed "${path#"$root$sfcb_stage/"}" $(sfcb_all_files) || { say "$path" && return 0; }
   done
   return 1
 }
@@ -86,7 +83,7 @@ sfcb_built() {
 sfcb_owner() {
   if sfcb_registers "$1" || sfcb_declares "$1"; then return 0; fi
   for location in $(sfcb_built "$1"); do
-    is_listed "$location" $libraries || { printf '%s\n' "$root$sfcb_registration/providerRegister" && return 0; }
+    is_listed "$location" $libraries || { say "$root$sfcb_registration/providerRegister" && return 0; }
   done
   return 1
 }
@@ -149,7 +146,7 @@ quietly() {
 sfcb_rebuild() {
   work=$root$sfcb_registration/corvane.new
   rm -rf "$work"
-  mkdir "$work"
+  mkdir -p "$work"
   cp -a "$root$sfcb_stage" "$work/stage"
   for part in repository providerRegister; do
     [ ! -e "$root$sfcb_registration/$part" ] || cp -a "$root$sfcb_registration/$part" "$work"

@@ -112,6 +112,9 @@ pegasus_that_is_stopped_is_compiled_into_but_not_taken_back() {
   expect_refusal "$pegasus_is_stopped" remove
   sed -i 's/Version = .*/Version = "7.7.7";/' "$tree$share/pegasus/corvane-cpu.mof"
   expect_refusal "$pegasus_is_stopped" install
+  # One of its two modules is gone already.
+  sed -i 's/^0\(.*CorvaneCPUModule\)/1\1/' "$tree$repository/root#PG_InterOp/instances/PG_ProviderModule.idx"
+  expect_refusal "$pegasus_is_stopped" install
 }
 
 pegasus_leaves_the_computer_system_to_its_agent() {
