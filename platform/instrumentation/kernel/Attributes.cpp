@@ -26,6 +26,21 @@ std::optional<std::string_view> Attributes::read(const char* path) {
   return valueOf(contents_);
 }
 
+std::optional<CpuSet> Attributes::cpusIn(unsigned int cpu, std::span<const std::string_view> suffixes) {
+  for (const std::string_view suffix : suffixes) {
+    const std::optional<std::string_view> value = text("cpu", cpu, "/", suffix);
+    std::optional<CpuSet> cpus = value ? parseCpus(suffix, *value) : std::nullopt;
+    if (cpus) {
+      return cpus;
+    }
+  }
+  return std::nullopt;
+}
+
+std::optional<CpuSet> Attributes::parseCpus(std::string_view fileName, std::string_view value) {
+  return fileName.ends_with("_list") ? CpuSet::fromList(value) : CpuSet::fromMask(value);
+}
+
 std::string_view Attributes::valueOf(std::string_view contents) {
   // The device tree ends its texts with a zero.
   return Common::trimmed(contents, std::string_view(" \t\n\0", 4));
@@ -35,6 +50,10 @@ std::optional<unsigned int> Attributes::toNumber(std::string_view text) {
   unsigned int number = 0;
   const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
   return error == std::errc() && end == text.data() + text.size() ? std::optional(number) : std::nullopt;
+}
+
+std::optional<unsigned int> Attributes::numberAfter(std::string_view prefix, std::string_view name) {
+  return name.starts_with(prefix) ? toNumber(name.substr(prefix.size())) : std::nullopt;
 }
 
 }  // namespace Tarn::Inventory

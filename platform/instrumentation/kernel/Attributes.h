@@ -3,6 +3,7 @@
 
 #include <array>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -38,6 +39,12 @@ class Attributes {
     return value ? CpuSet::fromList(*value) : std::nullopt;
   }
 
+  /// The CPUs that the first usable one of these files below cpuN/ holds.
+  std::optional<CpuSet> cpusIn(unsigned int cpu, std::span<const std::string_view> suffixes);
+
+  /// A file's value as CPU numbers: a list if the file's name ends with "_list", else a mask.
+  static std::optional<CpuSet> parseCpus(std::string_view fileName, std::string_view value);
+
   /// Why the last call could not read its file; 0 if it could.
   FileError error() const { return error_; }
 
@@ -50,6 +57,9 @@ class Attributes {
   static std::string_view valueOf(std::string_view contents);
 
   static std::optional<unsigned int> toNumber(std::string_view text);
+
+  /// The number after a prefix: 12 for "cpu12" after "cpu".
+  static std::optional<unsigned int> numberAfter(std::string_view prefix, std::string_view name);
 
  private:
   static constexpr std::size_t longestPath = 128;

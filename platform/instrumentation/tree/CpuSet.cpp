@@ -42,17 +42,43 @@ std::optional<CpuSet> CpuSet::fromList(std::string_view list) {
   if (rest.empty()) {
     return set;
   }
+  unsigned int lowest = 0;  // a range that began below it would make the cost of a long text unbounded
   do {
     const std::optional<unsigned int> low = takeNumber(rest);
     const std::optional<unsigned int> high = low && take(rest, '-') ? takeNumber(rest) : low;
-    if (!high || *high < *low) {
+    if (!high || *low < lowest || *high < *low) {
       return std::nullopt;
     }
-    for (unsigned int number = *low; number <= *high; ++number) {
-      set.add(number);
-    }
+    set.addRange(*low, *high);
+    lowest = *high + 1;
   } while (take(rest, ','));
   return rest.empty() ? std::optional(std::move(set)) : std::nullopt;
+}
+
+std::optional<CpuSet> CpuSet::fromMask(std::string_view mask) {
+  constexpr std::size_t digits = 8;
+  constexpr unsigned int groupBits = 32;
+  CpuSet set;
+  std::string_view rest = Common::trimmed(mask, " \t\n");
+  for (unsigned int base = 0;; base += groupBits) {
+    const std::size_t comma = rest.rfind(',');
+    const bool isHighest = comma == std::string_view::npos;
+    const std::string_view group = rest.substr(isHighest ? 0 : comma + 1);
+    std::uint32_t word = 0;
+    const auto [end, error] = std::from_chars(group.data(), group.data() + group.size(), word, 16);
+    const bool isWhole = error == std::errc() && end == group.data() + group.size();
+    if (!isWhole || group.size() > digits || (!isHighest && group.size() < digits) || (base >= limit && word != 0)) {
+      return std::nullopt;
+    }
+    if (word != 0) {
+      set.words_.resize(std::max(set.words_.size(), std::size_t{base / bits + 1}));
+      set.words_[base / bits] |= Word{word} << base % bits;
+    }
+    if (isHighest) {
+      return set;
+    }
+    rest = rest.substr(0, comma);
+  }
 }
 
 std::string CpuSet::toList() const {
@@ -80,6 +106,15 @@ void CpuSet::add(unsigned int number) {
     words_.resize(word + 1);
   }
   words_[word] |= Word{1} << number % bits;
+}
+
+void CpuSet::addRange(unsigned int low, unsigned int high) {
+  words_.resize(std::max(words_.size(), std::size_t{high / bits + 1}));
+  for (unsigned int index = low / bits; index <= high / bits; ++index) {
+    const Word from = index == low / bits ? ~Word{0} << low % bits : ~Word{0};
+    const Word to = index == high / bits ? ~Word{0} >> (bits - 1 - high % bits) : ~Word{0};
+    words_[index] |= from & to;
+  }
 }
 
 void CpuSet::add(const CpuSet& other) {

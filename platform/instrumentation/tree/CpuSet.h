@@ -20,9 +20,13 @@ class CpuSet {
   CpuSet() = default;
   CpuSet(std::initializer_list<unsigned int> numbers);
 
-  /// Reads the kernel's list form, such as "0-3,8,10-11"; an empty text is the empty set, and white
-  /// space around the list is skipped. Nothing if the text is no such list.
+  /// Reads the kernel's list form, such as "0-3,8,10-11": ascending, no number twice. An empty text is the
+  /// empty set, and white space around the list is skipped. Nothing if the text is no such list.
   static std::optional<CpuSet> fromList(std::string_view list);
+
+  /// Reads the kernel's mask form, such as "1,0000000f": groups of 32 bits in hexadecimal, the highest
+  /// first. White space around the mask is skipped. Nothing if the text is no such mask.
+  static std::optional<CpuSet> fromMask(std::string_view mask);
 
   /// The set in the kernel's list form.
   std::string toList() const;
@@ -77,6 +81,7 @@ class CpuSet {
   using Word = std::uint64_t;
   static constexpr unsigned int bits = 64;
 
+  void addRange(unsigned int low, unsigned int high);
   unsigned int from(unsigned int number) const;
   void trim();
 

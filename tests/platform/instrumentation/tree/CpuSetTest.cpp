@@ -18,6 +18,44 @@ TEST(CpuSet, RefusesWhatIsNoList) {
   }
 }
 
+TEST(CpuSet, RefusesListsThatAreNotAscending) {
+  for (const char* text : {"1,1", "3,1", "0-3,2", "0-3,3-5", "4-5,0-3"}) {
+    EXPECT_EQ(CpuSet::fromList(text), std::nullopt) << text;
+  }
+  EXPECT_EQ(CpuSet::fromList("0-1,2,3-65535").value().count(), CpuSet::limit);
+}
+
+TEST(CpuSet, RefusesALongListThatRepeatsItself) {
+  std::string list;
+  while (list.size() < 1'000'000) {
+    list += "0-65535,";
+  }
+  EXPECT_EQ(CpuSet::fromList(list + "0-65535"), std::nullopt);
+}
+
+TEST(CpuSet, ReadsTheKernelsMasks) {
+  EXPECT_EQ(CpuSet::fromMask("f\n"), (CpuSet{0, 1, 2, 3}));
+  EXPECT_EQ(CpuSet::fromMask("00000000,00000003"), (CpuSet{0, 1}));
+  EXPECT_EQ(CpuSet::fromMask("1,80000000,00000000,00010001"), (CpuSet{0, 16, 95, 96}));
+  EXPECT_EQ(CpuSet::fromMask("0"), CpuSet());
+  EXPECT_EQ(CpuSet::fromMask("00000000,00000000"), CpuSet());
+}
+
+TEST(CpuSet, RefusesWhatIsNoMask) {
+  for (const char* text : {"", "\n", "g", "0x3", "-1", "1,2", "1,,00000002", "1,0000002", "123456789", "1 00000001"}) {
+    EXPECT_EQ(CpuSet::fromMask(text), std::nullopt) << text;
+  }
+}
+
+TEST(CpuSet, RefusesMasksWithNumbersFromTheLimitOn) {
+  std::string groups;
+  for (unsigned int cpu = 0; cpu < CpuSet::limit; cpu += 32) {
+    groups += ",ffffffff";
+  }
+  EXPECT_EQ(CpuSet::fromMask("0" + groups).value().count(), CpuSet::limit);
+  EXPECT_EQ(CpuSet::fromMask("1" + groups), std::nullopt);
+}
+
 TEST(CpuSet, WritesTheKernelsLists) {
   for (const char* list : {"", "0", "0-1", "0-3,8,10-11", "63-64", "127,65535"}) {
     EXPECT_EQ(CpuSet::fromList(list).value().toList(), list);
