@@ -134,6 +134,7 @@ constexpr std::array rows = {
     FamilyRow{"GenuineIntel", "Xeon MP", any, any, 181},
     FamilyRow{"GenuineTMx86", "Crusoe", any, any, 120},
     FamilyRow{"GenuineTMx86", "Efficeon", any, any, 121},
+    FamilyRow{"IA-64", "", any, any, 130},
     FamilyRow{"IBM/S390", "", any, any, 204},
     FamilyRow{"Loongson", "", any, any, 600},
     FamilyRow{"PowerPC", "", any, any, 32},
@@ -146,6 +147,12 @@ constexpr std::array rows = {
     FamilyRow{"PowerPC", "Cell Broadband Engine", any, any, CimFamily::other},
     FamilyRow{"RISC-V 32", "", any, any, 512},
     FamilyRow{"RISC-V 64", "", any, any, 513},
+    FamilyRow{"SPARC", "", any, any, 80},
+    FamilyRow{"SPARC", "UltraSparc I (", any, any, 84},
+    FamilyRow{"SPARC", "UltraSparc II", any, any, 85},
+    FamilyRow{"SPARC", "UltraSparc III", any, any, 87},
+    FamilyRow{"SPARC", "UltraSparc IIIi", any, any, 88},
+    FamilyRow{"SPARC", "UltraSparc IIi", any, any, 86},
 };
 
 constexpr auto keyOf(const FamilyRow& row) {

@@ -3,6 +3,7 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <string_view>
 
 #include "platform/common/Hex.h"
@@ -11,6 +12,8 @@
 namespace Tarn::Inventory {
 
 namespace {
+
+constexpr unsigned int fastestClock = 1'000'000;  // MHz; from here on a number is no clock
 
 /// The fields of one CPU.
 class Fields {
@@ -22,14 +25,33 @@ class Fields {
   /// A field that clients see.
   std::string text(std::string_view name) const { return plainText((*this)[name]); }
 
-  /// Decimal, or hexadecimal after 0x; what stands after the digits is skipped.
-  std::optional<unsigned int> number(std::string_view name) const {
+  /// Decimal, or hexadecimal after 0x; what stands after the digits is skipped. A larger number than the most
+  /// that the field can hold is none.
+  std::optional<unsigned int> number(std::string_view name, unsigned int most) const {
     std::string_view text = (*this)[name];
     const int base = text.starts_with("0x") ? 16 : 10;
     text.remove_prefix(base == 16 ? 2 : 0);
     unsigned int value = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value, base);
-    return error == std::errc() ? std::optional(value) : std::nullopt;
+    return error == std::errc() && value <= most ? std::optional(value) : std::nullopt;
+  }
+
+  /// A text of the field's that is a number other than zero.
+  std::string identifier(std::string_view name) const {
+    const std::string_view text = (*this)[name];
+    return text.find_first_not_of("0x") == std::string_view::npos ? std::string() : plainText(text);
+  }
+
+  /// A number of Hz in hexadecimal, in MHz, rounded.
+  std::optional<unsigned int> megahertzOfHertz(std::string_view name) const {
+    constexpr std::uint64_t megahertz = 1'000'000;
+    const std::string_view text = (*this)[name];
+    std::uint64_t hertz = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), hertz, 16);
+    const std::uint64_t speed = hertz / megahertz + (hertz % megahertz >= megahertz / 2 ? 1 : 0);
+    const bool isUsable =
+        error == std::errc() && end == text.data() + text.size() && speed >= 1 && speed < fastestClock;
+    return isUsable ? std::optional(static_cast<unsigned int>(speed)) : std::nullopt;
   }
 
   /// A number of MHz, such as "2299.998" or "3425.000000MHz", rounded.
@@ -38,8 +60,7 @@ class Fields {
     double value = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value, std::chars_format::fixed);
     const std::string_view unit = text.substr(static_cast<std::size_t>(end - text.data()));
-    constexpr double largest = 1e6;
-    const bool usable = error == std::errc() && value >= 1 && value < largest && (unit.empty() || unit == "MHz");
+    const bool usable = error == std::errc() && value >= 1 && value < fastestClock && (unit.empty() || unit == "MHz");
     return usable ? std::optional(static_cast<unsigned int>(std::lround(value))) : std::nullopt;
   }
 
@@ -83,9 +104,9 @@ unsigned int x86Signature(unsigned int family, unsigned int model, unsigned int 
 }
 
 void identifyX86(const Fields& fields, CpuIdentity& cpu) {
-  const auto family = fields.number("cpu family");
-  const auto model = fields.number("model");
-  const auto stepping = fields.number("stepping");
+  const auto family = fields.number("cpu family", 0xF + 0xFF);
+  const auto model = fields.number("model", 0xFF);
+  const auto stepping = fields.number("stepping", 0xF);
   const auto known = [](std::optional<unsigned int> number) {
     return number ? static_cast<int>(*number) : FamilyRow::any;
   };
@@ -110,11 +131,11 @@ unsigned int armFamily(const ArmPart* part, unsigned int version) {
 }
 
 void identifyArm(const Fields& fields, CpuIdentity& cpu) {
-  const auto implementer = fields.number("CPU implementer");
-  const auto part = fields.number("CPU part");
-  const auto variant = fields.number("CPU variant");
-  const auto revision = fields.number("CPU revision");
-  const auto version = fields.number("CPU architecture");
+  const auto implementer = fields.number("CPU implementer", 0xFF);
+  const auto part = fields.number("CPU part", 0xFFF);
+  const auto variant = fields.number("CPU variant", 0xF);
+  const auto revision = fields.number("CPU revision", 0xF);
+  const auto version = fields.number("CPU architecture", 0xFF);
   const ArmPart* known = implementer && part ? findArmPart(*implementer, *part) : nullptr;
   cpu.armPart = known;
   cpu.name = known != nullptr ? known->name : std::string_view();
@@ -143,18 +164,57 @@ void identifyPowerPc(const Fields& fields, CpuIdentity& cpu) {
   }
 }
 
+void identifyIa64(const Fields& fields, CpuIdentity& cpu) {
+  cpu.vendor = "IA-64";
+  cpu.name = fields.text("model name");
+  setFamily(cpu);
+  cpu.stepping = fields.text("revision");
+  cpu.width = 64;
+  cpu.clockSpeed = fields.megahertz("cpu MHz");
+}
+
+// The machine's type is a field of the CPU's block, or in older kernels a part of a line for each CPU:
+// "processor 0: version = FF,  identification = 0133E8,  machine = 2964".
+std::string s390Machine(const Fields& fields) {
+  std::string machine = fields.text("machine");
+  if (machine.empty()) {
+    constexpr std::string_view mark = "machine = ";
+    const std::string line = fields.text("processor *");
+    const std::size_t found = line.find(mark);
+    machine = found == std::string::npos ? std::string() : line.substr(found + mark.size());
+  }
+  return machine;
+}
+
 void identifyS390(const Fields& fields, CpuIdentity& cpu) {
   setFamily(cpu);
+  const std::string machine = s390Machine(fields);
+  cpu.name = machine.empty() ? std::string() : cpu.vendor + " machine " + machine;
   cpu.width = fields.hasWord("features", "zarch") ? 64 : 31;
   cpu.clockSpeed = fields.megahertz("cpu MHz dynamic");
+  if (!cpu.clockSpeed) {
+    cpu.clockSpeed = fields.megahertz("cpu MHz static");
+  }
 }
 
 void identifyRiscV(const Fields& fields, CpuIdentity& cpu) {
   const bool is64 = fields["isa"].starts_with("rv64");
   cpu.vendor = is64 ? "RISC-V 64" : "RISC-V 32";
   cpu.name = fields.text("uarch");
+  if (const std::string maker = fields.identifier("mvendorid"); cpu.name.empty() && !maker.empty()) {
+    cpu.name = "mvendorid " + maker + ", marchid " + fields.text("marchid");
+  }
   setFamily(cpu);
+  cpu.stepping = fields.identifier("mimpid");
   cpu.width = is64 ? 64 : 32;
+}
+
+void identifySparc(const Fields& fields, CpuIdentity& cpu) {
+  cpu.vendor = "SPARC";
+  cpu.name = fields.text("cpu");
+  setFamily(cpu);
+  cpu.width = 64;
+  cpu.clockSpeed = fields.megahertzOfHertz("Cpu*ClkTck");
 }
 
 void identifyLoongArch(const Fields& fields, CpuIdentity& cpu) {
@@ -175,11 +235,16 @@ struct Dialect {
 };
 constexpr std::array dialects = {
     Dialect{"vendor_id", "IBM/S390", Architecture::S390, identifyS390},
+    Dialect{"arch", "IA-64", Architecture::Ia64, identifyIa64},
+    Dialect{"type", "sun4u", Architecture::Sparc, identifySparc},
+    Dialect{"type", "sun4v", Architecture::Sparc, identifySparc},
     Dialect{"cpu family", "", Architecture::X86, identifyX86},
     Dialect{"CPU implementer", "0x", Architecture::Arm, identifyArm},
     Dialect{"isa", "rv", Architecture::RiscV, identifyRiscV},
+    Dialect{"CPU Family", "Loongson", Architecture::LoongArch, identifyLoongArch},
     Dialect{"Model Name", "Loongson", Architecture::LoongArch, identifyLoongArch},
     Dialect{"clock", "", Architecture::PowerPc, identifyPowerPc},
+    Dialect{"timebase", "", Architecture::PowerPc, identifyPowerPc},
 };
 
 }  // namespace

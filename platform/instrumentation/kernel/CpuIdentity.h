@@ -10,7 +10,7 @@
 
 namespace Tarn::Inventory {
 
-enum class Architecture { Unknown, X86, Arm, PowerPc, S390, RiscV, LoongArch };
+enum class Architecture { Unknown, X86, Arm, Ia64, LoongArch, PowerPc, RiscV, S390, Sparc };
 
 /// What /proc/cpuinfo says of one logical CPU, in one form for all architectures. A text is empty, and a
 /// number absent, where it does not say.

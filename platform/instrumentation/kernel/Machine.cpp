@@ -9,6 +9,7 @@ namespace Tarn::Inventory {
 namespace {
 
 constexpr const char* cpuInfoFile = "proc/cpuinfo";
+constexpr std::size_t longestValue = 24;  // in messages
 
 std::string reasonOf(FileError error) {
   return error == 0 ? "it holds no usable value" : describeError(error);
@@ -25,14 +26,14 @@ std::string attributeOf(unsigned int cpu, std::string_view suffix) {
 // "name: value", or of a field's words "name: word" or "name: without word".
 std::string fieldText(const CpuInfo& info, unsigned int cpu, std::string_view field) {
   const std::size_t slash = field.find('/');
-  const std::string_view name = field.substr(0, slash);
+  const std::string name = CpuInfo::fieldName(cpu, field.substr(0, slash));
   const std::string value(info.field(cpu, name));
   if (slash == std::string_view::npos || value.empty()) {
-    return std::string(name) + ": " + (value.empty() ? "(not there)" : value);
+    return name + ": " + (value.empty() ? "(not there)" : value);
   }
   const std::string word(field.substr(slash + 1));
   const bool has = (' ' + value + ' ').find(' ' + word + ' ') != std::string::npos;
-  return std::string(name) + ": " + (has ? "" : "without ") + word;
+  return name + ": " + (has ? "" : "without ") + word;
 }
 
 }  // namespace
@@ -48,6 +49,12 @@ Machine::Machine(FileSystem& root, Detail detail)
     noteUnread(root.nameOf(cpuInfoFile), error, "mount proc on /proc");
   }
   cpuInfo_ = CpuInfo(std::move(text));
+  if (const std::optional<CpuInfo::Misfit>& misfit = cpuInfo_.misfit()) {
+    unread_.add(root.nameOf(cpuInfoFile) + ", line " + std::to_string(misfit->line),
+                "\"" + misfit->name + "\" is " + misfit->value.substr(0, longestValue) +
+                    ", more than this number can be; it is not used",
+                "correct the number if the file was captured; on a running machine the kernel is at fault");
+  }
 }
 
 void Machine::noteUnread(const std::string& file, FileError error, const std::string& remedy) {

@@ -45,6 +45,7 @@ struct CpuInfoValue {
 constexpr std::array cpuInfoValues = {
     CpuInfoValue{"Serial", "Serial", ":", ""},                              // Arm
     CpuInfoValue{"identification", "processor ", "identification =", ","},  // s390: the machine's
+    CpuInfoValue{"identification", "identification", ":", ""},              // the same of newer kernels
 };
 
 // Replaces every character but the blanks; false where there is nothing that identifies: nothing at all,

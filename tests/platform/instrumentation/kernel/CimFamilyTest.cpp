@@ -76,6 +76,13 @@ TEST(CimFamily, KnowsTheNamesThatProcessorsBear) {
       {"PowerPC", "Cell Broadband Engine, altivec supported", -1, -1, 1},
       {"IBM/S390", "", -1, -1, 204},
       {"RISC-V 64", "sifive,u74-mc", -1, -1, 513},
+      {"IA-64", "Dual-Core Intel(R) Itanium(R) Processor 9140M", -1, -1, 130},
+      {"SPARC", "UltraSparc T5 (Niagara5)", -1, -1, 80},
+      {"SPARC", "TI UltraSparc I   (SpitFire)", -1, -1, 84},
+      {"SPARC", "TI UltraSparc II  (BlackBird)", -1, -1, 85},
+      {"SPARC", "TI UltraSparc IIi (Sabre)", -1, -1, 86},
+      {"SPARC", "TI UltraSparc III+ (Cheetah+)", -1, -1, 87},
+      {"SPARC", "TI UltraSparc IIIi (Jalapeno)", -1, -1, 88},
   };
   for (const Known& row : known) {
     EXPECT_EQ(cimFamily(row.vendor, row.name, row.family, row.model), row.code) << row.name;

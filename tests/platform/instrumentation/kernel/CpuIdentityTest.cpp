@@ -94,16 +94,69 @@ TEST(CpuIdentity, IsReadFromABlockOfPowerPc) {
   EXPECT_EQ(cpu.clockSpeed, 3425U);
 }
 
+CpuIdentity s390(const std::string& block) {
+  return identifyCpu(CpuInfo("vendor_id       : IBM/S390\nfeatures\t: esan3 zarch stfle\n"
+                             "processor 0: version = FF,  identification = 0123,  machine = 2964\n"
+                             "processor 1: version = FF,  identification = 0123,  machine = 3931\n\n"
+                             "cpu number      : 0\ncpu MHz dynamic : 5000\n\ncpu number      : 1\n" +
+                             block),
+                     1);
+}
+
 TEST(CpuIdentity, IsReadFromABlockOfS390) {
-  const CpuIdentity cpu = identifyCpu(CpuInfo("vendor_id       : IBM/S390\nfeatures\t: esan3 zarch stfle\n"
-                                              "processor 0: version = FF,  identification = 0123,  machine = 3931\n\n"
-                                              "cpu number      : 0\ncpu MHz dynamic : 5200\ncpu MHz static  : 5200\n"),
-                                      0);
+  const CpuIdentity cpu = s390("cpu MHz dynamic : 5100\ncpu MHz static  : 5200\n");
 
   EXPECT_EQ(cpu.architecture, Architecture::S390);
+  EXPECT_EQ(cpu.vendor, "IBM/S390");
+  EXPECT_EQ(cpu.name, "IBM/S390 machine 3931");
   EXPECT_EQ(cpu.family, 204U);
   EXPECT_EQ(cpu.width, 64U);
-  EXPECT_EQ(cpu.clockSpeed, 5200U);
+  EXPECT_EQ(cpu.clockSpeed, 5100U);
+}
+
+TEST(CpuIdentity, OfS390WithoutADynamicClockHasTheStaticOne) {
+  EXPECT_EQ(s390("cpu MHz static  : 5200\n").clockSpeed, 5200U);
+  EXPECT_EQ(s390("").clockSpeed, std::nullopt) << "that of another CPU is not taken";
+}
+
+TEST(CpuIdentity, OfS390HasTheMachineOfItsBlockBeforeThatOfTheLine) {
+  EXPECT_EQ(s390("machine         : 8561\n").name, "IBM/S390 machine 8561");
+  EXPECT_EQ(identifyCpu(CpuInfo("vendor_id : IBM/S390\n\ncpu number : 0\n"), 0).name, "");
+}
+
+TEST(CpuIdentity, IsReadFromABlockOfIa64) {
+  const CpuIdentity cpu = identify(
+      "vendor     : GenuineIntel\narch       : IA-64\nfamily     : 32\nmodel      : 1\n"
+      "model name : Dual-Core Intel(R) Itanium(R) Processor 9140M\nrevision   : 1\ncpu MHz    : 1668.999\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::Ia64);
+  EXPECT_EQ(cpu.name, "Dual-Core Intel(R) Itanium(R) Processor 9140M");
+  EXPECT_EQ(cpu.stepping, "1");
+  EXPECT_EQ(cpu.family, 130U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, 1669U);
+}
+
+CpuIdentity sparc(const std::string& name, const std::string& clocks) {
+  return identifyCpu(CpuInfo("cpu\t\t: " + name + "\ntype\t\t: sun4v\n" + clocks + "State:\nCPU0:\t\tonline\n"), 1);
+}
+
+TEST(CpuIdentity, IsReadFromTheTextOfSparc64) {
+  const CpuIdentity cpu =
+      sparc("UltraSparc T5 (Niagara5)", "Cpu0ClkTck\t: 00000000d693a400\nCpu1ClkTck\t: 000000003b9aca00\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::Sparc);
+  EXPECT_EQ(cpu.name, "UltraSparc T5 (Niagara5)");
+  EXPECT_EQ(cpu.family, 80U);
+  EXPECT_EQ(cpu.width, 64U);
+  EXPECT_EQ(cpu.clockSpeed, 1000U);
+}
+
+TEST(CpuIdentity, TakesNoSparcClockThatIsNone) {
+  for (const char* text : {"", "0", "xyz", "00000000d693a400 Hz", "ffffffffffffffff", "10000000000000000"}) {
+    EXPECT_EQ(sparc("SPARC-M7", "Cpu1ClkTck\t: " + std::string(text) + '\n').clockSpeed, std::nullopt) << text;
+  }
+  EXPECT_EQ(sparc("SPARC-M7", "Cpu0ClkTck\t: 000000003b9aca00\n").clockSpeed, std::nullopt);
 }
 
 TEST(CpuIdentity, IsReadFromABlockOfRiscV) {
@@ -117,6 +170,16 @@ TEST(CpuIdentity, IsReadFromABlockOfRiscV) {
   EXPECT_EQ(identify("isa\t: rv32imac\n").width, 32U);
 }
 
+TEST(CpuIdentity, OfRiscVWithoutADesignIsNamedByItsNumbers) {
+  const CpuIdentity cpu = identify("isa\t: rv64imac\nmvendorid\t: 0x489\nmarchid\t: 0x7\nmimpid\t: 0x4210427\n");
+  EXPECT_EQ(cpu.name, "mvendorid 0x489, marchid 0x7");
+  EXPECT_EQ(cpu.stepping, "0x4210427");
+
+  const CpuIdentity unnumbered = identify("isa\t: rv64imac\nmvendorid\t: 0x0\nmarchid\t: 0x0\nmimpid\t: 0x0\n");
+  EXPECT_EQ(unnumbered.name, "") << "zero is no maker";
+  EXPECT_EQ(unnumbered.stepping, "");
+}
+
 TEST(CpuIdentity, IsReadFromABlockOfLoongArch) {
   const CpuIdentity cpu = identify(
       "package\t\t\t: 0\nModel Name\t\t: Loongson-3A5000-HV\nCPU Revision\t\t: 0x11\n"
@@ -128,6 +191,22 @@ TEST(CpuIdentity, IsReadFromABlockOfLoongArch) {
   EXPECT_EQ(cpu.width, 64U);
   EXPECT_EQ(cpu.stepping, "0x11");
   EXPECT_EQ(cpu.clockSpeed, 2500U);
+}
+
+TEST(CpuIdentity, OfLoongArchIsRecognizedByItsFamilyAsWell) {
+  const CpuIdentity cpu =
+      identify("CPU Family\t\t: Loongson-64bit\nModel Name\t\t: Engineering Sample\nCPU MHz : 2000.00\n");
+
+  EXPECT_EQ(cpu.architecture, Architecture::LoongArch);
+  EXPECT_EQ(cpu.name, "Engineering Sample");
+  EXPECT_EQ(cpu.clockSpeed, 2000U);
+}
+
+TEST(CpuIdentity, TakesNoNumberThatItsRegisterCannotHold) {
+  EXPECT_EQ(identify(x86("4294967295", "94", "3")).processorId, "");
+  EXPECT_EQ(identify(x86("6", "256", "3")).processorId, "");
+  EXPECT_EQ(identify(x86("6", "94", "16")).stepping, "");
+  EXPECT_EQ(identify(arm("0x1000", "8")).processorId, "");
 }
 
 TEST(CpuIdentity, HasBlanksForControlCharacters) {

@@ -26,12 +26,72 @@ TEST(CpuInfo, FindsNothingWhereThereIsNothing) {
   EXPECT_TRUE(CpuInfo().cpus().empty());
 }
 
-TEST(CpuInfo, TakesTheFirstFieldForACpuWithoutItsOwn) {
-  const CpuInfo info("processor\t: 0\nmodel\t: 1\n\nprocessor\t: 1\n\nHardware\t: Board\n");
+TEST(CpuInfo, FieldsOutsideOfTheBlocksHoldForAllCpus) {
+  const CpuInfo info("system type\t: Box\n\nprocessor\t: 0\nmodel\t: 1\n\nprocessor\t: 1\n\nHardware\t: Board\n");
 
-  EXPECT_EQ(info.field(1, "model"), "1");
-  EXPECT_EQ(info.field(0, "Hardware"), "Board");
-  EXPECT_EQ(info.field(5, "model"), "1");
+  EXPECT_EQ(info.field(0, "system type"), "Box");
+  EXPECT_EQ(info.field(1, "Hardware"), "Board");
+  EXPECT_EQ(info.field(5, "Hardware"), "Board");
+}
+
+TEST(CpuInfo, AFieldThatABlockLacksIsNotTakenFromAnotherBlock) {
+  const CpuInfo info("processor\t: 0\nmodel\t: 1\n\nprocessor\t: 1\nstepping\t: 2\n\n");
+
+  EXPECT_EQ(info.field(1, "model"), "");
+  EXPECT_EQ(info.field(0, "stepping"), "");
+  EXPECT_EQ(info.field(5, "model"), "");
+}
+
+TEST(CpuInfo, BlocksOfS390BeginWithTheCpusNumber) {
+  const CpuInfo info(
+      "vendor_id       : IBM/S390\nprocessor 0: version = 00,  machine = 8561\n"
+      "processor 1: version = 00,  machine = 3931\n\n"
+      "cpu number      : 0\ncpu MHz static  : 5200\n\ncpu number      : 1\ncpu MHz static  : 5000\n");
+
+  EXPECT_EQ(info.cpus(), (CpuSet{0, 1}));
+  EXPECT_EQ(info.field(1, "vendor_id"), "IBM/S390");
+  EXPECT_EQ(info.field(1, "cpu MHz static"), "5000");
+  EXPECT_EQ(info.field(1, "processor *"), "version = 00,  machine = 3931");
+}
+
+TEST(CpuInfo, NumberOfACpuWithinABlockIsAField) {
+  const CpuInfo info("processor  : 0\ncpu number : 7\n\nprocessor  : 1\ncpu number : 7\n");
+
+  EXPECT_EQ(info.cpus(), (CpuSet{0, 1}));
+  EXPECT_EQ(info.field(1, "cpu number"), "7");
+}
+
+TEST(CpuInfo, StarInAFieldsNameIsTheCpusNumber) {
+  const CpuInfo info("Cpu0ClkTck\t: 10\nCpu12ClkTck\t: 20\n");
+
+  EXPECT_EQ(info.field(12, "Cpu*ClkTck"), "20");
+  EXPECT_EQ(info.field(3, "Cpu*ClkTck"), "");
+}
+
+TEST(CpuInfo, ABlockWhoseNumberNoCpuCanHaveCountsForNone) {
+  for (const char* number : {"65536", "4294967296", "99999999999999999999"}) {
+    const CpuInfo info("processor\t: 1\nmodel\t: 1\n\nprocessor\t: " + std::string(number) +
+                       "\nmodel\t: 2\n\nprocessor\t: 2\nmodel\t: 3\n");
+
+    EXPECT_EQ(info.cpus(), (CpuSet{1, 2})) << number;
+    EXPECT_EQ(info.field(0, "model"), "") << number;
+    EXPECT_EQ(info.field(1, "model"), "1") << number;
+    ASSERT_TRUE(info.misfit().has_value()) << number;
+    EXPECT_EQ(info.misfit()->line, 4U);
+    EXPECT_EQ(info.misfit()->name, "processor");
+    EXPECT_EQ(info.misfit()->value, number);
+  }
+}
+
+TEST(CpuInfo, ANumberThatDoesNotFitIsReportedWithItsLine) {
+  for (const std::string name : {"core id", "cpu family", "model", "physical id", "stepping"}) {
+    const CpuInfo info("processor\t: 0\n" + name + "\t: 4294967296\nSerial\t: 99999999999999999999\n");
+    ASSERT_TRUE(info.misfit().has_value()) << name;
+    EXPECT_EQ(info.misfit()->line, 2U);
+    EXPECT_EQ(info.misfit()->name, name);
+
+    EXPECT_FALSE(CpuInfo("processor\t: 0\n" + name + "\t: 4294967295\n").misfit().has_value()) << name;
+  }
 }
 
 TEST(CpuInfo, OlderArmKernelsHaveAProcessorThatIsAText) {

@@ -233,6 +233,16 @@ TEST(Masking, TakesTheMachinesIdentificationFromCpuInfo) {
             "processor 1: version = FF,  identification = XXXXXX,  machine = 2964");
 }
 
+TEST(Masking, TakesTheMachinesIdentificationFromTheBlocksOfCpuInfo) {
+  MemoryFileSystem::Files files;
+  files["proc/cpuinfo"] = {
+      "cpu number      : 0\nversion         : 00\nidentification  : 0133E8\nmachine         : 8561\n"};
+
+  EXPECT_THAT(maskIdentifiers(files), ElementsAre("proc/cpuinfo: identification"));
+  EXPECT_EQ(files["proc/cpuinfo"].contents,
+            "cpu number      : 0\nversion         : 00\nidentification  : XXXXXX\nmachine         : 8561\n");
+}
+
 TEST(Masking, LeavesCpuInfoWithoutIdentifiers) {
   MemoryFileSystem::Files files;
   files["proc/cpuinfo"] = {"processor\t: 0\nflags\t: fpu Serial\nSerial\t\t: 0000000000000000\n"};
