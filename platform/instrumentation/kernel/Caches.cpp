@@ -2,8 +2,11 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
+#include <limits>
 #include <string>
 #include <tuple>
+#include <utility>
 
 namespace Tarn::Inventory {
 
@@ -49,24 +52,30 @@ std::optional<unsigned int> unlessZero(std::optional<unsigned int> number) {
   return number == 0U ? std::nullopt : number;
 }
 
+// How a cache is shared: old kernels have the mask alone.
+constexpr std::array<std::string_view, 2> sharingFiles = {"shared_cpu_list", "shared_cpu_map"};
+
+constexpr unsigned int bytesPerKibibyte = 1024;
+
 class CacheReader {
  public:
-  CacheReader(Machine& machine, const CpuSet& present, const CpuSet& online)
-      : machine_(machine), cpus_(machine.cpus()), present_(present), online_(online) {}
+  CacheReader(Machine& machine, const Topology& topology)
+      : machine_(machine), cpus_(machine.cpus()), topology_(topology) {}
 
   std::vector<Cache> read() {
-    for (const unsigned int cpu : present_) {
+    for (const unsigned int cpu : topology_.present) {
       unsigned int index = 0;
       while (readCache(cpu, index)) {
         ++index;
       }
       // While a CPU is offline most kernels have nothing to say about its caches.
-      if (index == 0 && online_.contains(cpu)) {
+      if (index == 0 && topology_.online.contains(cpu)) {
         machine_.noteUnreadOfCpu(cpu, "cache",
                                  "mount sysfs on /sys; "
                                  "some virtual machines have no such directory");
       }
     }
+    dropUnplaced();
     std::ranges::sort(caches_, {},
                       [](const Cache& cache) { return std::tuple(cache.level, order(cache), cache.cpus.first()); });
     return std::move(caches_);
@@ -86,7 +95,7 @@ class CacheReader {
 
   // False where the CPU has no cache of that index.
   bool readCache(unsigned int cpu, unsigned int index) {
-    const auto sharing = cpus_.text("cpu", cpu, "/cache/index", index, "/shared_cpu_list");
+    const auto sharing = readSharing(cpu, index);
     if (!sharing) {
       return false;
     }
@@ -98,12 +107,29 @@ class CacheReader {
     if (known) {
       return true;
     }
-    CpuSet cpus = CpuSet::fromList(*sharing).value_or(CpuSet());
-    cpus.keepOnly(present_);
+    CpuSet cpus = Attributes::parseCpus(sharingFile_, *sharing).value_or(CpuSet());
+    cpus.keepOnly(topology_.present);
     cpus.add(cpu);
     told.push_back({std::string(*sharing), cpus});
     addCache(cpu, index, std::move(cpus));
     return true;
+  }
+
+  // A kernel that has one of the files for a cache has it for all.
+  std::optional<std::string_view> readSharing(unsigned int cpu, unsigned int index) {
+    for (const std::string_view file : sharingFiles) {
+      if (!sharingFile_.empty() && file != sharingFile_) {
+        continue;
+      }
+      if (const auto sharing = cpus_.text("cpu", cpu, "/cache/index", index, "/", file)) {
+        sharingFile_ = file;
+        return sharing;
+      }
+      if (cpus_.error() != ENOENT) {
+        break;
+      }
+    }
+    return std::nullopt;
   }
 
   void addCache(unsigned int cpu, unsigned int index, CpuSet cpus) {
@@ -117,6 +143,7 @@ class CacheReader {
     cache.level = *level;
     cache.sourceCpu = cpu;
     cache.index = index;
+    cache.cpusFile = sharingFile_;
     cache.contents = meaning(contentsWords, cpus_.text("cpu", cpu, "/cache/index", index, "/type"));
     // The same cache may stand at another place for another kind of core.
     CpuSet& covered = coveredBy(cache);
@@ -132,11 +159,41 @@ class CacheReader {
 
   void readAttributes(unsigned int cpu, unsigned int index, Cache& cache) {
     cache.id = cpus_.number("cpu", cpu, "/cache/index", index, "/id");
-    cache.size = unlessZero(kibibytes(cpus_.text("cpu", cpu, "/cache/index", index, "/size")));
     cache.lineSize = unlessZero(cpus_.number("cpu", cpu, "/cache/index", index, "/coherency_line_size"));
+    cache.size = readSize(cpu, index, cache.lineSize);
     cache.sets = unlessZero(cpus_.number("cpu", cpu, "/cache/index", index, "/number_of_sets"));
     cache.ways = cpus_.number("cpu", cpu, "/cache/index", index, "/ways_of_associativity");
     cache.writePolicy = meaning(policyWords, cpus_.text("cpu", cpu, "/cache/index", index, "/write_policy"));
+  }
+
+  std::optional<unsigned int> readSize(unsigned int cpu, unsigned int index, std::optional<unsigned int> lineSize) {
+    const auto text = cpus_.text("cpu", cpu, "/cache/index", index, "/size");
+    const std::optional<unsigned int> size = kibibytes(text);
+    const bool isPlausible = size && cacheBlocks(std::uint64_t{*size} * bytesPerKibibyte, lineSize);
+    if (text && !isPlausible) {
+      machine_.noteUnreadOfCpu(cpu, "cache/index" + std::to_string(index) + "/size",
+                               "it holds no plausible size of a cache", "report it to the maker of the firmware");
+    }
+    return isPlausible ? unlessZero(size) : std::nullopt;
+  }
+
+  // A cache belongs to a processor by its lowest CPU that has one.
+  void dropUnplaced() {
+    const CpuSet placed = topology_.placed();
+    std::vector<Cache> kept;
+    for (Cache& cache : caches_) {
+      CpuSet owners = cache.cpus;
+      owners.keepOnly(placed);
+      cache.owner = owners.first();
+      if (!owners.empty()) {
+        kept.push_back(std::move(cache));
+      } else {
+        machine_.noteUnreadOfCpu(cache.sourceCpu, "cache/index" + std::to_string(cache.index),
+                                 "no CPU that shares the cache has a known processor",
+                                 "set these CPUs online, or mount sysfs on /sys");
+      }
+    }
+    caches_ = std::move(kept);
   }
 
   std::vector<Sharing>& toldAt(unsigned int index) {
@@ -161,8 +218,8 @@ class CacheReader {
 
   Machine& machine_;
   Attributes& cpus_;
-  const CpuSet& present_;
-  const CpuSet& online_;
+  const Topology& topology_;
+  std::string_view sharingFile_;  // empty until a cache was found
   std::vector<Cache> caches_;
   std::vector<std::vector<Sharing>> told_;  // by index
   std::vector<Covered> covered_;
@@ -170,8 +227,15 @@ class CacheReader {
 
 }  // namespace
 
-std::vector<Cache> readCaches(Machine& machine, const CpuSet& present, const CpuSet& online) {
-  return CacheReader(machine, present, online).read();
+std::optional<CacheBlocks> cacheBlocks(std::uint64_t bytes, std::optional<unsigned int> lineSize) {
+  constexpr std::uint64_t most = std::numeric_limits<std::uint32_t>::max();
+  const unsigned int size = lineSize ? *lineSize : bytes <= most ? 1 : bytesPerKibibyte;
+  const std::uint64_t count = bytes / size;
+  return count <= most ? std::optional(CacheBlocks{size, static_cast<unsigned int>(count)}) : std::nullopt;
+}
+
+std::vector<Cache> readCaches(Machine& machine, const Topology& topology) {
+  return CacheReader(machine, topology).read();
 }
 
 }  // namespace Tarn::Inventory

@@ -1,10 +1,13 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_CACHES_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_CACHES_H
 
+#include <cstdint>
 #include <optional>
+#include <string_view>
 #include <vector>
 
 #include "platform/instrumentation/kernel/Machine.h"
+#include "platform/instrumentation/kernel/Topology.h"
 #include "platform/instrumentation/tree/CpuSet.h"
 
 namespace Tarn::Inventory {
@@ -18,6 +21,8 @@ struct Cache {
   std::optional<CacheContents> contents;
   std::optional<unsigned int> id;        ///< unique for its level and contents
   CpuSet cpus;                           ///< the CPUs that share it
+  unsigned int owner = 0;                ///< the lowest of them that has a processor
+  std::string_view cpusFile;             ///< the file that names them
   unsigned int sourceCpu = 0;            ///< the CPU in whose directory it was read,
   unsigned int index = 0;                ///< and its number there
   std::optional<unsigned int> size;      ///< KiB
@@ -27,9 +32,19 @@ struct Cache {
   std::optional<unsigned int> writePolicy;  ///< the inventory's code
 };
 
-/// Every cache once, however many CPUs share it; by level, contents and lowest CPU. No two caches of one
-/// level and contents have a CPU in common.
-std::vector<Cache> readCaches(Machine& machine, const CpuSet& present, const CpuSet& online);
+/// A cache's size as a number of blocks.
+struct CacheBlocks {
+  unsigned int size;  ///< bytes
+  unsigned int count;
+};
+
+/// Without a line size the blocks are bytes, as CIM has it for what has no blocks, or KiB where 32 bits cannot
+/// count the bytes. Nothing where 32 bits cannot hold the number of blocks.
+std::optional<CacheBlocks> cacheBlocks(std::uint64_t bytes, std::optional<unsigned int> lineSize);
+
+/// Every cache of a known processor once, however many CPUs share it; by level, contents and lowest CPU. No
+/// two caches of one level and contents have a CPU in common.
+std::vector<Cache> readCaches(Machine& machine, const Topology& topology);
 
 }  // namespace Tarn::Inventory
 

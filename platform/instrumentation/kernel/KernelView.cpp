@@ -1,5 +1,9 @@
 #include "platform/instrumentation/kernel/KernelView.h"
 
+#include <array>
+#include <string_view>
+#include <utility>
+
 #include "platform/instrumentation/tree/Tree.h"
 
 namespace Tarn::Inventory {
@@ -8,12 +12,12 @@ KernelView::KernelView(Machine& whole)
     : machine(whole),
       topology(readTopology(whole)),
       kinds(readCoreKinds(whole, topology)),
-      caches(readCaches(whole, topology.present, topology.online)) {}
+      caches(readCaches(whole, topology)) {}
 
 std::vector<const Cache*> KernelView::cachesOf(const Package& package) const {
   std::vector<const Cache*> own;
   for (const Cache& cache : caches) {
-    if (package.cpus.contains(cache.cpus.first())) {
+    if (package.cpus.contains(cache.owner)) {
       own.push_back(&cache);
     }
   }
@@ -25,9 +29,20 @@ unsigned int KernelView::statusOf(const CpuSet& cpus) const {
 }
 
 Origin KernelView::statusOrigin(const CpuSet& cpus) const {
-  const std::string part = "CPUs " + cpus.toList() + " make up the part: ";
-  return machine.originInCpuDirectory("online", part + (isOnline(cpus) ? "one at least is online, so it is in use"
-                                                                       : "none is online, so it is offline"));
+  return onlineOrigin(
+      cpus, "CPUs " + cpus.toList() + " make up the part: " +
+                (isOnline(cpus) ? "one at least is online, so it is in use" : "none is online, so it is offline"));
+}
+
+Origin KernelView::onlineOrigin(const CpuSet& cpus, std::string rule) const {
+  static constexpr std::array<std::string_view, 1> ownFile = {"online"};
+  Origin origin = machine.originInCpuDirectory("online", rule);
+  if (origin.raw.empty()) {
+    // Some kernels have the file of each CPU alone.
+    Origin own = machine.originOfCpus(cpus, ownFile, {}, std::move(rule));
+    origin = own.raw.empty() ? origin : own;
+  }
+  return origin;
 }
 
 std::string describeByPath(const std::string& label, std::string_view path) {

@@ -16,8 +16,8 @@ namespace Tarn::Inventory {
 struct KernelView {
   explicit KernelView(Machine& whole);
 
-  /// The caches that stand below the package: a cache belongs to the processor of its lowest CPU, also
-  /// where several processors share it.
+  /// The caches that stand below the package: a cache belongs to the processor of its owner, also where
+  /// several processors share it.
   std::vector<const Cache*> cachesOf(const Package& package) const;
 
   bool isOnline(const CpuSet& cpus) const { return cpus.intersects(topology.online); }
@@ -25,6 +25,9 @@ struct KernelView {
   /// The state of a part with these CPUs, and where that comes from.
   unsigned int statusOf(const CpuSet& cpus) const;
   Origin statusOrigin(const CpuSet& cpus) const;
+
+  /// Where it comes from which of these CPUs are online.
+  Origin onlineOrigin(const CpuSet& cpus, std::string rule) const;
 
   Machine& machine;
   const Topology topology;

@@ -1,6 +1,8 @@
 #include "platform/instrumentation/kernel/Topology.h"
 
 #include <algorithm>
+#include <cerrno>
+#include <span>
 #include <string>
 #include <tuple>
 #include <utility>
@@ -14,15 +16,10 @@ constexpr const char* mountSys = "mount sysfs on /sys";
 /// What the kernel tells of one CPU's place.
 struct CpuPlace {
   std::optional<unsigned int> package;
-  std::optional<unsigned int> packageCpu;  // the lowest CPU of a package without id
+  std::optional<CpuSet> packageCpus;  // of a package without id
   CorePlace core;
   std::optional<CpuSet> siblings;  // the CPUs of its core
 };
-
-// The number after a prefix, as in "cpu12".
-std::optional<unsigned int> numberAfter(std::string_view prefix, std::string_view name) {
-  return name.starts_with(prefix) ? Attributes::toNumber(name.substr(prefix.size())) : std::nullopt;
-}
 
 class TopologyReader {
  public:
@@ -36,7 +33,7 @@ class TopologyReader {
         place(cpu);
       }
     }
-    placeHomeless();
+    placeCpusWithoutPackage();
     placeHidden();
     sort();
     return std::move(topology_);
@@ -52,28 +49,52 @@ class TopologyReader {
 
   void readCpuLists() {
     topology_.present = readPresent();
-    std::optional<CpuSet> online = cpus_.list("online");
-    if (!online) {
-      machine_.noteUnread(cpus_.fileName(), cpus_.error(), mountSys);
-      online = machine_.cpuInfo().cpus().empty() ? topology_.present : machine_.cpuInfo().cpus();
-    }
-    topology_.online = *std::move(online);
+    topology_.online = readOnline();
     topology_.present.add(topology_.online);
+  }
+
+  CpuSet readOnline() {
+    if (std::optional<CpuSet> online = cpus_.list("online")) {
+      return *std::move(online);
+    }
+    const std::string file = cpus_.fileName();
+    const FileError error = cpus_.error();
+    // Some kernels have the file of each CPU alone, and none for a CPU that cannot be set offline.
+    CpuSet online;
+    bool hasOwnFiles = false;
+    for (const unsigned int cpu : topology_.present) {
+      const std::optional<unsigned int> state = cpus_.number("cpu", cpu, "/online");
+      hasOwnFiles = hasOwnFiles || state;
+      if (state != 0U) {
+        online.add(cpu);
+      }
+    }
+    if (hasOwnFiles) {
+      return online;
+    }
+    machine_.noteUnread(file, error, mountSys);
+    return machine_.cpuInfo().cpus().empty() ? topology_.present : machine_.cpuInfo().cpus();
   }
 
   CpuSet readPresent() {
     if (std::optional<CpuSet> present = cpus_.list("present"); present && !present->empty()) {
       return *std::move(present);
     }
-    machine_.noteUnread(cpus_.fileName(), cpus_.error(), mountSys);
-    CpuSet present = machine_.cpuInfo().cpus();
+    const std::string file = cpus_.fileName();
+    const FileError error = cpus_.error();
+    CpuSet present;
     std::vector<std::string> names;
     machine_.root().files().list(kernelCpuDirectory, names);
     for (const std::string& name : names) {
-      if (const std::optional<unsigned int> cpu = numberAfter("cpu", name)) {
+      if (const std::optional<unsigned int> cpu = Attributes::numberAfter("cpu", name)) {
         present.add(*cpu);
       }
     }
+    // Old kernels have the directories alone.
+    if (present.empty() || error != ENOENT) {
+      machine_.noteUnread(file, error, mountSys);
+    }
+    present.add(machine_.cpuInfo().cpus());
     return present;
   }
 
@@ -88,10 +109,10 @@ class TopologyReader {
       known.emplace();
     }
     addFromCpuInfo(cpu, *known);
-    if (known->package || known->packageCpu) {
+    if (known->package || known->packageCpus) {
       addToCore(cpu, *known, packageOf(*known));
     } else {
-      homeless_.emplace_back(cpu, *std::move(known));
+      withoutPackage_.emplace_back(cpu, *std::move(known));
     }
   }
 
@@ -107,22 +128,18 @@ class TopologyReader {
     if (coresAreNumberedByCluster_) {
       place.core.cluster = cpus_.number("cpu", cpu, "/topology/cluster_id");
     }
-    place.siblings = cpus_.list("cpu", cpu, "/topology/thread_siblings_list");
-    if (!place.siblings) {
-      place.siblings = cpus_.list("cpu", cpu, "/topology/core_cpus_list");
-    }
+    place.siblings = readOwnSet(cpu, coreCpusFiles);
     if (!place.package) {
-      place.packageCpu = readPackageCpu(cpu);
+      place.packageCpus = readOwnSet(cpu, packageCpusFiles);
     }
     return place;
   }
 
-  std::optional<unsigned int> readPackageCpu(unsigned int cpu) {
-    std::optional<CpuSet> package = cpus_.list("cpu", cpu, "/topology/core_siblings_list");
-    if (!package) {
-      package = cpus_.list("cpu", cpu, "/topology/package_cpus_list");
-    }
-    return package && package->contains(cpu) ? std::optional(package->first()) : std::nullopt;
+  // The CPUs that this one is grouped with. A set without the CPU itself, as some kernels have for one that is
+  // offline, says nothing.
+  std::optional<CpuSet> readOwnSet(unsigned int cpu, std::span<const std::string_view> files) {
+    std::optional<CpuSet> cpus = cpus_.cpusIn(cpu, files);
+    return cpus && cpus->contains(cpu) ? std::move(cpus) : std::nullopt;
   }
 
   // Where sysfs hides a place, /proc/cpuinfo tells it as well on some architectures.
@@ -131,7 +148,7 @@ class TopologyReader {
     if (!info.cpus().contains(cpu)) {
       return;
     }
-    if (!place.package && !place.packageCpu) {
+    if (!place.package && !place.packageCpus) {
       place.package = Attributes::toNumber(info.field(cpu, "physical id"));
     }
     if (!place.core.core && !place.siblings) {
@@ -140,15 +157,15 @@ class TopologyReader {
   }
 
   Package& packageOf(const CpuPlace& place) {
+    const unsigned int lowest = place.packageCpus ? place.packageCpus->first() : CpuSet::limit;
     const auto found = std::ranges::find_if(topology_.packages, [&](const Package& package) {
-      return place.package ? package.id == place.package
-                           : package.cpus.contains(*place.packageCpu) || package.lowestCpu == *place.packageCpu;
+      return place.package ? package.id == place.package : package.cpus.contains(lowest) || package.lowestCpu == lowest;
     });
     if (found != topology_.packages.end()) {
       return *found;
     }
-    const unsigned int none = CpuSet::limit;
-    return topology_.packages.emplace_back(Package{place.package, place.packageCpu.value_or(none), {}, {}});
+    namedBySiblings_.push_back(place.packageCpus);
+    return topology_.packages.emplace_back(Package{place.package, lowest, {}, {}});
   }
 
   void addToCore(unsigned int cpu, const CpuPlace& place, Package& package) {
@@ -168,28 +185,55 @@ class TopologyReader {
   }
 
   // Where nothing tells of any package there is one at least, and these CPUs are in it. Beside packages
-  // that are known, they could be anywhere.
-  void placeHomeless() {
+  // that are known, they are where their siblings say.
+  void placeCpusWithoutPackage() {
     const bool nothingKnown = topology_.packages.empty();
-    for (const auto& [cpu, place] : homeless_) {
-      if (!nothingKnown) {
+    for (const auto& [cpu, place] : withoutPackage_) {
+      if (placed_.contains(cpu)) {
+        continue;
+      }
+      if (nothingKnown) {
+        addToCore(cpu, place, packageOf({.package = {}, .packageCpus = CpuSet(), .core = {}, .siblings = {}}));
+      } else if (Package* package = packageBySiblings(cpu)) {
+        addToCore(cpu, place, *package);
+      } else {
         machine_.noteUnreadOfCpu(cpu, "topology", "nothing tells which processor the CPU belongs to", mountSys);
-      } else if (!placed_.contains(cpu)) {
-        addToCore(cpu, place, packageOf({.package = {}, .packageCpu = 0, .core = {}, .siblings = {}}));
       }
     }
   }
 
-  // While a CPU is offline most kernels hide its topology; of its core nothing is known then. The memory
-  // node that it is attached to may still tell the package.
+  // While a CPU is offline most kernels hide its topology. Siblings that are online may still name it; else
+  // the memory node that it is attached to may give the package.
   void placeHidden() {
+    hidden_.remove(placed_);
     for (const unsigned int cpu : hidden_) {
       machine_.noteUnreadOfCpu(cpu, "topology", "the CPU is offline and the kernel hides its place",
                                "write 1 to the file online in its directory, as root");
-      if (Package* package = packageByMemoryNode(cpu)) {
+      Package* package = packageBySiblings(cpu);
+      package = package == nullptr ? packageByMemoryNode(cpu) : package;
+      if (package != nullptr) {
         package->cpus.add(cpu);
       }
     }
+  }
+
+  // The package in which a CPU counts this one among its siblings. All CPUs of a package name the same, so the
+  // first one is asked.
+  Package* packageBySiblings(unsigned int cpu) {
+    for (std::size_t i = 0; i < topology_.packages.size(); ++i) {
+      Package& package = topology_.packages[i];
+      std::optional<CpuSet>& named = namedBySiblings_[i];
+      if (!named) {
+        CpuSet online = package.cpus;
+        online.keepOnly(topology_.online);
+        named = cpus_.cpusIn(online.empty() ? package.cpus.first() : online.first(), packageCpusFiles);
+        named = named.value_or(CpuSet());
+      }
+      if (named->contains(cpu)) {
+        return &package;
+      }
+    }
+    return nullptr;
   }
 
   Package* packageByMemoryNode(unsigned int cpu) {
@@ -197,7 +241,7 @@ class TopologyReader {
     std::vector<std::string> names;
     cpus_.files().list(directory.c_str(), names);
     for (const std::string& name : names) {
-      if (numberAfter("node", name)) {
+      if (Attributes::numberAfter("node", name)) {
         CpuSet neighbours = cpus_.list(directory, "/", name, "/cpulist").value_or(CpuSet());
         neighbours.remove(hidden_);
         return packageOfAll(neighbours);
@@ -234,11 +278,20 @@ class TopologyReader {
   const bool coresAreNumberedByCluster_;
   Topology topology_;
   CpuSet placed_;
-  CpuSet hidden_;                                            // offline, without a place
-  std::vector<std::pair<unsigned int, CpuPlace>> homeless_;  // without a package
+  CpuSet hidden_;                                                  // offline, without a place
+  std::vector<std::pair<unsigned int, CpuPlace>> withoutPackage_;  // by CPU
+  std::vector<std::optional<CpuSet>> namedBySiblings_;             // in each package, once that was asked
 };
 
 }  // namespace
+
+CpuSet Topology::placed() const {
+  CpuSet cpus;
+  for (const Package& package : packages) {
+    cpus.add(package.cpus);
+  }
+  return cpus;
+}
 
 Topology readTopology(Machine& machine) {
   return TopologyReader(machine).read();

@@ -1,7 +1,9 @@
 #ifndef CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_TOPOLOGY_H
 #define CORVANE_PLATFORM_INSTRUMENTATION_KERNEL_TOPOLOGY_H
 
+#include <array>
 #include <optional>
+#include <string_view>
 #include <vector>
 
 #include "platform/instrumentation/kernel/Machine.h"
@@ -34,7 +36,21 @@ struct Topology {
   CpuSet present;
   CpuSet online;
   std::vector<Package> packages;  ///< by id, then by lowest CPU
+
+  /// The CPUs that have a processor.
+  CpuSet placed() const;
 };
+
+/// The files below cpuN/ that name the CPUs of its core, and of its package: under two names each, and as masks
+/// on kernels that have no lists. The first usable one counts.
+inline constexpr std::array<std::string_view, 4> coreCpusFiles = {
+    "topology/thread_siblings_list", "topology/core_cpus_list", "topology/thread_siblings", "topology/core_cpus"};
+inline constexpr std::array<std::string_view, 4> packageCpusFiles = {
+    "topology/core_siblings_list", "topology/package_cpus_list", "topology/core_siblings", "topology/package_cpus"};
+
+/// The files that tell the cores apart: these, or without them the core's number.
+inline constexpr std::array<std::string_view, 5> coreFiles = {coreCpusFiles[0], coreCpusFiles[1], coreCpusFiles[2],
+                                                              coreCpusFiles[3], "topology/core_id"};
 
 /// Packages, cores and threads as the kernel groups them.
 Topology readTopology(Machine& machine);

@@ -25,13 +25,6 @@ bool hasOneSet(const Cache& cache) {
   return cache.sets == 1U && cache.ways != 1U;
 }
 
-std::optional<unsigned int> blocksOf(const Cache& cache) {
-  if (!cache.size || !cache.lineSize) {
-    return std::nullopt;
-  }
-  return static_cast<unsigned int>(std::uint64_t{*cache.size} * 1024 / *cache.lineSize);
-}
-
 /// One cache's node, each value with the attribute that it comes from.
 class CacheNode {
  public:
@@ -43,9 +36,9 @@ class CacheNode {
     tree_.status(kernel_.statusOf(cache_.cpus)).from([&] { return kernel_.statusOrigin(cache_.cpus); });
     const bool numbered = path.find('@') == std::string::npos;
     tree_.description(describeCache(cache_, path)).from([&] {
-      return attribute(numbered ? "id" : "shared_cpu_list", numbered
-                                                                ? "level, contents and the kernel's number of the cache"
-                                                                : "level, contents and the lowest CPU of the cache");
+      return attribute(numbered ? "id" : cache_.cpusFile, numbered
+                                                              ? "level, contents and the kernel's number of the cache"
+                                                              : "level, contents and the lowest CPU of the cache");
     });
     tree_.text(PropCacheName, cacheName(cache_)).from([&] {
       return attribute("level", "L and the level, after it d for data, i for instructions");
@@ -58,14 +51,30 @@ class CacheNode {
            hasOneSet(cache_) ? "number_of_sets" : "ways_of_associativity",
            hasOneSet(cache_) ? "one set: fully associative, 2" : "ways: 1 is 1, 2 is 3, 4 is 4, 8 is 5, 16 is 6");
     number(PropCacheWritePolicy, cache_.writePolicy, "write_policy", "WriteBack is 1, WriteThrough 2");
-    number(PropCacheBlockSize, cache_.lineSize, "coherency_line_size", "bytes, as it stands");
-    const char* blocksRule = "the size by coherency_line_size";
-    number(PropCacheNumberOfBlocks, blocksOf(cache_), "size", blocksRule);
-    number(PropCacheConsumableBlocks, blocksOf(cache_), "size", blocksRule);
+    addSize();
     addFromTwin();
   }
 
  private:
+  void addSize() {
+    number(PropCacheBlockSize, cache_.lineSize, "coherency_line_size", "bytes, as it stands");
+    if (!cache_.size) {
+      return;
+    }
+    const auto blocks = cacheBlocks(std::uint64_t{*cache_.size} * 1024, cache_.lineSize);
+    if (!blocks) {
+      return;
+    }
+    const char* rule = "the size by coherency_line_size";
+    if (!cache_.lineSize) {
+      number(PropCacheBlockSize, blocks->size, "size",
+             "the kernel reports no line size: the unit of the number of blocks");
+      rule = blocks->size == 1 ? "the size in bytes" : "the size in KiB";
+    }
+    number(PropCacheNumberOfBlocks, blocks->count, "size", rule);
+    number(PropCacheConsumableBlocks, blocks->count, "size", rule);
+  }
+
   // What only the firmware tells.
   void addFromTwin() {
     if (twin_ == nullptr) {

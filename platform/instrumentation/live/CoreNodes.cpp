@@ -22,13 +22,11 @@ std::string partOf(const char* group, std::optional<unsigned int> number) {
 
 Origin descriptionOrigin(const KernelView& kernel, const Core& core, const std::string& path) {
   static constexpr std::array<std::string_view, 1> byNumber = {"topology/core_id"};
-  static constexpr std::array<std::string_view, 3> byList = {"topology/thread_siblings_list", "topology/core_cpus_list",
-                                                             "topology/core_id"};
   const bool numbered = path.find('@') == std::string::npos;
   const std::string rule = std::string(kernel.kinds.size() > 1 ? "the kind of the core and " : "") +
                            (numbered ? "the kernel's number of the core" : "the lowest CPU of the core");
   return kernel.machine.originOfCpus(
-      core.cpus, numbered ? std::span<const std::string_view>(byNumber) : std::span<const std::string_view>(byList),
+      core.cpus, numbered ? std::span<const std::string_view>(byNumber) : std::span<const std::string_view>(coreFiles),
       numbered ? "core id" : "", rule);
 }
 

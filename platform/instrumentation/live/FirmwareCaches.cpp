@@ -4,7 +4,6 @@
 #include <array>
 #include <cstdint>
 #include <iterator>
-#include <limits>
 #include <string_view>
 
 #include "platform/instrumentation/firmware/FirmwareTables.h"
@@ -101,24 +100,17 @@ class FirmwareCacheNode {
     }
   }
 
-  // The firmware tells no line size. CIM has 1 for what has no blocks; larger caches than that can count
-  // are given in KiB.
   void addSize() {
-    if (!structure_.installedSize) {
+    const auto blocks = structure_.installedSize ? cacheBlocks(*structure_.installedSize * 1024, std::nullopt)
+                                                 : std::optional<CacheBlocks>();
+    if (!blocks) {
       return;
     }
-    constexpr std::uint64_t most = std::numeric_limits<std::uint32_t>::max();
-    const std::uint64_t kibibytes = *structure_.installedSize;
-    const bool inBytes = kibibytes <= most / 1024;
-    if (!inBytes && kibibytes > most) {
-      return;
-    }
-    const auto blocks = static_cast<unsigned int>(inBytes ? kibibytes * 1024 : kibibytes);
-    const char* rule = inBytes ? "the installed size in bytes" : "the installed size in KiB";
-    number(PropCacheBlockSize, inBytes ? 1 : 1024, structure_.installedSize,
+    const char* rule = blocks->size == 1 ? "the installed size in bytes" : "the installed size in KiB";
+    number(PropCacheBlockSize, blocks->size, structure_.installedSize,
            "the firmware tells no line size: the unit of the number of blocks");
-    number(PropCacheNumberOfBlocks, blocks, structure_.installedSize, rule);
-    number(PropCacheConsumableBlocks, blocks, structure_.installedSize, rule);
+    number(PropCacheNumberOfBlocks, blocks->count, structure_.installedSize, rule);
+    number(PropCacheConsumableBlocks, blocks->count, structure_.installedSize, rule);
   }
 
   template <class Value>

@@ -142,8 +142,8 @@ class LiveReader {
     if (kernel_.isOnline(package.cpus)) {
       return {};
     }
-    return [this] {
-      return machine_.originInCpuDirectory("online", "none of the processor's CPUs is online: offline, 12");
+    return [this, &package] {
+      return kernel_.onlineOrigin(package.cpus, "none of the processor's CPUs is online: offline, 12");
     };
   }
 

@@ -8,6 +8,7 @@ namespace {
 
 using namespace NodeLexicon;
 using testing::Contains;
+using testing::Not;
 using Paths = std::vector<std::string>;
 
 // One package of cores with one thread each.
@@ -120,18 +121,38 @@ TEST(Cache, BlocksAreSizeByLine) {
       {"2M", "128", 128, 16384},
       {"1G", "64", 64, 16777216},
       {"32768", "64", 64, 512},
-      {"48K", "", std::nullopt, std::nullopt},
-      {"48K", "0", std::nullopt, std::nullopt},
+      {"48K", "", 1, 49152},
+      {"48K", "0", 1, 49152},
+      {"4194303K", "", 1, 4294966272},
+      {"4194304K", "", 1024, 4194304},
+      {"4294967295K", "", 1024, 4294967295},
+      {"268435455K", "64", 64, 4294967280},
+      {"268435456K", "64", 64, std::nullopt},
       {"", "64", 64, std::nullopt},
+      {"", "", std::nullopt, std::nullopt},
       {"0K", "64", 64, std::nullopt},
       {"lots", "64", 64, std::nullopt},
       {"9999999G", "64", 64, std::nullopt},
+      {"4294967296K", "", std::nullopt, std::nullopt},
   };
   for (const Row& row : rows) {
     const KernelFiles::Cache cache{.cpus = "0", .size = row.size, .lineSize = row.line};
     EXPECT_EQ(numberOf(cache, PropCacheBlockSize), row.lineSize) << row.size << '/' << row.line;
     EXPECT_EQ(numberOf(cache, PropCacheNumberOfBlocks), row.blocks) << row.size << '/' << row.line;
     EXPECT_EQ(numberOf(cache, PropCacheConsumableBlocks), row.blocks) << row.size << '/' << row.line;
+  }
+}
+
+TEST(Cache, SizesThatAreNotPlausibleAreReported) {
+  const Unread implausible{"/sys/devices/system/cpu/cpu0/cache/index0/size", "it holds no plausible size of a cache",
+                           "report it to the maker of the firmware"};
+  for (const char* size : {"lots", "4294967296K", "4194304M", "268435456K"}) {
+    const Tree tree = oneCache({.cpus = "0", .size = size});
+    EXPECT_THAT(tree.unread(), Contains(implausible)) << size;
+  }
+  for (const char* size : {"", "0K", "268435455K"}) {
+    const Tree tree = oneCache({.cpus = "0", .size = size});
+    EXPECT_THAT(tree.unread(), Not(Contains(implausible))) << size;
   }
 }
 
@@ -169,6 +190,45 @@ TEST(Cache, StandsBelowTheProcessorOfItsLowestCpu) {
   files.cache(0, 0, {.level = 3, .cpus = "0-1", .id = "0"}).cache(1, 0, {.level = 3, .cpus = "0-1", .id = "0"});
 
   EXPECT_EQ(pathsOf(files.tree(), NodeCacheMemory), Paths{"P1.L3.0"});
+}
+
+TEST(Cache, BelongsToTheLowestOfItsCpusThatHasAProcessor) {
+  KernelFiles files = cores(3);
+  files.cpus("0-3").online("0-2").cache(0, 0, {.level = 3, .cpus = "0-3", .id = "0"});
+  files.remove(cpuDirectory + "cpu0/topology").online("1-2");
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeCacheMemory), Paths{"P0.L3.0"});
+  EXPECT_EQ(nodeAt(tree, "P0.L3.0").cpus, (CpuSet{0, 1, 2, 3}));
+}
+
+TEST(Cache, OfCpusWithoutAProcessorIsReported) {
+  KernelFiles files = cores(2);
+  files.remove(cpuDirectory + "cpu1/topology").cache(1, 0, {.level = 2, .cpus = "1"});
+  files.cache(0, 0, {.level = 2, .cpus = "0"});
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeCacheMemory), Paths{"P0.L2@0"});
+  EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/devices/system/cpu/cpu1/cache/index0",
+                                             "no CPU that shares the cache has a known processor",
+                                             "set these CPUs online, or mount sysfs on /sys"}));
+}
+
+TEST(Cache, SharingIsReadFromTheMaskWithoutAList) {
+  KernelFiles files = cores(4);
+  for (unsigned int cpu = 0; cpu < 4; ++cpu) {
+    files.cache(cpu, 0, {.level = 2, .cpus = "x"})
+        .remove(cpuDirectory + "cpu" + std::to_string(cpu) + "/cache/index0/shared_cpu_list");
+    files.file(cpuDirectory + "cpu" + std::to_string(cpu) + "/cache/index0/shared_cpu_map",
+               cpu < 2 ? "00000000,00000003\n" : "00000000,0000000c\n");
+  }
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeCacheMemory), (Paths{"P0.L2@0", "P0.L2@2"}));
+  EXPECT_EQ(nodeAt(tree, "P0.L2@2").cpus, (CpuSet{2, 3}));
 }
 
 TEST(Cache, TheSameCacheAtAnotherPlaceForAnotherKindOfCore) {

@@ -244,6 +244,41 @@ TEST(Topology, APackageThatCannotBeReadIsThatOfTheCpusBesideIt) {
   EXPECT_EQ(pathsOf(tree, NodeProcessorCore), (Paths{"P3.C0", "P3.C1"}));
 }
 
+TEST(Topology, MasksServeWithoutLists) {
+  KernelFiles files;
+  files.cpus("0-3");
+  for (unsigned int cpu = 0; cpu < 4; ++cpu) {
+    const std::string directory = cpuDirectory + "cpu" + std::to_string(cpu) + "/topology/";
+    files.cpu(cpu, {.package = -1, .core = -1});
+    files.file(directory + (cpu < 2 ? "thread_siblings" : "core_cpus"), cpu < 2 ? "00000000,00000003\n" : "c\n");
+    files.file(directory + (cpu < 2 ? "core_siblings" : "package_cpus"), cpu < 2 ? "3\n" : "0000000c\n");
+  }
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(pathsOf(tree, NodeProcessor), (Paths{"P@0", "P@2"}));
+  EXPECT_EQ(pathsOf(tree, NodeProcessorCore), (Paths{"P@0.C@0", "P@2.C@2"}));
+  EXPECT_EQ(nodeAt(tree, "P@2.C@2").cpus, (CpuSet{2, 3}));
+}
+
+TEST(Topology, WithoutAListOfOnlineCpusTheirOwnFilesServe) {
+  KernelFiles files;
+  files.cpus("0-2").remove(cpuDirectory + "online").file(cpuDirectory + "cpu1/online", "0\n");
+  files.file(cpuDirectory + "cpu2/online", "1\n");
+  for (unsigned int cpu = 0; cpu < 3; ++cpu) {
+    files.cpu(cpu, {.package = 0, .core = static_cast<int>(cpu), .siblings = std::to_string(cpu)});
+  }
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(nodeAt(tree, "P0.C0").status, Status::inUse) << "a CPU without the file cannot be set offline";
+  EXPECT_EQ(nodeAt(tree, "P0.C1").status, Status::offline);
+  EXPECT_EQ(nodeAt(tree, "P0.C2").status, Status::inUse);
+  for (const Unread& entry : tree.unread()) {
+    EXPECT_NE(entry.file, "/sys/devices/system/cpu/online");
+  }
+}
+
 TEST(Topology, SiblingsThatAreNotPresentDoNotCount) {
   KernelFiles files;
   files.cpus("2-3");
@@ -263,6 +298,21 @@ TEST(Topology, CpusAreFoundByTheirDirectoriesWithoutAList) {
   const Tree tree = files.tree();
 
   EXPECT_EQ(nodeAt(tree, "P0").cpus, (CpuSet{0, 12}));
+}
+
+TEST(Topology, NumbersInCpuInfoThatDoNotFitAreReported) {
+  KernelFiles files;
+  files.cpus("0").cpu(0, {.package = 0, .core = 0, .siblings = "0"});
+  files.file("proc/cpuinfo", "processor\t: 4294967296\ncpu family\t: 6\nmodel name\t: Nobody's\n");
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(textAt(tree, "P0", PropProcessorName), std::nullopt);
+  EXPECT_THAT(tree.unread(),
+              Contains(Unread{"/proc/cpuinfo, line 1",
+                              "\"processor\" is 4294967296, more than this number can be; it is not used",
+                              "correct the number if the file was captured; on a running machine the kernel is at "
+                              "fault"}));
 }
 
 TEST(Topology, ListsWithNonsenseAreTold) {
