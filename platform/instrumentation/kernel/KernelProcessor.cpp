@@ -15,6 +15,7 @@ namespace {
 using namespace NodeLexicon;
 
 constexpr const char* kilohertzRule = "kHz, rounded to whole MHz";
+constexpr const char* currentFrequencyFile = "/cpufreq/scaling_cur_freq";
 
 class Reader {
  public:
@@ -23,6 +24,7 @@ class Reader {
 
   KernelProcessor read() {
     readIdentity();
+    readMaxSpeed();
     addIdentity();
     addCounts();
     addRequestedStates(result_.facts);
@@ -38,25 +40,52 @@ class Reader {
         continue;
       }
       const CpuIdentity own = identifyCpu(machine_.cpuInfo(), cpu);
-      const std::optional<unsigned int> speed = readMegahertz(cpu, "cpuinfo_max_freq");
       cpus_.push_back(cpu);
       if (cpus_.size() == 1) {
         identity = own;
-        if (!speed) {
-          machine_.noteUnreadOfCpu(cpu, "cpufreq/cpuinfo_max_freq",
-                                   "load the processor's frequency driver; most virtual machines have none");
-        }
       } else {
         merge(identity, own);
       }
-      if (speed > maxSpeed_) {
-        maxSpeed_ = speed;
-        fastest_ = cpu;
+    }
+    // Of one CPU alone: this file can make the kernel measure.
+    if (!cpus_.empty() && !identity.clockSpeed) {
+      identity.clockSpeed = megahertz(machine_.cpus().number("cpu", cpus_.front(), currentFrequencyFile));
+      clockFromDriver_ = identity.clockSpeed.has_value();
+    }
+  }
+
+  // Cores of one kind can have different limits, CPUs of one policy cannot.
+  void readMaxSpeed() {
+    for (const FrequencyPolicy& policy : kernel_.policies) {
+      if (package_.cpus.contains(policy.cpu)) {
+        readMaxSpeedIn(policy.directory);
       }
     }
-    if (!cpus_.empty() && !identity.clockSpeed) {
-      identity.clockSpeed = readMegahertz(cpus_.front(), "scaling_cur_freq");
-      clockFromDriver_ = identity.clockSpeed.has_value();
+    if (maxSpeed_ || cpus_.empty()) {
+      return;
+    }
+    // Without a driver the first of each kind show it, and no other is asked.
+    for (const unsigned int cpu : cpus_) {
+      readMaxSpeedIn("cpu" + std::to_string(cpu) + "/cpufreq");
+    }
+    if (!maxSpeed_) {
+      machine_.noteUnreadOfCpu(cpus_.front(), "cpufreq/cpuinfo_max_freq",
+                               "load the processor's frequency driver; most virtual machines have none");
+      return;
+    }
+    for (const Core& core : package_.cores) {
+      const unsigned int cpu = firstOnline(core.cpus);
+      if (cpu != CpuSet::limit && std::ranges::find(cpus_, cpu) == cpus_.end()) {
+        readMaxSpeedIn("cpu" + std::to_string(cpu) + "/cpufreq");
+      }
+    }
+  }
+
+  void readMaxSpeedIn(const std::string& directory) {
+    const std::optional<unsigned int> limit = machine_.cpus().number(directory, "/cpuinfo_max_freq");
+    if (limit > maxSpeed_) {
+      maxSpeed_ = limit;
+      maxSpeedFile_ = directory + "/cpuinfo_max_freq";
     }
   }
 
@@ -72,9 +101,7 @@ class Reader {
     }
   }
 
-  // From one CPU for each kind of core: asking for a frequency can make the kernel measure it.
-  std::optional<unsigned int> readMegahertz(unsigned int cpu, const char* name) {
-    const std::optional<unsigned int> kilohertz = machine_.cpus().number("cpu", cpu, "/cpufreq/", name);
+  static std::optional<unsigned int> megahertz(std::optional<unsigned int> kilohertz) {
     return kilohertz ? std::optional(*kilohertz / 1000 + (*kilohertz % 1000 >= 500 ? 1 : 0)) : std::nullopt;
   }
 
@@ -91,10 +118,10 @@ class Reader {
     facts.number(PropFamily, identity.family, told(PropFamily));
     facts.number(PropDataWidth, identity.width, told(PropDataWidth));
     facts.number(PropAddressWidth, identity.width, told(PropAddressWidth));
-    facts.number(PropMaxClockSpeed, maxSpeed_, fromDriver(fastest_, "cpufreq/cpuinfo_max_freq"));
-    facts.number(
-        PropCurrentClockSpeed, identity.clockSpeed,
-        clockFromDriver_ ? fromDriver(cpus_.front(), "cpufreq/scaling_cur_freq") : told(PropCurrentClockSpeed));
+    facts.number(PropMaxClockSpeed, megahertz(maxSpeed_), fromDriver(maxSpeedFile_));
+    facts.number(PropCurrentClockSpeed, identity.clockSpeed,
+                 clockFromDriver_ ? fromDriver("cpu" + std::to_string(cpus_.front()) + currentFrequencyFile)
+                                  : told(PropCurrentClockSpeed));
     facts.text(PropProcessorName, identity.name, namesDiffer_ ? toldByEachKind() : told(PropProcessorName));
     facts.text(PropStepping, identity.stepping, told(PropStepping));
     facts.text(PropProcessorId, identity.processorId, told(PropProcessorId));
@@ -111,17 +138,14 @@ class Reader {
     }
     const auto cores = static_cast<unsigned int>(package_.cores.size());
     result_.facts.number(PropProcessorCores, cores, [this_ = parts(), cores] {
-      static constexpr std::array<std::string_view, 3> suffixes = {"topology/thread_siblings_list",
-                                                                   "topology/core_cpus_list", "topology/core_id"};
       return this_.kernel->machine.originOfCpus(
-          this_.package->cores.front().cpus, suffixes, "core id",
+          this_.package->cores.front().cpus, coreFiles, "core id",
           "CPUs that it puts together are one core; cores of the processor: " + std::to_string(cores));
     });
     const auto enabled = static_cast<unsigned int>(
         std::ranges::count_if(package_.cores, [this](const Core& core) { return kernel_.isOnline(core.cpus); }));
     result_.facts.number(PropEnabledCores, enabled, [this_ = parts(), enabled] {
-      return this_.kernel->machine.originInCpuDirectory("online",
-                                                        "cores with a CPU online: " + std::to_string(enabled));
+      return this_.kernel->onlineOrigin(this_.package->cpus, "cores with a CPU online: " + std::to_string(enabled));
     });
   }
 
@@ -160,17 +184,18 @@ class Reader {
     };
   }
 
-  Facts::Explain fromDriver(unsigned int cpu, const char* suffix) const {
-    return [kernel = &kernel_, cpu, suffix] { return kernel->machine.originOfCpu(cpu, suffix, kilohertzRule); };
+  // The file is one below the directory of the CPUs.
+  Facts::Explain fromDriver(const std::string& file) const {
+    return [kernel = &kernel_, file] { return kernel->machine.originInCpuDirectory(file, kilohertzRule); };
   }
 
   const KernelView& kernel_;
   Machine& machine_;
   const Package& package_;
   KernelProcessor result_;
-  std::vector<unsigned int> cpus_;  // the first online CPU of each kind of core
-  std::optional<unsigned int> maxSpeed_;
-  unsigned int fastest_ = 0;
+  std::vector<unsigned int> cpus_;        // the first online CPU of each kind of core
+  std::optional<unsigned int> maxSpeed_;  // kHz
+  std::string maxSpeedFile_;
   bool namesDiffer_ = false;
   bool clockFromDriver_ = false;
 };
@@ -189,13 +214,11 @@ void addRequestedStates(Facts& facts) {
 
 Origin originOfPackage(const KernelView& kernel, const Package& package, std::string rule) {
   static constexpr std::array<std::string_view, 1> byNumber = {"topology/physical_package_id"};
-  static constexpr std::array<std::string_view, 2> byList = {"topology/core_siblings_list",
-                                                             "topology/package_cpus_list"};
   const Machine& machine = kernel.machine;
   if (package.id) {
     return machine.originOfCpus(package.cpus, byNumber, "physical id", std::move(rule));
   }
-  Origin origin = machine.originOfCpus(package.cpus, byList, {}, rule);
+  Origin origin = machine.originOfCpus(package.cpus, packageCpusFiles, {}, rule);
   if (origin.raw.empty()) {
     origin =
         machine.originInCpuDirectory("present", "nothing tells of packages, so all CPUs are one; " + std::move(rule));

@@ -12,7 +12,8 @@ KernelView::KernelView(Machine& whole)
     : machine(whole),
       topology(readTopology(whole)),
       kinds(readCoreKinds(whole, topology)),
-      caches(readCaches(whole, topology)) {}
+      caches(readCaches(whole, topology)),
+      policies(readFrequencyPolicies(whole, topology)) {}
 
 std::vector<const Cache*> KernelView::cachesOf(const Package& package) const {
   std::vector<const Cache*> own;

@@ -7,6 +7,7 @@
 
 #include "platform/instrumentation/kernel/Caches.h"
 #include "platform/instrumentation/kernel/CoreKinds.h"
+#include "platform/instrumentation/kernel/FrequencyPolicies.h"
 #include "platform/instrumentation/kernel/Machine.h"
 #include "platform/instrumentation/kernel/Topology.h"
 
@@ -33,6 +34,7 @@ struct KernelView {
   const Topology topology;
   const std::vector<CoreKind> kinds;
   const std::vector<Cache> caches;
+  const std::vector<FrequencyPolicy> policies;
 };
 
 /// The kind of part and its number, which its path ends with: "L2 cache 3", "Core at CPU 8".

@@ -55,8 +55,12 @@ TEST_P(Fixture, PathsAreShort) {
 }
 
 INSTANTIATE_TEST_SUITE_P(All, Fixture,
-                         testing::Values("arm64-board", "container", "dual-socket-server", "hybrid-laptop",
-                                         "kvm-two-cpus", "large-server", "offline-cpus", "virtual-machine"),
+                         testing::Values("arm64-board", "container", "dual-socket-server", "favoured-cores",
+                                         "first-cpu-offline", "hybrid-laptop", "implausible-numbers", "itanium-server",
+                                         "kvm-two-cpus", "large-server", "loongarch-desktop", "masks-alone",
+                                         "named-machine", "offline-cpus", "offline-siblings", "power9-server",
+                                         "riscv-board", "riscv-without-uarch", "s390-partition", "sparc-server",
+                                         "virtual-machine"),
                          [](const auto& fixture) {
                            std::string name = fixture.param;
                            std::erase(name, '-');

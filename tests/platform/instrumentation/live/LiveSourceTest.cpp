@@ -67,6 +67,44 @@ TEST(LiveSource, MaximumClockSpeedIsAbsentWithoutAFrequencyDriver) {
                               "load the processor's frequency driver; most virtual machines have none"}));
 }
 
+TEST(LiveSource, MaximumClockSpeedIsTheHighestOfTheProcessorsPolicies) {
+  KernelFiles files;
+  files.cpus("0-4");
+  for (unsigned int cpu = 0; cpu < 5; ++cpu) {
+    files.cpu(cpu, {.package = cpu == 4 ? 1 : 0, .core = static_cast<int>(cpu), .siblings = std::to_string(cpu)});
+  }
+  const std::string policies = cpuDirectory + "cpufreq/policy";
+  files.file(policies + "0/cpuinfo_max_freq", "4700000\n").file(policies + "2/cpuinfo_max_freq", "5000000\n");
+  files.file(policies + "4/cpuinfo_max_freq", "5500000\n");
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(numberAt(tree, "P0", PropMaxClockSpeed), 5000U);
+  EXPECT_EQ(numberAt(tree, "P1", PropMaxClockSpeed), 5500U);
+}
+
+TEST(LiveSource, APolicyWithTheNumberOfAHiddenCpuCountsForItsOtherCpus) {
+  KernelFiles files = twoPackages();
+  files.cpus("0-2").online("0-1").file(cpuDirectory + "cpufreq/policy2/cpuinfo_max_freq", "4000000\n");
+  files.file(cpuDirectory + "cpufreq/policy2/related_cpus", "1 2 \n");
+
+  const Tree tree = files.tree();
+
+  EXPECT_EQ(numberAt(tree, "P0", PropMaxClockSpeed), std::nullopt);
+  EXPECT_EQ(numberAt(tree, "P1", PropMaxClockSpeed), 4000U);
+}
+
+TEST(LiveSource, WithoutDirectoriesOfPoliciesEachCpuIsAsked) {
+  KernelFiles files;
+  files.cpus("0-2");
+  for (unsigned int cpu = 0; cpu < 3; ++cpu) {
+    files.cpu(cpu, {.package = 0, .core = static_cast<int>(cpu), .siblings = std::to_string(cpu)});
+  }
+  files.maxFrequency(0, "4700000").maxFrequency(1, "5000000").maxFrequency(2, "4900000");
+
+  EXPECT_EQ(numberAt(files.tree(), "P0", PropMaxClockSpeed), 5000U);
+}
+
 TEST(LiveSource, CurrentClockSpeedComesFromCpuInfoElseFromTheDriver) {
   KernelFiles files = twoPackages();
   files.file(cpuDirectory + "cpu0/cpufreq/scaling_cur_freq", "800000\n");
@@ -142,16 +180,28 @@ TEST(LiveSource, ReadsNoFileTwice) {
   }
 }
 
-TEST(LiveSource, AsksForFrequenciesOncePerKindOfCore) {
+TEST(LiveSource, ReadsOfFrequenciesOneFileForEachPolicy) {
   const auto frequencies = [](const char* name) {
     MemoryFileSystem files = fixture(name);
-    const std::vector<std::string> read = filesRead(files);
-    return std::ranges::count_if(read, [](const std::string& file) { return file.find("freq") != std::string::npos; });
+    std::vector<std::string> read = filesRead(files);
+    std::erase_if(read, [](const std::string& file) { return file.find("freq") == std::string::npos; });
+    return read;
   };
 
-  EXPECT_EQ(frequencies("dual-socket-server"), 2) << "two packages";
-  EXPECT_EQ(frequencies("hybrid-laptop"), 2) << "two kinds";
-  EXPECT_EQ(frequencies("arm64-board"), 3) << "two kinds, and the current speed of one CPU";
+  EXPECT_EQ(frequencies("favoured-cores"),
+            (std::vector<std::string>{
+                cpuDirectory + "cpufreq/policy0/cpuinfo_max_freq", cpuDirectory + "cpufreq/policy1/cpuinfo_max_freq",
+                cpuDirectory + "cpufreq/policy2/cpuinfo_max_freq", cpuDirectory + "cpufreq/policy3/cpuinfo_max_freq"}));
+  EXPECT_EQ(frequencies("virtual-machine"), (std::vector<std::string>{cpuDirectory + "cpu0/cpufreq/cpuinfo_max_freq",
+                                                                      cpuDirectory + "cpu2/cpufreq/cpuinfo_max_freq"}))
+      << "one of each processor, as there is none";
+}
+
+TEST(LiveSource, MeasuresTheFrequencyOfOneCpu) {
+  MemoryFileSystem files = fixture("arm64-board");
+  const std::vector<std::string> read = filesRead(files);
+  EXPECT_EQ(std::ranges::count_if(read, [](const std::string& file) { return file.ends_with("/scaling_cur_freq"); }),
+            1);
 }
 
 TEST(LiveSource, ReadsOfAThreadOnlyHowItsCachesAreShared) {
