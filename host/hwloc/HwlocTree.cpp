@@ -1,6 +1,5 @@
 #include <algorithm>
 #include <array>
-#include <limits>
 #include <stdexcept>
 
 #include "host/hwloc/HwlocConversion.h"
@@ -112,6 +111,7 @@ class Writer {
     tree_.system().description(model.empty() ? "Computer system" : model);
     addText(PropSystemModel, model);
     addText(PropSystemManufacturer, firmwareRemark(machine_, {"DMISysVendor"}));
+    addText(PropSystemName, infoOf(machine_, "HostName"));
   }
 
   void addProcessor(const HwlocPackage& entry, const std::string& path) {
@@ -185,17 +185,18 @@ class Writer {
     tree_.text(PropCacheName, cacheName(cache));
     tree_.number(PropCacheType, static_cast<unsigned int>(*cache.contents));
     addNumber(PropCacheAssociativity, associativityCode(cache));
-    addNumber(PropCacheBlockSize, cache.lineSize);
-    if (entry.bytes == 0 || !cache.lineSize) {
+    if (entry.bytes == 0) {
+      addNumber(PropCacheBlockSize, cache.lineSize);
       return;
     }
-    const std::uint64_t blocks = entry.bytes / *cache.lineSize;
-    if (blocks > std::numeric_limits<unsigned int>::max()) {
-      throw std::invalid_argument("the cache " + path + " has " + std::to_string(blocks) +
-                                  " lines, more than an inventory can tell");
+    const std::optional<CacheBlocks> blocks = cacheBlocks(entry.bytes, cache.lineSize);
+    if (!blocks) {
+      throw std::invalid_argument("the cache " + path + " has " + std::to_string(entry.bytes) +
+                                  " bytes, more than an inventory can hold");
     }
-    tree_.number(PropCacheNumberOfBlocks, static_cast<unsigned int>(blocks));
-    tree_.number(PropCacheConsumableBlocks, static_cast<unsigned int>(blocks));
+    tree_.number(PropCacheBlockSize, blocks->size);
+    tree_.number(PropCacheNumberOfBlocks, blocks->count);
+    tree_.number(PropCacheConsumableBlocks, blocks->count);
   }
 
   unsigned int statusOf(const CpuSet& cpus) const {

@@ -1,8 +1,15 @@
 #include "platform/instrumentation/ProcessTree.h"
 
+#include <tarn/Common.h>
+#include <unistd.h>
+
+#include <array>
+#include <climits>
 #include <exception>
 #include <mutex>
+#include <span>
 #include <string>
+#include <string_view>
 #include <utility>
 
 #include "platform/common/Configuration.h"
@@ -10,14 +17,27 @@
 #include "platform/common/Report.h"
 #include "platform/cvlog/Level.h"
 #include "platform/instrumentation/Source.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 
 namespace Tarn::Inventory {
 
 namespace {
 
-// Both are ready before any code of the library runs. The tree goes when the library is unloaded.
+// All are ready before any code of the library runs. The tree goes when the library is unloaded.
 constinit std::mutex mutex;
 constinit std::shared_ptr<const Tree> current;
+constinit bool currentIsLive = false;
+
+constexpr std::string_view liveSource = "live";
+
+std::string hostName() {
+  std::array<char, HOST_NAME_MAX + 1> name{};
+  if (gethostname(name.data(), name.size()) != 0) {
+    return {};
+  }
+  name.back() = '\0';  // a name that was cut need not be terminated
+  return name.data();
+}
 
 // Whoever asks for the tree may say no more than that it failed. Every request asks again, so what is
 // known is not said twice.
@@ -28,9 +48,12 @@ void reportOnce(const std::string& text) {
   }
 }
 
-Tree loadChosen() {
+// The caller holds the mutex.
+void loadChosen() {
   try {
-    return loadInventory(chosenSource());
+    const std::string source = chosenSource();
+    current = std::make_shared<const Tree>(loadInventory(source));
+    currentIsLive = source == liveSource;
   } catch (const std::exception& error) {
     reportOnce(error.what());
     throw;
@@ -44,13 +67,13 @@ std::string chosenSource() {
     return *std::move(source);
   }
   const Common::Setting* setting = Common::configuration().find("inventory");
-  return setting != nullptr ? setting->value : "live";
+  return setting != nullptr ? setting->value : std::string(liveSource);
 }
 
 std::shared_ptr<const Tree> processTree() {
   const std::scoped_lock lock(mutex);
   if (!current) {
-    current = std::make_shared<const Tree>(loadChosen());
+    loadChosen();
   }
   return current;
 }
@@ -58,6 +81,29 @@ std::shared_ptr<const Tree> processTree() {
 void setProcessTree(std::shared_ptr<const Tree> tree) {
   const std::scoped_lock lock(mutex);
   current.swap(tree);
+  currentIsLive = false;
 }
 
 }  // namespace Tarn::Inventory
+
+namespace Tarn {
+
+std::string getSystemName() {
+  using namespace Inventory;
+  const std::scoped_lock lock(mutex);
+  if (current ? currentIsLive : chosenSource() == liveSource) {
+    return hostName();
+  }
+  try {
+    if (!current) {
+      loadChosen();
+    }
+  } catch (const std::exception&) {
+    return unnamedSystem;  // the reason is reported
+  }
+  const std::span<const NodeIndex> systems = current->ofType(NodeLexicon::NodeSystem);
+  const std::string* name = systems.empty() ? nullptr : current->text(current->node(systems.front()), PropSystemName);
+  return name == nullptr || name->empty() ? unnamedSystem : *name;
+}
+
+}  // namespace Tarn

@@ -22,6 +22,9 @@ void setProcessTree(std::shared_ptr<const Tree> tree);
 /// configuration's, else "live".
 std::string chosenSource();
 
+/// What getSystemName returns for a tree of another machine that has no name.
+inline constexpr const char* unnamedSystem = "unnamed";
+
 }  // namespace Tarn::Inventory
 
 #endif

@@ -77,6 +77,7 @@ constexpr std::array wordings = {
     Wording{"Stepping", "stepping", false, plain},
     Wording{"SystemManufacturer", "manufacturer", false, plain},
     Wording{"SystemModel", "model", false, plain},
+    Wording{"SystemName", "name", false, plain},
     Wording{"UpgradeMethod", "upgrade method", false, plain},
 };
 

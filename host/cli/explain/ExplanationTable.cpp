@@ -60,7 +60,8 @@ constexpr std::string_view cacheLink = "HALDA_CPUAssociatedCacheMemory";
 
 constexpr std::string_view className = "the name of the class";
 constexpr std::string_view systemClass = "the class of the computer system";
-constexpr std::string_view hostName = "the host's name";
+constexpr std::string_view machineName = "the machine's name";
+constexpr std::string_view unnamed = "unnamed where another machine's inventory has no name";
 constexpr std::string_view message = "a text of the message catalogue, in the configured language";
 constexpr std::string_view notApplicable = "always 12: nobody can request a state";
 constexpr std::string_view pathWords = "the part's path in the inventory";
@@ -72,10 +73,10 @@ constexpr std::string_view leftOutIfZero = "left out where it is 0";
 
 constexpr PropertySource sources[] = {
     {system, "CreationClassName", "", Constant, className, ""},
-    {system, "Name", "", Constant, hostName, ""},
+    {system, "Name", "SystemName", Copied, "", unnamed},
     {system, "Caption", "", Constant, message, ""},
     {system, "Description", "", Constant, message, ""},
-    {system, "ElementName", "", Constant, hostName, ""},
+    {system, "ElementName", "SystemName", Copied, "", unnamed},
     {system, "Model", "SystemModel", Copied, "", absent},
     {system, "Manufacturer", "SystemManufacturer", Copied, "", absent},
     {system, "EnabledState", "status", Coded, "", "", &systemEnabled},
@@ -86,7 +87,7 @@ constexpr PropertySource sources[] = {
     {processor, "CreationClassName", "", Constant, className, ""},
     {processor, "DeviceID", "path", Copied, pathWords, ""},
     {processor, "SystemCreationClassName", "", Constant, systemClass, ""},
-    {processor, "SystemName", "", Constant, hostName, ""},
+    {processor, "SystemName", "", Constant, machineName, ""},
     {processor, "Caption", "", Constant, message, ""},
     {processor, "Description", "", Constant, message, ""},
     {processor, "ElementName", "description", Copied, "", empty},
@@ -124,7 +125,7 @@ constexpr PropertySource sources[] = {
     {cache, "CreationClassName", "", Constant, className, ""},
     {cache, "DeviceID", "path", Copied, pathWords, ""},
     {cache, "SystemCreationClassName", "", Constant, systemClass, ""},
-    {cache, "SystemName", "", Constant, hostName, ""},
+    {cache, "SystemName", "", Constant, machineName, ""},
     {cache, "Caption", "", Constant, message, ""},
     {cache, "Description", "", Constant, message, ""},
     {cache, "ElementName", "description", Copied, "", empty},

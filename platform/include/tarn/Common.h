@@ -10,7 +10,8 @@ namespace Tarn {
 /// The text without the blanks (the space character only) at both ends.
 std::string stripSpaces(std::string text);
 
-/// This machine's host name as the kernel has it, the empty text where there is none; no resolver is asked.
+/// The name of the machine that the inventory describes: for this machine its host name as the kernel has it, the
+/// empty text if there is none; no resolver is asked.
 std::string getSystemName();
 
 /// The text in UTF-8. A code unit that is no character becomes U+FFFD.

@@ -104,6 +104,15 @@ Found systemModel(Machine& machine, const Facts* firmware) {
   return hypervisorModel(machine);
 }
 
+// Until a machine is given a name the kernel has "(none)".
+Found systemName(Machine& machine) {
+  Found name = inFile(machine, "proc/sys/kernel/hostname");
+  if (name.text == "(none)") {
+    name.text.clear();
+  }
+  return name;
+}
+
 Origin originOf(const Machine& machine, const char* file, const char* rule) {
   constexpr std::array<std::string_view, 1> fields = {"flags/hypervisor"};
   return file != nullptr ? machine.originIn(file, rule)
@@ -125,6 +134,7 @@ Facts readSystemFacts(Machine& machine, const Facts* firmware) {
   Facts facts;
   add(facts, PropSystemModel, machine, systemModel(machine, firmware));
   add(facts, PropSystemManufacturer, machine, givenByFirmware(machine, "sys/class/dmi/id/sys_vendor"));
+  add(facts, PropSystemName, machine, systemName(machine));
   return facts;
 }
 

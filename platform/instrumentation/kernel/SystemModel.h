@@ -8,7 +8,7 @@
 
 namespace Tarn::Inventory {
 
-/// What the kernel says of the computer: its model (the firmware's product name, else the device tree's
+/// What the kernel says of the computer: its name, its model (the firmware's product name, else the device tree's
 /// model) and its maker. Where there is no model, and `firmware`, which the tables told, has none either:
 /// "Virtual Machine", if the kernel says that it runs under a hypervisor. `firmware` is nullptr where
 /// there are no tables. The origins look into the machine, which must outlive them.

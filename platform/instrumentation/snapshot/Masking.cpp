@@ -32,6 +32,7 @@ static_assert(std::ranges::is_sorted(dmiOfTheKind));
 constexpr std::array identifierFiles = {
     std::string_view("/ppin"),  // beside a processor's topology: its inventory number
     std::string_view("/serial-number"),
+    std::string_view("proc/sys/kernel/hostname"),
     std::string_view("sys/hypervisor/uuid"),
 };
 

@@ -39,6 +39,7 @@ constexpr std::array properties = {
     PropertyEntry{PropSerialNumber, NodeProcessor, Text, "SerialNumber"},
     PropertyEntry{PropAssetTag, NodeProcessor, Text, "AssetTag"},
     PropertyEntry{PropPartNumber, NodeProcessor, Text, "PartNumber"},
+    PropertyEntry{PropSystemName, NodeSystem, Text, "SystemName"},
 };
 static_assert(std::ranges::is_sorted(properties, {}, &PropertyEntry::id));
 

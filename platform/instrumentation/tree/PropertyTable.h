@@ -14,6 +14,9 @@ enum class PropertyKind { Number, Text, List };
 /// inventory shares with them does not list it; the provider of the computer system does.
 inline constexpr auto PropSystemManufacturer = static_cast<NodeLexicon::Properties>(400);
 
+/// The name of the machine, a text.
+inline constexpr auto PropSystemName = static_cast<NodeLexicon::Properties>(405);
+
 /// What only the firmware knows of a processor's socket and of what is in it, texts. The processor classes
 /// have no use for them either.
 inline constexpr auto PropSocket = static_cast<NodeLexicon::Properties>(401);  ///< the label on the board

@@ -1,11 +1,9 @@
 #include "tests/host/cli/Expected.h"
 
-#include <tarn/Common.h>
-
 namespace Corvcim::Testing {
 
 std::string host() {
-  return Tarn::getSystemName();
+  return "unnamed";
 }
 
 std::string processorPath(const std::string& identifier) {

@@ -9,7 +9,7 @@ namespace Corvcim::Testing {
 
 // What the built program is expected to print.
 
-/// The name of this machine, as the libraries tell it.
+/// What the libraries call a machine whose inventory has no name.
 std::string host();
 
 /// The object path of a part, by its path in the inventory.

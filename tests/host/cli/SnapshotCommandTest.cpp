@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
+#include <tarn/Common.h>
 
 #include <fstream>
 #include <iterator>
@@ -45,8 +46,24 @@ TEST_F(SnapshotCommand, OfThisMachineReadsBack) {
   const std::string file = directory_.file("snapshot");
 
   EXPECT_EQ(corvcim({"snapshot", file}), (Finished{0, "", ""}));
-  EXPECT_EQ(corvcim({"diff", "--ignore", "CurrentClockSpeed", "snapshot:" + file, "live"}),
+  EXPECT_EQ(corvcim({"diff", "--ignore", "CurrentClockSpeed,SystemName", "snapshot:" + file, "live"}),
             (Finished{0, "No differences.\n", ""}));
+}
+
+TEST_F(SnapshotCommand, OfThisMachineDoesNotHaveItsName) {
+  const std::string name = "\"" + Tarn::getSystemName() + "\"";
+  const std::string file = directory_.file("snapshot");
+  EXPECT_NE(corvcim({"-o", "json", "ei", "HALDA_CPUProcessor"}).output.find(name), std::string::npos);
+
+  EXPECT_EQ(corvcim({"snapshot", file}), (Finished{0, "", ""}));
+
+  EXPECT_EQ(contentsOf(file).find("hostname: " + Tarn::getSystemName() + "\n"), std::string::npos);
+  for (const std::vector<std::string>& verb :
+       {std::vector<std::string>{"-o", "json", "ei", "HALDA_CPUProcessor"}, {"-o", "json", "inventory"}}) {
+    std::vector<std::string> arguments = {"-i", "snapshot:" + file};
+    arguments.insert(arguments.end(), verb.begin(), verb.end());
+    EXPECT_EQ(corvcim(arguments).output.find(name), std::string::npos);
+  }
 }
 
 TEST_F(SnapshotCommand, MasksIdentifiersUnlessAskedNotTo) {

@@ -133,6 +133,13 @@ TEST(HwlocXml, TheMachineIsNamedByItsFirmware) {
   EXPECT_EQ(nodeAt(tree, "system").description, "PowerBox 300");
 }
 
+TEST(HwlocXml, TheMachineHasTheNameOfItsHost) {
+  const auto nameIn = [](const Tree& tree) { return textAt(tree, "system", Tarn::Inventory::PropSystemName); };
+
+  EXPECT_EQ(nameIn(treeOf(oneCore({{"HostName", "node17.example"}}, {}))), "node17.example");
+  EXPECT_EQ(nameIn(treeOf(oneCore({}, {}))), "(none)") << "not that of this host";
+}
+
 TEST(HwlocXml, WhatFirmwareVendorsLeaveInTheirFieldsIsNoName) {
   const Tree tree =
       treeOf(oneCore({{"DMIProductName", "To Be Filled By O.E.M."}, {"DMISysVendor", "Default string"}}, {}));
@@ -172,6 +179,19 @@ TEST(HwlocXml, CachesHaveSizeLineAndWays) {
   EXPECT_EQ(numberAt(tree, "P1.L1i.8", PropCacheBlockSize), std::nullopt);
   EXPECT_EQ(numberAt(tree, "P1.L1i.8", PropCacheNumberOfBlocks), std::nullopt);
   EXPECT_EQ(nodeAt(tree, "P1.L1i.8").cpus.toList(), "0-1");
+}
+
+TEST(HwlocXml, ACacheWithoutALineSizeIsCountedInBytes) {
+  HwlocXml xml("0x1");
+  xml.begin("Package", "0", "0x1")
+      .cache("L3Cache", "0", "0x1",
+             R"(cache_size="10485760" depth="3" cache_linesize="0" cache_associativity="0" cache_type="0")");
+  xml.plainCore(0).end().end().end();
+
+  const Tree tree = treeOf(xml);
+
+  EXPECT_EQ(numberAt(tree, "P0.L3.0", PropCacheBlockSize), 1U);
+  EXPECT_EQ(numberAt(tree, "P0.L3.0", PropCacheNumberOfBlocks), 10485760U);
 }
 
 TEST(HwlocXml, CoresAreNumberedByDie) {

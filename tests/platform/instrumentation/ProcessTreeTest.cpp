@@ -1,6 +1,8 @@
 #include "platform/instrumentation/ProcessTree.h"
 
 #include <gtest/gtest.h>
+#include <sys/utsname.h>
+#include <tarn/Common.h>
 #include <tarn/Instrumentation.h>
 
 #include <algorithm>
@@ -10,6 +12,7 @@
 
 #include "platform/instrumentation/Source.h"
 #include "platform/instrumentation/tree/Error.h"
+#include "platform/instrumentation/tree/PropertyTable.h"
 #include "platform/instrumentation/tree/TreeBuilder.h"
 #include "tests/platform/instrumentation/Scratch.h"
 
@@ -105,6 +108,39 @@ TEST_F(ProcessTree, IsReplacedAndLoadedAnew) {
 
   setProcessTree(nullptr);
   EXPECT_EQ(*processTree(), loadInventory("json:" + fixtures + "container/tree.json"));
+}
+
+std::string nameOfThisHost() {
+  utsname kernel{};
+  return ::uname(&kernel) == 0 ? kernel.nodename : "";
+}
+
+TEST_F(ProcessTree, SystemNameOfThisMachineIsTheKernels) {
+  EXPECT_EQ(getSystemName(), nameOfThisHost());
+  processTree();
+  EXPECT_EQ(getSystemName(), nameOfThisHost());
+}
+
+TEST_F(ProcessTree, SystemNameOfAnotherMachineIsTheInventorys) {
+  ::setenv("CORVANE_INVENTORY", ("root:" + fixtures + "named-machine/root.txt").c_str(), 1);
+  EXPECT_EQ(getSystemName(), "node17.example");
+
+  setProcessTree(nullptr);
+  ::setenv("CORVANE_INVENTORY", ("json:" + fixtures + "named-machine/tree.json").c_str(), 1);
+  EXPECT_EQ(getSystemName(), "node17.example");
+}
+
+TEST_F(ProcessTree, SystemNameOfAnotherMachineWithoutANameIsNotThisHosts) {
+  ::setenv("CORVANE_INVENTORY", ("json:" + fixtures + "container/tree.json").c_str(), 1);
+  EXPECT_EQ(getSystemName(), "unnamed");
+
+  setProcessTree(std::make_shared<const Tree>(TreeBuilder().system().text(PropSystemName, "").build()));
+  EXPECT_EQ(getSystemName(), "unnamed");
+}
+
+TEST_F(ProcessTree, SystemNameOfAnInventoryThatCannotBeReadIsNotThisHosts) {
+  ::setenv("CORVANE_INVENTORY", "json:/nothing/here", 1);
+  EXPECT_EQ(getSystemName(), "unnamed");
 }
 
 TEST_F(ProcessTree, FirstCursorsOfManyThreadsShareOneTree) {

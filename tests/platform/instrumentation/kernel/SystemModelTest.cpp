@@ -131,6 +131,16 @@ TEST(SystemModel, WithStrangeBytesIsValidUtf8) {
   EXPECT_EQ(modelOf(machine().file(productName, "Box\xFF\n")), "Box\xEF\xBF\xBD");
 }
 
+TEST(SystemName, IsTheKernelsNameOfTheHost) {
+  KernelFiles files;
+  files.cpus("0").cpu(0, {.package = 0, .core = 0, .siblings = "0"});
+  EXPECT_EQ(textAt(files.tree(), "system", PropSystemName), std::nullopt);
+  EXPECT_EQ(textAt(files.file("proc/sys/kernel/hostname", "node17.example\n").tree(), "system", PropSystemName),
+            "node17.example");
+  EXPECT_EQ(textAt(files.file("proc/sys/kernel/hostname", "(none)\n").tree(), "system", PropSystemName), std::nullopt)
+      << "the kernel's word for no name";
+}
+
 TEST(SystemManufacturer, IsTheFirmwaresVendor) {
   const Tree tree = machine().file(productName, "Box\n").file("sys/class/dmi/id/sys_vendor", "Boxes Inc.\n").tree();
 

@@ -243,6 +243,14 @@ TEST(Masking, TakesTheMachinesIdentificationFromTheBlocksOfCpuInfo) {
             "cpu number      : 0\nversion         : 00\nidentification  : XXXXXX\nmachine         : 8561\n");
 }
 
+TEST(Masking, TakesTheNameOfTheMachine) {
+  MemoryFileSystem::Files files;
+  files["proc/sys/kernel/hostname"] = {"node17.example\n"};
+
+  EXPECT_THAT(maskIdentifiers(files), ElementsAre("proc/sys/kernel/hostname"));
+  EXPECT_EQ(files["proc/sys/kernel/hostname"].contents, "XXXXXXXXXXXXXX\n");
+}
+
 TEST(Masking, LeavesCpuInfoWithoutIdentifiers) {
   MemoryFileSystem::Files files;
   files["proc/cpuinfo"] = {"processor\t: 0\nflags\t: fpu Serial\nSerial\t\t: 0000000000000000\n"};

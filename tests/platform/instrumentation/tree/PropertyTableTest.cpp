@@ -44,6 +44,7 @@ TEST(PropertyTable, HoldsEveryPropertyOfTheLexiconAndWhatOnlyTheInventoryKnows) 
       {402, NodeProcessor, Text, "SerialNumber"},
       {403, NodeProcessor, Text, "AssetTag"},
       {404, NodeProcessor, Text, "PartNumber"},
+      {405, NodeSystem, Text, "SystemName"},
   };
 
   ASSERT_EQ(propertyTable().size(), std::size(expected));
