@@ -22,6 +22,7 @@ TEST(HwlocCommand, ADescribedMachineAnswersThroughTheLibrary) {
 
   EXPECT_EQ(corvcim({"-i", source}).output,
             "unnamed\n"
+            "2 processors: 4 cores, all enabled, 8 threads\n"
             "\n"
             "2 equal processors: P0, P1\n"
             "  Model   not known\n"
