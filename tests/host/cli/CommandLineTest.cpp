@@ -1,7 +1,6 @@
 // The built program from outside: arguments in, both streams and the exit status out. ErrorsTest has what fails.
 
 #include <gtest/gtest.h>
-#include <tarn/Common.h>
 
 #include <algorithm>
 #include <cctype>
@@ -433,7 +432,7 @@ TEST(Corvcim, LanguageIsForPeopleAlone) {
             "instance of HALDA_ComputerSystem {\n"
             "  CreationClassName = \"HALDA_ComputerSystem\";\n"
             "  Name = \"" +
-                Tarn::getSystemName() +
+                thisHost() +
                 "\";\n"
                 "  Caption = \"Computer System\";\n"
                 "};\n");

@@ -1,9 +1,15 @@
 #include "tests/host/cli/Expected.h"
 
+#include <tarn/Common.h>
+
 namespace Corvcim::Testing {
 
 std::string host() {
   return "unnamed";
+}
+
+std::string thisHost() {
+  return Tarn::getSystemName();
 }
 
 std::string processorPath(const std::string& identifier) {
@@ -20,8 +26,8 @@ std::string corePath(const std::string& identifier) {
   return "root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"" + identifier + '"';
 }
 
-std::string systemPath() {
-  return "root/cimv2:HALDA_ComputerSystem.CreationClassName=\"HALDA_ComputerSystem\",Name=\"" + host() + '"';
+std::string systemPath(const std::string& name) {
+  return "root/cimv2:HALDA_ComputerSystem.CreationClassName=\"HALDA_ComputerSystem\",Name=\"" + name + '"';
 }
 
 Finished success(const std::string& output) {

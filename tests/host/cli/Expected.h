@@ -12,13 +12,16 @@ namespace Corvcim::Testing {
 /// What the libraries call a machine whose inventory has no name.
 std::string host();
 
+/// The name of this machine, as the libraries have it for the live inventory.
+std::string thisHost();
+
 /// The object path of a part, by its path in the inventory.
 std::string processorPath(const std::string& identifier);
 std::string cachePath(const std::string& identifier);
 std::string corePath(const std::string& identifier);
 
-/// The object path of the computer system.
-std::string systemPath();
+/// The object path of the computer system with this name.
+std::string systemPath(const std::string& name = host());
 
 /// A run that printed the output, and nothing to standard error.
 Finished success(const std::string& output);

@@ -98,10 +98,10 @@ TEST(Refusal, WhatIsWrongInTheConfigurationIsRemarked) {
   const Directory directory;
   const std::string file = directory.write("corvane.conf", "lnguage = de\nlog.level = loud\nlanguage = fi\n");
 
-  EXPECT_EQ(shell("CORVANE_CONFIG=" + file + " \"$corvcim\" gi '" + systemPath() + "' Caption"),
+  EXPECT_EQ(shell("CORVANE_CONFIG=" + file + " \"$corvcim\" gi '" + systemPath(thisHost()) + "' Caption"),
             (Finished{0,
-                      systemPath() + "\n  CreationClassName  HALDA_ComputerSystem\n  Name               " + host() +
-                          "\n  Caption            Computer System\n",
+                      systemPath(thisHost()) + "\n  CreationClassName  HALDA_ComputerSystem\n  Name               " +
+                          thisHost() + "\n  Caption            Computer System\n",
                       "corvcim: " + file +
                           ":1: unknown key \"lnguage\"; the line is ignored (did you mean language?)\n"
                           "corvcim: " +
@@ -114,7 +114,7 @@ TEST(Refusal, WhatIsWrongInTheConfigurationIsRemarked) {
 TEST(Refusal, LanguagesOfTheEnvironmentWithoutTextsAreRemarked) {
   EXPECT_EQ(
       shell("CORVANE_LANGUAGE=C.UTF-8 \"$corvcim\" ein HALDA_ComputerSystem"),
-      (Finished{0, systemPath() + '\n',
+      (Finished{0, systemPath(thisHost()) + '\n',
                 "corvcim: CORVANE_LANGUAGE: there are no texts in \"C.UTF-8\"; English ones are used instead\n"}));
 }
 

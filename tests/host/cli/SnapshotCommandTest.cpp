@@ -3,12 +3,12 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
-#include <tarn/Common.h>
 
 #include <fstream>
 #include <iterator>
 #include <string>
 
+#include "tests/host/cli/Expected.h"
 #include "tests/host/cli/Program.h"
 
 namespace Corvcim::Testing {
@@ -51,13 +51,13 @@ TEST_F(SnapshotCommand, OfThisMachineReadsBack) {
 }
 
 TEST_F(SnapshotCommand, OfThisMachineDoesNotHaveItsName) {
-  const std::string name = "\"" + Tarn::getSystemName() + "\"";
+  const std::string name = "\"" + thisHost() + "\"";
   const std::string file = directory_.file("snapshot");
   EXPECT_NE(corvcim({"-o", "json", "ei", "HALDA_CPUProcessor"}).output.find(name), std::string::npos);
 
   EXPECT_EQ(corvcim({"snapshot", file}), (Finished{0, "", ""}));
 
-  EXPECT_EQ(contentsOf(file).find("hostname: " + Tarn::getSystemName() + "\n"), std::string::npos);
+  EXPECT_EQ(contentsOf(file).find("hostname: " + thisHost() + "\n"), std::string::npos);
   for (const std::vector<std::string>& verb :
        {std::vector<std::string>{"-o", "json", "ei", "HALDA_CPUProcessor"}, {"-o", "json", "inventory"}}) {
     std::vector<std::string> arguments = {"-i", "snapshot:" + file};
