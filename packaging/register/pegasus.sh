@@ -53,12 +53,13 @@ pegasus_check_tools() {
     pegasus_tool "$tool" >/dev/null || fail "OpenPegasus is there by half: no $tool in $root$pegasus_binaries; $advice"
   done
   need_writable "$pegasus_state"
+  # The tools talk to whatever server runs.
+  ! pegasus_runs || [ "$("$root$(pegasus_tool cimprovider)" -l | tr -d ' ' | sort)" = "$(pegasus_all_modules | sort)" ] ||
+    fail "the OpenPegasus that runs does not serve $root$pegasus_repository; stop it, start this one's cimserver, then run this again"
   [ "$1" = install ] || pegasus_need_server
 }
 
-pegasus_runs() {
-  pegasus_provider_tool=$(pegasus_tool cimprovider) && "$root$pegasus_provider_tool" -l >/dev/null 2>&1
-}
+pegasus_runs() { "$root$(pegasus_tool cimprovider)" -l >/dev/null 2>&1; }
 
 # Whether the repository has the class's file, which is named CLASS.PARENT.
 pegasus_has_class() {
@@ -76,13 +77,14 @@ pegasus_modules() {
 }
 
 # The index of registered instances has a line "0 hash offset size path" for each; "1 ..." is a deleted one.
-pegasus_has_module() {
-  grep -qs "^0 .*\.Name=\"$1\"" "$root$pegasus_repository/root#PG_InterOp/instances/PG_ProviderModule.idx"
+pegasus_all_modules() {
+  file=$root$pegasus_repository/root#PG_InterOp/instances/PG_ProviderModule.idx
+  [ ! -f "$file" ] || sed -n 's/^0 .*\.Name="\(.*\)"$/\1/p' "$file"
 }
 
 pegasus_registered_modules() {
   for module in $(pegasus_modules "$@"); do
-    ! pegasus_has_module "$module" || say "$module"
+    ! is_listed "$module" $(pegasus_all_modules) || say "$module"
   done
 }
 
@@ -170,7 +172,7 @@ pegasus_remember() {
 
 pegasus_lacks_module() {
   for module in $(pegasus_modules "$1"); do
-    pegasus_has_module "$module" || { say "module $module is not registered" && return 0; }
+    is_listed "$module" $(pegasus_all_modules) || { say "module $module is not registered" && return 0; }
   done
   return 1
 }
