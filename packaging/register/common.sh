@@ -1,7 +1,7 @@
 # What the brokers' parts of corvcpu-register share. Sourced, not run.
 #
 # Paths in variables are those inside $root; "$root$path" is the file. What is registered is read from
-# the broker's own files, so that a registration made by hand counts, and one taken away by hand does not.
+# the broker's own files, so that registrations made or removed by hand are recognized.
 # Lists are words: no path or name in them has blanks.
 # shellcheck shell=sh disable=SC2034,SC2046,SC2086,SC2154
 
@@ -167,7 +167,7 @@ check_product() {
   done
 }
 
-# look KIND: sets $owner, what other agent has HALDA_ComputerSystem, and $units, what is registered beside it.
+# look KIND: sets $owner, the other agent that provides HALDA_ComputerSystem, if any, and $units, what to register.
 look() {
   units='corvane-computersystem corvane-cpu'
   ! owner=$("$1_owner" "$system_class") || units=corvane-cpu

@@ -146,7 +146,7 @@ pegasus_need_server() {
   pegasus_runs || fail "OpenPegasus does not run, and only the server can take registrations back; start cimserver, then run this again"
 }
 
-# The record has the checksum of each file that was compiled: what is equal is not compiled again.
+# The record has the checksum of each compiled file, so that no file is compiled twice.
 pegasus_mark() { say "$(cksum <"$root$1") $1"; }
 pegasus_is_compiled() { grep -qsxF "$(pegasus_mark "$1")" "$root$pegasus_record"; }
 
@@ -216,7 +216,7 @@ pegasus_remove_modules() {
   done
 }
 
-# The registration goes first: by it an interrupted installation is recognized.
+# The registration is compiled first: it shows that an interrupted installation is ours.
 pegasus_install() {
   link_libraries "$pegasus_providers"
   for unit in $units; do

@@ -51,7 +51,7 @@ same_texts() { [ "$(without_comments "$1")" = "$(without_comments "$2")" ]; }
 
 sfcb_all_files() { sfcb_files corvane-computersystem corvane-cpu; }
 
-# The staged files of this product, of whatever version and by whomever they were staged.
+# The staged files of this product, of any version, also those that were staged by hand.
 sfcb_staged() {
   for file in $(sfcb_all_files); do
     ! grep -qsE '^class HALDA_|location:[[:blank:]]*corvc' "$root$sfcb_stage/$file" || say "$file"
@@ -114,7 +114,7 @@ sfcb_problem() {
   for file in $(sfcb_files "$@"); do
     [ -f "$root$sfcb_stage/$file" ] || { say "$sfcb_stage/$file is missing" && return; }
     same_texts "$root$sfcb_stage/$file" "$root$(sfcb_source "$file")" ||
-      { say "$sfcb_stage/$file is that of another version" && return; }
+      { say "$sfcb_stage/$file is from another version" && return; }
   done
   for unit; do
     for class in $(classes_of "$data/schema/$unit.mof"); do
@@ -141,8 +141,8 @@ quietly() {
   "$@"
 }
 
-# sfcbrepos leaves an empty repository if it fails. So it works on copies, which replace the repository
-# only if it succeeds; the staging directory is the last to change.
+# sfcbrepos leaves an empty repository if it fails. It therefore works on copies, which replace the repository
+# only after success. The staging directory changes last.
 sfcb_rebuild() {
   work=$root$sfcb_registration/corvane.new
   rm -rf "$work"
@@ -170,7 +170,7 @@ sfcb_change() {
   sfcb_restage step "$root$sfcb_stage"
 }
 
-sfcb_say_restart() { $dry_run || say "sfcb: restart sfcbd, which still works by the old registration"; }
+sfcb_say_restart() { $dry_run || say "sfcb: restart sfcbd; it still uses the old registration"; }
 
 sfcb_install() {
   [ -n "$(sfcb_problem $units)" ] || return 0

@@ -19,7 +19,7 @@ remove $mofs/corvane-cpu.mof
 remove $regs/corvane-cpu.reg
 remove /usr/lib/sfcb/libcorvcpuprofileprovider.so
 remove /usr/lib/sfcb/libcorvcomputersystemprovider.so"
-sfcb_restart="sfcb: restart sfcbd, which still works by the old registration"
+sfcb_restart="sfcb: restart sfcbd; it still uses the old registration"
 sfcb_registered="sfcb: registered, with HALDA_ComputerSystem"
 sfcb_failure="error in /var/lib/sfcb/registration/corvane.new/stage/mofs/indication.mof line 10 near class: syntax error
 Failed compiling the MOF files.
@@ -222,7 +222,7 @@ sfcb_upgrade_and_downgrade_of_the_package_register_again() {
   register install >/dev/null
   cp "$tree$share/schema/corvane-cpu.mof" "$scratch/older.mof"
   sed -i 's/A processor package/A newer processor package/' "$tree$share/schema/corvane-cpu.mof"
-  expect_result 1 "sfcb: incomplete, $mofs/corvane-cpu.mof is that of another version; run corvcpu-register install" status
+  expect_result 1 "sfcb: incomplete, $mofs/corvane-cpu.mof is from another version; run corvcpu-register install" status
   expect_result 0 "$sfcb_copies
 $sfcb_restart
 $sfcb_registered" update
