@@ -78,7 +78,9 @@ class CVMessageBuffer {
     if (buffer.stream_ != nullptr) {
       buffer.resetStream();
     }
-    return std::exchange(buffer.text_, std::string());
+    std::string text = std::move(buffer.text_);
+    buffer.text_.clear();
+    return text;
   }
 
   /// Appends an address as std::ostream prints a const void*.

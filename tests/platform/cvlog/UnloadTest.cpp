@@ -6,25 +6,15 @@
 #include <condition_variable>
 #include <cstdlib>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <mutex>
 #include <string>
 #include <thread>
 
+#include "tests/platform/cvlog/LogTest.h"
+
 namespace {
 
 using LogSomething = void (*)();
-
-std::string content(const std::string& path) {
-  std::ifstream file(path);
-  return {std::istreambuf_iterator<char>(file), {}};
-}
-
-std::ptrdiff_t openDescriptors() {
-  const std::filesystem::directory_iterator descriptors("/proc/self/fd");
-  return std::distance(begin(descriptors), end(descriptors));
-}
 
 class UnloadedLogger : public testing::Test {
  protected:
@@ -49,15 +39,15 @@ class UnloadedLogger : public testing::Test {
 };
 
 TEST_F(UnloadedLogger, IsGoneAndHasClosedItsFiles) {
-  const std::ptrdiff_t before = openDescriptors();
+  const std::ptrdiff_t before = countOpenDescriptors();
   for (int round = 0; round < 100; ++round) {
     void* module = load();
     logFrom(module);
     dlclose(module);
     ASSERT_FALSE(isMapped());
   }
-  EXPECT_EQ(openDescriptors(), before);
-  const std::string lines = content(file_);
+  EXPECT_EQ(countOpenDescriptors(), before);
+  const std::string lines = contentOf(file_);
   EXPECT_EQ(std::count(lines.begin(), lines.end(), '\n'), 200);
 }
 
