@@ -56,7 +56,8 @@ template <class Handle>
 bool forEachSystem(const Association& association, const SystemQuery& query, Handle handle,
                    unsigned int line = __builtin_LINE(), const char* function = __builtin_FUNCTION()) {
   const CMPIEnumeration* systems = upCall([&, caller = association.broker] {
-    return CBEnumInstances(caller, query.context, query.systemClass, nullptr, query.status);
+    // Not CBEnumInstances, whose macro form in the standard's headers does not compile.
+    return caller->bft->enumerateInstances(caller, query.context, query.systemClass, nullptr, query.status);
   });
   return detail::forEachAnswer(association, systems, *query.status, &CMPIValue::inst, handle, line, function);
 }
