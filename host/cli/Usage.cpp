@@ -1,5 +1,9 @@
 #include "host/cli/Usage.h"
 
+#include <algorithm>
+#include <utility>
+
+#include "host/cli/OptionTable.h"
 #include "host/cli/Text.h"
 
 namespace Corvcim {
@@ -13,35 +17,6 @@ constexpr std::string_view introduction =
     "\n"
     "Verbs:\n";
 
-constexpr std::string_view optionHelp =
-    "\n"
-    "Options:\n"
-    "  -i, --inventory SOURCE  live, root:DIR (a captured /sys and /proc), snapshot:FILE,\n"
-    "                          json:FILE, hwloc:FILE, or smbios:FILE (a dump of the\n"
-    "                          firmware's tables), alone or over another: smbios:FILE+live;\n"
-    "                          FILE without its kind, or - for standard input\n"
-    "  -o, --output FORMAT     text, table, csv, mof or json; for tree: text, json, svg or dot\n"
-    "      --columns PROP,...  the columns of a table or of csv, in this order\n"
-    "  -n, --namespace NS      namespace of classes and paths without one (root/cimv2)\n"
-    "  -l, --library FILE      the provider library\n"
-    "      --companion FILE    the library with HALDA_ComputerSystem\n"
-    "      --from DESCRIPTION  what inventory converts: hwloc:FILE (XML of lstopo) or\n"
-    "                          hwloc-synthetic:\"package:2 core:4 pu:2\"\n"
-    "      --ignore FIELD,...  what diff leaves out, such as CurrentClockSpeed\n"
-    "      --as-is             sends a request as it was typed, without a broker's checks\n"
-    "      --unmasked          keeps serial numbers and the like in a snapshot\n"
-    "      --language ID       language of captions and descriptions, such as de_AT\n"
-    "  -h, --help              this help; after a verb: the help of that verb\n"
-    "  -V, --version           the version\n";
-
-constexpr std::string_view associationHelp =
-    "\n"
-    "Options for ai, ain, ri and rin:\n"
-    "  -ac CLASS               association class\n"
-    "  -arc CLASS              class of the result\n"
-    "  -ar ROLE                role of PATH in the association\n"
-    "  -arr ROLE               role of the result (ai and ain)\n";
-
 constexpr std::string_view ending =
     "\n"
     "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong;\n"
@@ -54,6 +29,42 @@ constexpr std::string_view ending =
     "  corvcim -o csv ei HALDA_CPUProcessor DeviceID,Name,HealthState\n"
     "  corvcim tree -o svg > machine.svg\n";
 
+/// The text in lines of the help's width, all but the first indented.
+std::string wrapped(std::string_view text, std::size_t indent) {
+  constexpr std::size_t lastColumn = 80;
+  std::string lines;
+  std::size_t column = indent;
+  while (!text.empty()) {
+    const std::string_view word = text.substr(0, text.find(' '));
+    if (column != indent && column + 1 + word.size() > lastColumn) {
+      lines.append("\n").append(indent, ' ');
+      column = indent;
+    }
+    lines.append(column == indent ? "" : " ").append(word);
+    column += (column == indent ? 0 : 1) + word.size();
+    text.remove_prefix(std::min(text.size(), word.size() + 1));
+  }
+  return lines;
+}
+
+/// A heading and the options that it is about; nothing if there are none.
+template <class Belongs>
+std::string optionHelp(std::string_view heading, Belongs belongs) {
+  constexpr std::size_t summaryColumn = 26;
+  std::string text;
+  for (const OptionSyntax& option : optionTable()) {
+    if (!belongs(option)) {
+      continue;
+    }
+    std::string names = option.longName.empty() ? "  " : option.shortName.empty() ? "      " : "  ";
+    names.append(option.shortName).append(option.longName.empty() || option.shortName.empty() ? "" : ", ");
+    names.append(option.longName).append(option.value.empty() ? "" : " ").append(option.value);
+    text += padRight(std::move(names), summaryColumn) +
+            wrapped(std::string(option.summary).append(option.details), summaryColumn) + '\n';
+  }
+  return text.empty() ? text : '\n' + std::string(heading) + ":\n" + text;
+}
+
 }  // namespace
 
 std::string programHelp() {
@@ -61,8 +72,9 @@ std::string programHelp() {
   for (const VerbSyntax& verb : verbs()) {
     text += "  " + padRight(callOf(verb), 27) + std::string(verb.summary) + '\n';
   }
-  text += optionHelp;
-  text += associationHelp;
+  text += optionHelp("Options", [](const OptionSyntax& option) { return !option.longName.empty(); });
+  text +=
+      optionHelp("Options for ai, ain, ri and rin", [](const OptionSyntax& option) { return option.longName.empty(); });
   text += ending;
   return text;
 }
@@ -74,10 +86,8 @@ std::string verbHelp(const VerbSyntax& verb) {
   if (!verb.details.empty()) {
     text += '\n' + std::string(verb.details);
   }
-  if (verb.isAssociation) {
-    text += associationHelp;
-  }
-  return text;
+  return text + optionHelp("Options",
+                           [&](const OptionSyntax& option) { return option.scope.holds(verb) && !isGeneral(option); });
 }
 
 std::string versionText() {

@@ -165,13 +165,19 @@ TEST(Corvcim, EveryClassAnswersFromItsOwnNames) {
 TEST(Corvcim, ShowsVersionAndHelp) {
   EXPECT_EQ(corvcim({"--version"}), success("corvcim " CORVCIM_VERSION "\n"));
   EXPECT_TRUE(corvcim({"--help"}).output.starts_with("Usage: corvcim [OPTION...] [VERB [ARGUMENT...]]\n"));
-  EXPECT_EQ(corvcim({"ein", "--help"}), success("Usage: corvcim [OPTION...] ein CLASS\n"
-                                                "\n"
-                                                "Shows the paths of every instance.\n"
-                                                "Output: text, table, csv, mof or json.\n"
-                                                "\n"
-                                                "CLASS is a class name, with or without a namespace before it "
-                                                "(root/cimv2:HALDA_CPUMemory).\n"));
+  EXPECT_EQ(corvcim({"ein", "--help"}),
+            success("Usage: corvcim [OPTION...] ein CLASS\n"
+                    "\n"
+                    "Shows the paths of every instance.\n"
+                    "Output: text, table, csv, mof or json.\n"
+                    "\n"
+                    "CLASS is a class name, with or without a namespace before it "
+                    "(root/cimv2:HALDA_CPUMemory).\n"
+                    "\n"
+                    "Options:\n"
+                    "      --columns PROP,...  the columns of a table or of csv, in this order\n"
+                    "      --as-is             sends a request as it was typed, without a broker's\n"
+                    "                          checks\n"));
 }
 
 TEST(Corvcim, InventoryReadsBackAsTheSameTree) {

@@ -89,8 +89,9 @@ TEST(Options, ReferencesTakeTheAssociationClassByEitherOption) {
   EXPECT_EQ(parse({"rin", "-ac", "A", "X.K=1"}).association.associationClass, "A");
   EXPECT_EQ(complaint({"ri", "-ac", "A", "-arc", "B", "X.K=1"}),
             "ri: '-ac' and '-arc' both name the association class; usage: corvcim [OPTION...] ri PATH [PROPERTY,...]");
-  EXPECT_EQ(complaint({"rin", "-arr", "far", "X.K=1"}),
-            "rin: no option '-arr': a reference has no far end; usage: corvcim [OPTION...] rin PATH");
+  EXPECT_EQ(
+      complaint({"rin", "-arr", "far", "X.K=1"}),
+      "rin takes no option '-arr': it belongs to ai and ain, as a reference has no far end; see 'corvcim --help'");
 }
 
 TEST(Options, ColumnsAreAListOfPropertiesForTablesAndCsv) {
