@@ -10,14 +10,14 @@
 namespace Corvcim {
 namespace {
 
-constexpr Scope everyVerb = {[](const VerbSyntax&) { return true; }, ""};
+constexpr Scope everyVerb = {[](const VerbSyntax&) { return true; }, "", true};
 constexpr Scope associationVerbs = {[](const VerbSyntax& verb) { return verb.isAssociation; },
                                     "it belongs to ai, ain, ri and rin"};
 constexpr Scope associatorVerbs = {
     [](const VerbSyntax& verb) { return verb.verb == Verb::Associators || verb.verb == Verb::AssociatorNames; },
     "it belongs to ai and ain, as a reference has no far end"};
 constexpr Scope oneInventory = {[](const VerbSyntax& verb) { return verb.verb != Verb::Diff; },
-                                "A and B say which inventories"};
+                                "A and B say which inventories", true};
 constexpr Scope onlyInventory = {[](const VerbSyntax& verb) { return verb.verb == Verb::Inventory; },
                                  "it belongs to inventory"};
 constexpr Scope columnVerbs = {[](const VerbSyntax& verb) { return std::ranges::any_of(verb.formats, hasColumns); },
@@ -267,10 +267,6 @@ constexpr OptionSyntax syntaxTable[] = {
 
 std::span<const OptionSyntax> optionTable() {
   return syntaxTable;
-}
-
-bool isGeneral(const OptionSyntax& option) {
-  return option.scope.holds(overviewSyntax());
 }
 
 std::string inQuotes(std::string_view word) {

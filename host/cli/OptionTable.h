@@ -13,6 +13,7 @@ namespace Corvcim {
 struct Scope {
   bool (*holds)(const VerbSyntax& verb);
   std::string_view explanation;
+  bool isGeneral = false;  ///< for all verbs but exceptions, so that the help of one verb does not list the option
 };
 
 /// An option: what it does, and what help, manual page and completions say of it.
@@ -31,9 +32,6 @@ struct OptionSyntax {
 /// All options, in the order in which the help lists them; those that narrow associations, with a short name alone,
 /// last.
 std::span<const OptionSyntax> optionTable();
-
-/// Whether the option is for `corvcim` without a verb too, and so no verb's own.
-bool isGeneral(const OptionSyntax& option);
 
 // For the rows of the table and for what reads the command line:
 

@@ -20,7 +20,7 @@ int standardError = STDERR_FILENO;
 /// 0, or the number of the error.
 int writeAll(int descriptor, std::string_view text) {
   while (!text.empty()) {
-    const ssize_t written = write(descriptor, text.data(), text.size());
+    const ssize_t written = ::write(descriptor, text.data(), text.size());
     if (written < 0 && errno != EINTR) {
       return errno;
     }

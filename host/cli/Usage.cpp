@@ -86,8 +86,9 @@ std::string verbHelp(const VerbSyntax& verb) {
   if (!verb.details.empty()) {
     text += '\n' + std::string(verb.details);
   }
-  return text + optionHelp("Options",
-                           [&](const OptionSyntax& option) { return option.scope.holds(verb) && !isGeneral(option); });
+  return text + optionHelp("Options", [&](const OptionSyntax& option) {
+           return option.scope.holds(verb) && !option.scope.isGeneral;
+         });
 }
 
 std::string versionText() {

@@ -144,12 +144,13 @@ std::string zshOption(const OptionSyntax& option) {
 /// The verbs that the option is for, the empty one first; empty if these are all.
 std::string zshVerbsOf(const OptionSyntax& option) {
   std::string names;
-  bool isForAll = isGeneral(option);
+  const bool isForOverview = option.scope.holds(overviewSyntax());
+  bool isForAll = isForOverview;
   for (const VerbSyntax& verb : verbs()) {
     const bool holds = option.scope.holds(verb);
     isForAll = isForAll && holds;
     if (holds) {
-      names.append(names.empty() && !isGeneral(option) ? "" : "|").append(verb.name);
+      names.append(names.empty() && !isForOverview ? "" : "|").append(verb.name);
     }
   }
   return isForAll ? "" : names;

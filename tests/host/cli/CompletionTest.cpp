@@ -40,7 +40,6 @@ TEST(Completion, OffersVerbsToHelpAndColumnsToTables) {
 TEST(Completion, OffersTheOptionsOfTheVerb) {
   const std::string general = "--inventory --output --namespace --library --companion --language --help --version\n";
 
-  EXPECT_EQ(offered("-"), general);
   EXPECT_EQ(offered("tree -"), general);
   EXPECT_EQ(offered("diff --i"), "--ignore\n");
   EXPECT_EQ(offered("ain -a"), "-ac -arc -ar -arr\n");
