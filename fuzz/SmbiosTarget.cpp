@@ -48,7 +48,7 @@ void checkRecords(const Tables& tables) {
     }
     for (const auto* const field :
          {&p.family, &p.externalClock, &p.maxSpeed, &p.currentSpeed, p.caches.data(), &p.caches[1], &p.caches[2],
-          &p.cores, &p.coresEnabled, &p.threads, &p.characteristics, &p.threadsEnabled}) {
+          &p.cores, &p.coresEnabled, &p.threads, &p.characteristics}) {
       checkField(p.structure, *field);
     }
     checkField(p.structure, p.id);
@@ -59,7 +59,6 @@ void checkRecords(const Tables& tables) {
   for (const Cache& c : tables.caches) {
     checkText(c.structure, c.socket);
     checkField(c.structure, c.level);
-    checkField(c.structure, c.maximumSize);
     checkField(c.structure, c.installedSize);
     checkField(c.structure, c.ways);
     require(!c.level || (*c.level >= 1 && *c.level <= 8), "a level is one of eight");

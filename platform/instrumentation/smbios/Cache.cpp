@@ -10,7 +10,6 @@ namespace Tarn::Smbios {
 namespace {
 
 using detail::FieldReader;
-using detail::unlessZero;
 using detail::unlessZeroOrTwo;
 
 /// `count` bits of a word, the lowest of them at `bit`.
@@ -20,15 +19,6 @@ constexpr unsigned int bits(std::uint16_t word, unsigned int bit, unsigned int c
 
 std::optional<unsigned int> levelOf(std::uint16_t configuration) {
   return bits(configuration, 0, 3) + 1;
-}
-
-std::optional<bool> isSocketed(std::uint16_t configuration) {
-  return bits(configuration, 3, 1) != 0;
-}
-
-std::optional<CacheLocation> locationOf(std::uint16_t configuration) {
-  const unsigned int code = bits(configuration, 5, 2);
-  return code > 1 ? std::nullopt : std::optional(static_cast<CacheLocation>(code));
 }
 
 std::optional<bool> isEnabled(std::uint16_t configuration) {
@@ -53,11 +43,6 @@ Field<std::uint64_t> readSize(const FieldReader& fields, std::size_t first, std:
   constexpr std::uint16_t inSecondField = 0xFFFF;
   return fields.twoFields<std::uint16_t, std::uint32_t>(first, inSecondField, kibibytes<std::uint16_t>, second,
                                                         kibibytes<std::uint32_t>);
-}
-
-std::optional<std::uint16_t> sramOf(std::uint16_t raw) {
-  constexpr std::uint16_t unknown = 1U << 1U;
-  return (raw & unknown) != 0 ? std::nullopt : unlessZero(raw);
 }
 
 std::optional<CacheType> typeOf(std::uint8_t raw) {
@@ -89,16 +74,9 @@ Cache readCache(const Structure& structure, Problems& problems) {
       .structure = structure,
       .socket = fields.text(0x04),
       .level = fields.number<std::uint16_t>(0x05, levelOf),
-      .socketed = fields.number<std::uint16_t>(0x05, isSocketed),
-      .location = fields.number<std::uint16_t>(0x05, locationOf),
       .enabled = fields.number<std::uint16_t>(0x05, isEnabled),
       .mode = fields.number<std::uint16_t>(0x05, modeOf),
-      .maximumSize = readSize(fields, 0x07, 0x13),
       .installedSize = readSize(fields, 0x09, 0x17),
-      .supportedSram = fields.number<std::uint16_t>(0x0B, sramOf),
-      .currentSram = fields.number<std::uint16_t>(0x0D, sramOf),
-      .speed = fields.number<std::uint8_t>(0x0F, unlessZero<std::uint8_t>),
-      .errorCorrection = fields.number<std::uint8_t>(0x10, unlessZeroOrTwo<std::uint8_t>),
       .type = fields.number<std::uint8_t>(0x11, typeOf),
       .associativity = fields.number<std::uint8_t>(0x12, unlessZeroOrTwo<std::uint8_t>),
       .ways = fields.number<std::uint8_t>(0x12, waysOf),

@@ -11,7 +11,6 @@
 namespace Tarn::Smbios {
 
 enum class CacheMode : std::uint8_t { WriteThrough = 0, WriteBack = 1, VariesWithAddress = 2 };
-enum class CacheLocation : std::uint8_t { Internal = 0, External = 1 };
 enum class CacheType : std::uint8_t { Other = 1, Instruction = 3, Data = 4, Unified = 5 };
 
 /// A cache (type 7). One structure can stand for the caches of all cores of a processor, with their sizes added up.
@@ -21,22 +20,15 @@ struct Cache {
   static constexpr std::uint8_t fullyAssociative = 6;
 
   Structure structure;
-  Field<std::string> socket;            ///< 0x04, the label, often just "L1 Cache"
-  Field<unsigned int> level;            ///< 0x05, bits 0 to 2: 1 for L1, up to 8
-  Field<bool> socketed;                 ///< 0x05, bit 3
-  Field<CacheLocation> location;        ///< 0x05, bits 5 and 6; absent if unknown or reserved
-  Field<bool> enabled;                  ///< 0x05, bit 7: on at boot
-  Field<CacheMode> mode;                ///< 0x05, bits 8 and 9; absent if unknown
-  Field<std::uint64_t> maximumSize;     ///< 0x07, or 0x13 where 0x07 is 0xffff; KiB
-  Field<std::uint64_t> installedSize;   ///< 0x09, or 0x17 where 0x09 is 0xffff; KiB. 0: no cache is there
-  Field<std::uint16_t> supportedSram;   ///< 0x0b, bits as the standard lists them; absent if bit 1 says unknown
-  Field<std::uint16_t> currentSram;     ///< 0x0d, the same
-  Field<std::uint8_t> speed;            ///< 0x0f, nanoseconds; absent if 0
-  Field<std::uint8_t> errorCorrection;  ///< 0x10: 1 other, 3 none, 4 parity, 5 single-bit, 6 multi-bit; absent if 2
-  Field<CacheType> type;                ///< 0x11; absent if unknown or no listed code
-  Field<std::uint8_t> associativity;    ///< 0x12, the table's code; absent if 0 or 2 (unknown)
-  Field<unsigned int> ways;             ///< 0x12, the number of ways that the code stands for, 1 for direct-mapped;
-                                        ///< absent for other, unknown, fully associative and unlisted codes
+  Field<std::string> socket;           ///< 0x04, the label, often just "L1 Cache"
+  Field<unsigned int> level;           ///< 0x05, bits 0 to 2: 1 for L1, up to 8
+  Field<bool> enabled;                 ///< 0x05, bit 7: on at boot
+  Field<CacheMode> mode;               ///< 0x05, bits 8 and 9; absent if unknown
+  Field<std::uint64_t> installedSize;  ///< 0x09, or 0x17 where 0x09 is 0xffff; KiB. 0: no cache is there
+  Field<CacheType> type;               ///< 0x11; absent if unknown or no listed code
+  Field<std::uint8_t> associativity;   ///< 0x12, the table's code; absent if 0 or 2 (unknown)
+  Field<unsigned int> ways;            ///< 0x12, the number of ways that the code stands for, 1 for direct-mapped;
+                                       ///< absent for other, unknown, fully associative and unlisted codes
 };
 
 /// Decodes a structure of type 7. Fields that the structure is too short for are absent.

@@ -41,17 +41,6 @@ Field<std::uint16_t> readCount(const FieldReader& fields, std::size_t first, std
                                                        fromSecond);
 }
 
-// One bit of the voltage says what the other seven are: tenths of a volt, or three bits of what the socket can do.
-constexpr std::uint8_t voltageIsCurrent = 0x80;
-
-std::optional<unsigned int> tenthsOfVolt(std::uint8_t raw) {
-  return (raw & voltageIsCurrent) == 0 ? std::nullopt : unlessZero<unsigned int>(raw & 0x7FU);
-}
-
-std::optional<std::uint8_t> voltageCapabilities(std::uint8_t raw) {
-  return (raw & voltageIsCurrent) != 0 ? std::nullopt : unlessZero(static_cast<std::uint8_t>(raw & 0x07U));
-}
-
 std::optional<bool> isPopulated(std::uint8_t raw) {
   return (raw & 0x40U) != 0;
 }
@@ -83,8 +72,6 @@ Processor readProcessor(const Structure& structure, Problems& problems) {
       .manufacturer = fields.text(0x07),
       .id = fields.number<std::uint64_t>(0x08, unlessZero<std::uint64_t>),
       .version = fields.text(0x10),
-      .tenthsOfVolt = fields.number<std::uint8_t>(0x11, tenthsOfVolt),
-      .voltageCapabilities = fields.number<std::uint8_t>(0x11, voltageCapabilities),
       .externalClock = fields.number<std::uint16_t>(0x12, unlessZero<std::uint16_t>),
       .maxSpeed = fields.number<std::uint16_t>(0x14, unlessZero<std::uint16_t>),
       .currentSpeed = fields.number<std::uint16_t>(0x16, unlessZero<std::uint16_t>),
@@ -101,7 +88,6 @@ Processor readProcessor(const Structure& structure, Problems& problems) {
       .coresEnabled = readCount(fields, 0x24, 0x2C),
       .threads = readCount(fields, 0x25, 0x2E),
       .characteristics = fields.number<std::uint16_t>(0x26, characteristicsOf),
-      .threadsEnabled = fields.number<std::uint16_t>(0x30, unlessZero<std::uint16_t>),
   };
 }
 

@@ -38,22 +38,19 @@ inline constexpr std::uint16_t armSocId = 1U << 9;
 /// value did not fit into its first field and stands in a second one, the Field is the second one.
 struct Processor {
   Structure structure;
-  Field<std::string> socket;                ///< 0x04, the label on the board
-  Field<std::uint8_t> type;                 ///< 0x05: 1 other, 3 central, 4 math, 5 signal, 6 video; absent if 2
-  Field<std::uint16_t> family;              ///< 0x06, or 0x28 where 0x06 is 0xfe; absent if 0 or 2 (unknown)
-  Field<std::string> manufacturer;          ///< 0x07
-  Field<std::uint64_t> id;                  ///< 0x08, the identification register, on x86 then the feature
-                                            ///< bits; the raw bytes are its printed form; absent if 0
-  Field<std::string> version;               ///< 0x10, usually the brand name
-  Field<unsigned int> tenthsOfVolt;         ///< 0x11, the voltage it runs at; absent if only capabilities are given
-  Field<std::uint8_t> voltageCapabilities;  ///< 0x11, bits: 1 is 5 V, 2 is 3.3 V, 4 is 2.9 V; absent if the voltage is
-                                            ///< given what the processor runs at
-  Field<std::uint16_t> externalClock;       ///< 0x12, MHz; absent if 0
-  Field<std::uint16_t> maxSpeed;            ///< 0x14, MHz: the most that the socket takes; absent if 0
-  Field<std::uint16_t> currentSpeed;        ///< 0x16, MHz, at boot; absent if 0
-  Field<bool> populated;                    ///< 0x18, bit 6
-  Field<ProcessorStatus> status;            ///< 0x18, bits 0 to 2; absent for the reserved codes 5 and 6
-  Field<std::uint8_t> upgrade;              ///< 0x19, the kind of socket; absent if 0 or 2 (unknown)
+  Field<std::string> socket;                   ///< 0x04, the label on the board
+  Field<std::uint8_t> type;                    ///< 0x05: 1 other, 3 central, 4 math, 5 signal, 6 video; absent if 2
+  Field<std::uint16_t> family;                 ///< 0x06, or 0x28 where 0x06 is 0xfe; absent if 0 or 2 (unknown)
+  Field<std::string> manufacturer;             ///< 0x07
+  Field<std::uint64_t> id;                     ///< 0x08, the identification register, on x86 then the feature
+                                               ///< bits; the raw bytes are its printed form; absent if 0
+  Field<std::string> version;                  ///< 0x10, usually the brand name
+  Field<std::uint16_t> externalClock;          ///< 0x12, MHz; absent if 0
+  Field<std::uint16_t> maxSpeed;               ///< 0x14, MHz: the most that the socket takes; absent if 0
+  Field<std::uint16_t> currentSpeed;           ///< 0x16, MHz, at boot; absent if 0
+  Field<bool> populated;                       ///< 0x18, bit 6
+  Field<ProcessorStatus> status;               ///< 0x18, bits 0 to 2; absent for the reserved codes 5 and 6
+  Field<std::uint8_t> upgrade;                 ///< 0x19, the kind of socket; absent if 0 or 2 (unknown)
   std::array<Field<std::uint16_t>, 3> caches;  ///< 0x1a, 0x1c, 0x1e: handles of its L1, L2 and L3 cache; absent
                                                ///< if 0xffff (not provided)
   Field<std::string> serialNumber;             ///< 0x20
@@ -63,7 +60,6 @@ struct Processor {
   Field<std::uint16_t> coresEnabled;           ///< 0x24, or 0x2c; absent if 0
   Field<std::uint16_t> threads;                ///< 0x25, or 0x2e; absent if 0
   Field<std::uint16_t> characteristics;        ///< 0x26, bits of ProcessorCharacteristic; absent if bit 1 says so
-  Field<std::uint16_t> threadsEnabled;         ///< 0x30; absent if 0
 };
 
 /// Decodes a structure of type 4. Fields that the structure is too short for are absent.

@@ -23,50 +23,30 @@ class DecodedCache {
 };
 
 TEST(SmbiosCache, HasEveryField) {
-  const DecodedCache cache(SmbiosCache{.frame = {.handle = 0x0A},
-                                       .level = 3,
-                                       .socketed = true,
-                                       .location = 1,
-                                       .mode = 2,
-                                       .maximumKiB = 4096,
-                                       .installedKiB = 2048,
-                                       .currentSram = 0x08,
-                                       .speed = 12});
+  const DecodedCache cache(SmbiosCache{.frame = {.handle = 0x0A}, .level = 3, .mode = 2, .installedKiB = 2048});
 
   EXPECT_EQ(valueOf(cache->socket), "L1 Cache");
   EXPECT_EQ(valueOf(cache->level), 3);
-  EXPECT_EQ(valueOf(cache->socketed), 1);
-  EXPECT_EQ(*cache->location, CacheLocation::External);
   EXPECT_EQ(valueOf(cache->enabled), 1);
   EXPECT_EQ(*cache->mode, CacheMode::VariesWithAddress);
-  EXPECT_EQ(valueOf(cache->maximumSize), 4096);
   EXPECT_EQ(valueOf(cache->installedSize), 2048);
-  EXPECT_EQ(valueOf(cache->supportedSram), 0x20);
-  EXPECT_EQ(valueOf(cache->currentSram), 0x08);
-  EXPECT_EQ(valueOf(cache->speed), 12);
-  EXPECT_EQ(valueOf(cache->errorCorrection), 5);
   EXPECT_EQ(*cache->type, CacheType::Unified);
   EXPECT_EQ(valueOf(cache->associativity), 7);
   EXPECT_EQ(valueOf(cache->ways), 8);
   EXPECT_EQ(placeOf(cache->structure, cache->mode), "SMBIOS type 7, handle 0x000a, offset 0x05");
-  EXPECT_EQ(hexOf(cache->mode.raw), "aa02");
+  EXPECT_EQ(hexOf(cache->mode.raw), "8202");
   EXPECT_THAT(cache.problems(), testing::IsEmpty());
 }
 
 TEST(SmbiosCache, ConfigurationIsReadBitByBit) {
   const DecodedCache off(SmbiosCache{.enabled = false, .mode = 0});
-  const DecodedCache unknown(SmbiosCache{.level = 8, .location = 3, .mode = 3});
-  const DecodedCache reserved(SmbiosCache{.location = 2});
+  const DecodedCache unknown(SmbiosCache{.level = 8, .mode = 3});
 
   EXPECT_EQ(valueOf(off->level), 1);
   EXPECT_EQ(valueOf(off->enabled), 0);
-  EXPECT_EQ(valueOf(off->socketed), 0);
   EXPECT_EQ(*off->mode, CacheMode::WriteThrough);
-  EXPECT_EQ(*off->location, CacheLocation::Internal);
   EXPECT_EQ(valueOf(unknown->level), 8);
   EXPECT_FALSE(unknown->mode);
-  EXPECT_FALSE(unknown->location);
-  EXPECT_FALSE(reserved->location);
 }
 
 TEST(SmbiosCache, SizeStandsInOneOfTwoFields) {
@@ -87,13 +67,11 @@ TEST(SmbiosCache, SizeStandsInOneOfTwoFields) {
       {0x7FFFFFFFULL * 64, 0x17, "ffffffff"},
   };
   for (const Case& c : cases) {
-    const DecodedCache cache(SmbiosCache{.maximumKiB = c.kibibytes, .installedKiB = c.kibibytes});
+    const DecodedCache cache(SmbiosCache{.installedKiB = c.kibibytes});
 
     EXPECT_EQ(cache->installedSize.value, c.kibibytes);
     EXPECT_EQ(cache->installedSize.offset, c.offset) << c.kibibytes;
     EXPECT_EQ(hexOf(cache->installedSize.raw), c.raw);
-    EXPECT_EQ(cache->maximumSize.value, c.kibibytes);
-    EXPECT_EQ(cache->maximumSize.offset, c.offset == 0x09 ? 0x07U : 0x13U) << c.kibibytes;
   }
 }
 
@@ -126,24 +104,13 @@ TEST(SmbiosCache, TypesThatAreNotListedAreAbsent) {
   }
 }
 
-TEST(SmbiosCache, CodesThatMeanUnknownAreAbsent) {
-  const DecodedCache cache(SmbiosCache{.supportedSram = 0x02, .currentSram = 0x22, .speed = 0, .errorCorrection = 2});
-
-  EXPECT_FALSE(cache->supportedSram);
-  EXPECT_FALSE(cache->currentSram);
-  EXPECT_FALSE(cache->speed);
-  EXPECT_FALSE(cache->errorCorrection);
-}
-
 TEST(SmbiosCache, HasExactlyTheFieldsThatItsLengthReaches) {
-  const std::size_t ends[] = {0x05, 0x07, 0x09, 0x0B, 0x0D, 0x0F, 0x10, 0x11, 0x12, 0x13};
+  const std::size_t ends[] = {0x05, 0x07, 0x0B, 0x12, 0x13};
   for (std::size_t length = 4; length <= 0x20; ++length) {
-    const DecodedCache cache(SmbiosCache{.frame = {.length = static_cast<std::uint8_t>(length)}, .speed = 3});
+    const DecodedCache cache(SmbiosCache{.frame = {.length = static_cast<std::uint8_t>(length)}});
     const Cache& c = *cache;
-    const bool there[] = {!c.socket.raw.empty(),        !c.level.raw.empty(),           !c.maximumSize.raw.empty(),
-                          !c.installedSize.raw.empty(), !c.supportedSram.raw.empty(),   !c.currentSram.raw.empty(),
-                          !c.speed.raw.empty(),         !c.errorCorrection.raw.empty(), !c.type.raw.empty(),
-                          !c.associativity.raw.empty()};
+    const bool there[] = {!c.socket.raw.empty(), !c.level.raw.empty(), !c.installedSize.raw.empty(),
+                          !c.type.raw.empty(), !c.associativity.raw.empty()};
     for (std::size_t i = 0; i < std::size(ends); ++i) {
       EXPECT_EQ(there[i], length >= ends[i]) << "field " << i << ", length " << length;
     }

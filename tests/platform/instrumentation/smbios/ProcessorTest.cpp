@@ -24,7 +24,7 @@ class DecodedProcessor {
 };
 
 TEST(Processor, HasEveryField) {
-  const DecodedProcessor processor(SmbiosProcessor{.frame = {.handle = 0x43}, .threadsEnabled = 12});
+  const DecodedProcessor processor(SmbiosProcessor{.frame = {.handle = 0x43}});
 
   EXPECT_EQ(valueOf(processor->socket), "CPU 1");
   EXPECT_EQ(valueOf(processor->type), 3);
@@ -32,8 +32,6 @@ TEST(Processor, HasEveryField) {
   EXPECT_EQ(valueOf(processor->manufacturer), "Example Semiconductors");
   EXPECT_EQ(*processor->id, 0xBFEBFBFF000406F1U);
   EXPECT_EQ(valueOf(processor->version), "Example Processor 1000 @ 2.00GHz");
-  EXPECT_EQ(valueOf(processor->tenthsOfVolt), 12);
-  EXPECT_EQ(valueOf(processor->voltageCapabilities), -1);
   EXPECT_EQ(valueOf(processor->externalClock), 100);
   EXPECT_EQ(valueOf(processor->maxSpeed), 4000);
   EXPECT_EQ(valueOf(processor->currentSpeed), 2000);
@@ -47,7 +45,6 @@ TEST(Processor, HasEveryField) {
   EXPECT_EQ(valueOf(processor->coresEnabled), 8);
   EXPECT_EQ(valueOf(processor->threads), 16);
   EXPECT_EQ(valueOf(processor->characteristics), 0xFC);
-  EXPECT_EQ(valueOf(processor->threadsEnabled), 12);
   EXPECT_THAT(processor.problems(), testing::IsEmpty());
 }
 
@@ -103,8 +100,6 @@ TEST(Processor, AnEmptySocketHasItsLabelOnly) {
   EXPECT_FALSE(processor->family);
   EXPECT_FALSE(processor->id);
   EXPECT_FALSE(processor->version);
-  EXPECT_FALSE(processor->tenthsOfVolt);
-  EXPECT_FALSE(processor->voltageCapabilities);
   EXPECT_FALSE(processor->externalClock);
   EXPECT_FALSE(processor->maxSpeed);
   EXPECT_FALSE(processor->currentSpeed);
@@ -112,7 +107,6 @@ TEST(Processor, AnEmptySocketHasItsLabelOnly) {
   EXPECT_FALSE(processor->cores);
   EXPECT_FALSE(processor->coresEnabled);
   EXPECT_FALSE(processor->threads);
-  EXPECT_FALSE(processor->threadsEnabled);
   EXPECT_EQ(processor->maxSpeed.raw.size(), 2U) << "unknown is not the same as not there";
 }
 
@@ -182,22 +176,6 @@ TEST(Processor, ASecondCountThatIsNotThereForAllThreeCountsForThoseItIsThereFor)
   EXPECT_EQ(valueOf(processor->threads), 255);
 }
 
-TEST(Processor, VoltageIsWhatItRunsAtOrWhatItsSocketCanDo) {
-  struct Case {
-    std::uint8_t raw;
-    long long tenths;
-    long long capabilities;
-  };
-  const Case cases[] = {{0x00, -1, -1}, {0x80, -1, -1}, {0x92, 18, -1}, {0xFF, 127, -1},
-                        {0x01, -1, 1},  {0x07, -1, 7},  {0x78, -1, -1}, {0x7A, -1, 2}};
-  for (const Case& c : cases) {
-    const DecodedProcessor processor(SmbiosProcessor{.voltage = c.raw});
-
-    EXPECT_EQ(valueOf(processor->tenthsOfVolt), c.tenths) << unsigned{c.raw};
-    EXPECT_EQ(valueOf(processor->voltageCapabilities), c.capabilities) << unsigned{c.raw};
-  }
-}
-
 TEST(Processor, CodesThatMeanUnknownAreAbsentAndUnlistedOnesAreKept) {
   const DecodedProcessor unknown(SmbiosProcessor{.type = 2, .upgrade = 2, .characteristics = 0x02});
   const DecodedProcessor unlisted(SmbiosProcessor{.type = 0xF0, .upgrade = 0xF1, .characteristics = 0xFC00});
@@ -227,34 +205,18 @@ TEST(Processor, CachesThatAreNotProvidedAreAbsent) {
 
 TEST(Processor, HasExactlyTheFieldsThatItsLengthReaches) {
   // For every length: how many of the fields are there. A field counts where its last byte is within the length.
-  const std::size_t ends[] = {0x05, 0x06, 0x07, 0x08, 0x10, 0x11, 0x12, 0x14, 0x16, 0x18, 0x19, 0x1A,
-                              0x1C, 0x1E, 0x20, 0x21, 0x22, 0x23, 0x24, 0x25, 0x26, 0x28, 0x32};
+  const std::size_t ends[] = {0x05, 0x06, 0x07, 0x08, 0x10, 0x11, 0x14, 0x16, 0x18, 0x19, 0x1A,
+                              0x1C, 0x1E, 0x20, 0x21, 0x22, 0x23, 0x24, 0x25, 0x26, 0x28};
   for (std::size_t length = 4; length <= 0x40; ++length) {
     const DecodedProcessor processor(SmbiosProcessor{.frame = {.length = static_cast<std::uint8_t>(length)}});
     const Processor& p = *processor;
-    const bool there[] = {!p.socket.raw.empty(),
-                          !p.type.raw.empty(),
-                          !p.family.raw.empty(),
-                          !p.manufacturer.raw.empty(),
-                          !p.id.raw.empty(),
-                          !p.version.raw.empty(),
-                          !p.tenthsOfVolt.raw.empty(),
-                          !p.externalClock.raw.empty(),
-                          !p.maxSpeed.raw.empty(),
-                          !p.currentSpeed.raw.empty(),
-                          !p.status.raw.empty(),
-                          !p.upgrade.raw.empty(),
-                          !p.caches[0].raw.empty(),
-                          !p.caches[1].raw.empty(),
-                          !p.caches[2].raw.empty(),
-                          !p.serialNumber.raw.empty(),
-                          !p.assetTag.raw.empty(),
-                          !p.partNumber.raw.empty(),
-                          !p.cores.raw.empty(),
-                          !p.coresEnabled.raw.empty(),
-                          !p.threads.raw.empty(),
-                          !p.characteristics.raw.empty(),
-                          !p.threadsEnabled.raw.empty()};
+    const bool there[] = {!p.socket.raw.empty(),        !p.type.raw.empty(),       !p.family.raw.empty(),
+                          !p.manufacturer.raw.empty(),  !p.id.raw.empty(),         !p.version.raw.empty(),
+                          !p.externalClock.raw.empty(), !p.maxSpeed.raw.empty(),   !p.currentSpeed.raw.empty(),
+                          !p.status.raw.empty(),        !p.upgrade.raw.empty(),    !p.caches[0].raw.empty(),
+                          !p.caches[1].raw.empty(),     !p.caches[2].raw.empty(),  !p.serialNumber.raw.empty(),
+                          !p.assetTag.raw.empty(),      !p.partNumber.raw.empty(), !p.cores.raw.empty(),
+                          !p.coresEnabled.raw.empty(),  !p.threads.raw.empty(),    !p.characteristics.raw.empty()};
     for (std::size_t i = 0; i < std::size(ends); ++i) {
       EXPECT_EQ(there[i], length >= ends[i]) << "field " << i << ", length " << length;
     }

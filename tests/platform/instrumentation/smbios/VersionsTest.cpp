@@ -53,7 +53,6 @@ TEST_P(Versions, HaveTheFieldsOfTheirTime) {
   EXPECT_EQ(valueOf(processor.cores), since30 ? 512 : since25 ? 255 : -1);
   EXPECT_EQ(valueOf(processor.characteristics), since25 ? 0xFC : -1);
   EXPECT_EQ(valueOf(processor.family), since26 ? 0x101 : 0xB3);
-  EXPECT_EQ(valueOf(processor.threadsEnabled), version.processorLength >= 0x32 ? 16 : -1);
   const Cache& decodedCache = tables->caches.at(0);
   EXPECT_EQ(decodedCache.structure.formatted.size(), version.cacheLength);
   EXPECT_EQ(valueOf(decodedCache.associativity), since21 ? 7 : -1);
