@@ -39,17 +39,43 @@ if(CORVANE_FUZZ)
   target_link_options(corvane_options INTERFACE -fsanitize=address,undefined)
 endif()
 
-# The product's sources, compiled against one implementation of the six platform headers.
-# SEAM is the directory that holds these headers; DEFINE are the options of the build that are on, such as
-# CORVANE_BROKER_GUARD.
-function(corvane_product_objects name)
-  cmake_parse_arguments(ARG "" "SEAM" "DEFINE" ${ARGN})
-  file(GLOB sources CONFIGURE_DEPENDS
-    ${PROJECT_SOURCE_DIR}/model/*.cpp ${PROJECT_SOURCE_DIR}/factory/*.cpp ${PROJECT_SOURCE_DIR}/providers/*.cpp)
-  add_library(${name} OBJECT ${sources})
-  # Each provider file has its own statics of the same names, so these sources are compiled one by one.
-  set_target_properties(${name} PROPERTIES UNITY_BUILD OFF)
-  target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
-  target_link_libraries(${name} PRIVATE corvane_options PUBLIC cmpi)
-  target_compile_definitions(${name} PRIVATE ${ARG_DEFINE})
+# The sources of the product.
+set(CORVANE_MODEL_SOURCES
+  CPU.cpp Records.cpp Relationships.cpp)
+list(TRANSFORM CORVANE_MODEL_SOURCES PREPEND ${PROJECT_SOURCE_DIR}/model/)
+set(CORVANE_FACTORY_SOURCES
+  CPUObjFactory.cpp CoreAndCacheInstances.cpp Lookup.cpp Navigation.cpp ProcessorInstances.cpp)
+list(TRANSFORM CORVANE_FACTORY_SOURCES PREPEND ${PROJECT_SOURCE_DIR}/factory/)
+set(CORVANE_PROVIDER_SOURCES
+  CPUAssociatedCacheMemoryProvider.cpp CPUConcreteComponentProvider.cpp
+  CPUCoreAssociatedCacheMemoryProvider.cpp CPUElementCapabilitiesProvider.cpp CPUMemoryProvider.cpp
+  CPUProcessorCapabilitiesProvider.cpp CPUProcessorCoreProvider.cpp CPUProcessorProvider.cpp
+  CPUSystemDeviceProvider.cpp CacheAssociation.cpp InstanceProvider.cpp)
+list(TRANSFORM CORVANE_PROVIDER_SOURCES PREPEND ${PROJECT_SOURCE_DIR}/providers/)
+
+# corvane_product(NAME SEAM directory [DEFINE option...] [RECORDS product])
+# The product, compiled against the implementation of the six platform headers in SEAM. DEFINE are the options of the
+# build that are on, such as CORVANE_BROKER_GUARD; only the providers depend on them, so another product with the same
+# SEAM lends its model and factory as RECORDS.
+function(corvane_product name)
+  cmake_parse_arguments(ARG "" "SEAM;RECORDS" "DEFINE" ${ARGN})
+  if(NOT ARG_RECORDS)
+    set(ARG_RECORDS ${name})
+    add_library(${name}_records OBJECT ${CORVANE_MODEL_SOURCES} ${CORVANE_FACTORY_SOURCES})
+  endif()
+  add_library(${name}_providers OBJECT ${CORVANE_PROVIDER_SOURCES})
+  target_compile_definitions(${name}_providers PRIVATE ${ARG_DEFINE})
+
+  add_library(${name} INTERFACE)
+  target_include_directories(${name} INTERFACE ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
+  target_link_libraries(${name} INTERFACE cmpi)
+  target_sources(${name} INTERFACE $<TARGET_OBJECTS:${ARG_RECORDS}_records> $<TARGET_OBJECTS:${name}_providers>)
+  foreach(part ${name}_records ${name}_providers)
+    if(TARGET ${part})
+      # Each provider file has its own statics of the same names, so these sources are compiled one by one.
+      set_target_properties(${part} PROPERTIES UNITY_BUILD OFF)
+      target_include_directories(${part} PRIVATE ${PROJECT_SOURCE_DIR}/include ${ARG_SEAM})
+      target_link_libraries(${part} PRIVATE corvane_options cmpi)
+    endif()
+  endforeach()
 endfunction()

@@ -83,7 +83,7 @@ TEST_F(FactoryFailure, OfALookupIsLoggedAndPassesItsStatusBack) {
 }
 
 /// The text of an association operation whose navigation fails.
-struct Navigation {
+struct FailingNavigation {
   const char* className;
   ObjectPath source;
   const char* targetClass;
@@ -94,7 +94,7 @@ struct Navigation {
 
 class NavigationFailure : public FactoryFailure {
  protected:
-  static std::vector<Navigation> navigations() {
+  static std::vector<FailingNavigation> navigations() {
     constexpr const char* ofCore = "getProcessorRefByProcCoreHandle Failed for InstanceID";
     constexpr const char* ofProcessor = "getProcessorRefByProcCoreHandle Failed for DeviceID";
     return {
@@ -158,7 +158,7 @@ TEST_F(NavigationFailure, IsLoggedAndPassesItsStatusBack) {
   constexpr OperationKind kinds[] = {OperationKind::Associators, OperationKind::AssociatorNames,
                                      OperationKind::References, OperationKind::ReferenceNames};
   script().failureStatus = CMPI_RC_ERR_SERVER_LIMITS_EXCEEDED;
-  for (const Navigation& each : navigations()) {
+  for (const FailingNavigation& each : navigations()) {
     script().results = {{each.function, 1}};
     script().targetClass = each.targetClass;
     for (std::size_t i = 0; i < std::size(kinds); ++i) {
