@@ -1,5 +1,6 @@
 #include "host/cli/RequestCheck.h"
 
+#include <sys/utsname.h>
 #include <tarn/Common.h>
 
 #include <algorithm>
@@ -26,19 +27,20 @@ std::string_view hostAlone(std::string_view host) {
 }
 
 /// Of two names of which one lacks the domain, the first part is compared.
-bool namesThisHost(std::string_view host) {
-  const std::string_view name = hostAlone(host);
-  const std::string system = Tarn::getSystemName();
-  for (const std::string_view each : {std::string_view("localhost"), std::string_view("127.0.0.1"),
-                                      std::string_view("::1"), std::string_view(system)}) {
-    if (sameName(name, each)) {
-      return true;
-    }
-  }
+bool isSameHost(std::string_view name, std::string_view other) {
   const std::size_t dot = name.find('.');
-  const std::size_t systemDot = system.find('.');
-  const bool lacksDomain = dot == std::string_view::npos || systemDot == std::string::npos;
-  return lacksDomain && sameName(name.substr(0, dot), std::string_view(system).substr(0, systemDot));
+  const std::size_t otherDot = other.find('.');
+  const bool lacksDomain = dot == std::string_view::npos || otherDot == std::string_view::npos;
+  return sameName(name, other) || (lacksDomain && sameName(name.substr(0, dot), other.substr(0, otherDot)));
+}
+
+/// The machine that the inventory describes has its own name, whichever host this program runs on.
+bool namesThisHost(std::string_view host) {
+  struct utsname machine {};
+  ::uname(&machine);
+  const std::string described = Tarn::getSystemName();
+  const std::string_view names[] = {"localhost", "127.0.0.1", "::1", machine.nodename, described};
+  return std::ranges::any_of(names, [&](std::string_view name) { return isSameHost(hostAlone(host), name); });
 }
 
 void checkPlace(const ObjectPath& path) {

@@ -35,7 +35,7 @@ TEST(Refusal, PathsOfOtherHostsAreRefused) {
 }
 
 TEST(Refusal, PathsOfThisHostAreTaken) {
-  for (const std::string& name : {host(), host() + ":5988", "user@" + host(), host() + ".some.domain",
+  for (const std::string& name : {host(), thisHost(), host() + ":5988", "user@" + host(), host() + ".some.domain",
                                   std::string("LOCALHOST"), std::string("127.0.0.1"), std::string("[::1]:5989")}) {
     EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", "https://" + name + '/' + corePath("P0.C0"), "ElementName"}),
               success(corePath("P0.C0") + "\n  InstanceID   P0.C0\n  ElementName  Core 0\n"))
