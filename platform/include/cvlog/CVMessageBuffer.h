@@ -75,10 +75,12 @@ class CVMessageBuffer {
   /// one that a living CVMessageBuffer handed out; any other yields the empty text.
   static std::string str(std::ostream& stream);
   static std::string str(CVMessageBuffer& buffer) {
-    if (buffer.stream_ != nullptr) {
-      buffer.resetStream();
+    if (buffer.stream_ == nullptr) {
+      return std::exchange(buffer.text_, std::string());
     }
-    std::string text = std::move(buffer.text_);
+    buffer.resetStream();
+    // A copy: the next text grows value by value, too, and finds the room of this one.
+    std::string text = buffer.text_;
     buffer.text_.clear();
     return text;
   }
