@@ -50,6 +50,8 @@ std::ptrdiff_t countOpenDescriptors() {
 
 LogTest::LogTest() : directory_(testing::TempDir() + "log_test_" + std::to_string(getpid())) {
   std::filesystem::create_directories(directory_);
+  const std::lock_guard lock(mutex);
+  records.clear();
 }
 
 LogTest::~LogTest() {
