@@ -7,7 +7,7 @@
 
 #include "bench/RecordFilling.h"
 #include "bench/Rows.h"
-#include "platform/instrumentation/ProcessTree.h"
+#include "platform/inventory/ProcessTree.h"
 
 namespace Corvane::Bench {
 

@@ -7,7 +7,7 @@
 #include <fstream>
 
 #include "bench/Rows.h"
-#include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/inventory/tree/JsonTree.h"
 
 namespace Corvane::Bench {
 namespace {

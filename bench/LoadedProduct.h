@@ -7,7 +7,7 @@
 #include <string>
 
 #include "bench/NullBroker.h"
-#include "platform/instrumentation/tree/Tree.h"
+#include "platform/inventory/tree/Tree.h"
 
 namespace Corvane::Bench {
 

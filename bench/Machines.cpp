@@ -1,6 +1,6 @@
 #include "bench/Machines.h"
 
-#include "platform/instrumentation/tree/TreeBuilder.h"
+#include "platform/inventory/tree/TreeBuilder.h"
 
 namespace Corvane::Bench {
 namespace {

@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <string>
 
-#include "platform/instrumentation/tree/Tree.h"
+#include "platform/inventory/tree/Tree.h"
 
 namespace Corvane::Bench {
 

@@ -3,7 +3,7 @@
 #include <string>
 
 #include "bench/Rows.h"
-#include "platform/instrumentation/smbios/Tables.h"
+#include "platform/inventory/sources/smbios/Tables.h"
 #include "tests/support/SmbiosEncoder.h"
 
 namespace Corvane::Bench {

@@ -8,12 +8,12 @@
 #include <vector>
 
 #include "bench/Rows.h"
-#include "platform/instrumentation/files/FileSystem.h"
-#include "platform/instrumentation/files/OverlayFileSystem.h"
-#include "platform/instrumentation/files/RecordingFileSystem.h"
-#include "platform/instrumentation/firmware/FirmwareTables.h"
-#include "platform/instrumentation/live/LiveSource.h"
-#include "platform/instrumentation/tree/PropertyTable.h"
+#include "platform/inventory/sources/files/FileSystem.h"
+#include "platform/inventory/sources/files/OverlayFileSystem.h"
+#include "platform/inventory/sources/files/RecordingFileSystem.h"
+#include "platform/inventory/sources/firmware/FirmwareTables.h"
+#include "platform/inventory/sources/live/LiveSource.h"
+#include "platform/inventory/tree/PropertyTable.h"
 #include "tests/support/SmbiosEncoder.h"
 
 namespace Corvane::Bench {

@@ -6,7 +6,7 @@
 
 #include <algorithm>
 #include <iterator>
-#include "platform/instrumentation/tree/PropertyTable.h"
+#include "platform/inventory/tree/PropertyTable.h"
 
 namespace Tarn::ComputerSystemProvider {
 namespace {

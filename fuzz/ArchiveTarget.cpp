@@ -2,9 +2,9 @@
 // a tree of them or says why not.
 
 #include "fuzz/Target.h"
-#include "platform/instrumentation/files/Archive.h"
-#include "platform/instrumentation/live/LiveSource.h"
-#include "platform/instrumentation/tree/Error.h"
+#include "platform/inventory/sources/files/Archive.h"
+#include "platform/inventory/sources/live/LiveSource.h"
+#include "platform/inventory/tree/Error.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   using namespace Tarn::Inventory;

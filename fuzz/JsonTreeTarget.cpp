@@ -1,8 +1,8 @@
 // The reader of trees in JSON: what it accepts is written and read back as the same tree.
 
 #include "fuzz/Target.h"
-#include "platform/instrumentation/tree/Error.h"
-#include "platform/instrumentation/tree/JsonTree.h"
+#include "platform/inventory/tree/Error.h"
+#include "platform/inventory/tree/JsonTree.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   using namespace Tarn::Inventory;

@@ -1,8 +1,8 @@
 // Masking the firmware's table: it keeps its shape and what is wrong with it, and masking it twice changes nothing.
 
 #include "fuzz/Target.h"
-#include "platform/instrumentation/smbios/Tables.h"
-#include "platform/instrumentation/snapshot/SmbiosMask.h"
+#include "platform/inventory/sources/smbios/Tables.h"
+#include "platform/inventory/sources/snapshot/SmbiosMask.h"
 
 namespace {
 

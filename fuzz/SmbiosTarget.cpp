@@ -5,7 +5,7 @@
 #include <span>
 
 #include "fuzz/Target.h"
-#include "platform/instrumentation/smbios/Tables.h"
+#include "platform/inventory/sources/smbios/Tables.h"
 
 namespace {
 

@@ -5,7 +5,7 @@
 #include <set>
 #include <stdexcept>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 
 namespace Registration {
 namespace {

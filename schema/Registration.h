@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 
 /// The registration of a library's providers, rendered from the host's class table: the one list of
 /// classes, providers, libraries and process groups.

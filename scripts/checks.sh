@@ -67,13 +67,13 @@ check_versions() {
 # The keys of the configuration: those that the library reads, those of the file, those that are described.
 check_keys() {
   local keys
-  keys=$(sed -n '/eys = {/,/};/p' platform/common/Configuration.cpp | grep -o '"[a-z.]*"' | tr -d '"' | sort)
+  keys=$(sed -n '/eys = {/,/};/p' platform/base/Configuration.cpp | grep -o '"[a-z.]*"' | tr -d '"' | sort)
   diff <(echo "$keys") <(sed -n 's/^#\([a-z.]*\) = .*/\1/p' packaging/corvane.conf | sort) ||
-    { echo "packaging/corvane.conf has other keys than platform/common/Configuration.cpp" && return 1; }
+    { echo "packaging/corvane.conf has other keys than platform/base/Configuration.cpp" && return 1; }
   # shellcheck disable=SC2016
   diff <(echo "$keys") <(sed -n '/^## The configuration file/,/^## /s/^| \(`[^|]*`\) |.*/\1/p' docs/logging.md |
     tr -d '`,' | xargs -n 1 | sort) ||
-    { echo "docs/logging.md describes other keys than platform/common/Configuration.cpp" && return 1; }
+    { echo "docs/logging.md describes other keys than platform/base/Configuration.cpp" && return 1; }
 }
 
 check_format() {

@@ -4,10 +4,10 @@
 #include <mutex>
 #include <stdexcept>
 
-#include "host/ClassTable.h"
 #include "host/broker/Arena.h"
 #include "host/broker/BrokerTables.h"
 #include "host/broker/Request.h"
+#include "schema/ClassTable.h"
 
 namespace Corvcim {
 namespace {

@@ -1,9 +1,9 @@
 #ifndef CORVCIM_BROKER_H
 #define CORVCIM_BROKER_H
 
-#include "host/broker/Names.h"
 #include "host/broker/Operation.h"
 #include "host/broker/ServiceMonitor.h"
+#include "schema/Names.h"
 
 #include <cmpift.h>
 

@@ -3,9 +3,9 @@
 #include <algorithm>
 #include <functional>
 
-#include "host/broker/Names.h"
 #include "host/broker/ProviderProcess.h"
-#include "platform/common/NearestName.h"
+#include "platform/base/NearestName.h"
+#include "schema/Names.h"
 
 namespace Corvcim {
 namespace {

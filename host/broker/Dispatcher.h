@@ -1,8 +1,8 @@
 #ifndef CORVCIM_DISPATCHER_H
 #define CORVCIM_DISPATCHER_H
 
-#include "host/ClassTable.h"
 #include "host/broker/Operation.h"
+#include "schema/ClassTable.h"
 
 #include <map>
 #include <memory>

@@ -2,7 +2,7 @@
 
 #include <ostream>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 
 namespace Corvcim {
 

@@ -1,8 +1,8 @@
 #include <algorithm>
 
-#include "host/ClassTable.h"
 #include "host/broker/Call.h"
-#include "host/broker/Names.h"
+#include "schema/ClassTable.h"
+#include "schema/Names.h"
 
 namespace Corvcim {
 namespace {

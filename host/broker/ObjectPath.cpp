@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <ostream>
 
-#include "host/broker/Names.h"
+#include "schema/Names.h"
 
 namespace Corvcim {
 namespace {

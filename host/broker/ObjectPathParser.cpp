@@ -7,9 +7,9 @@
 #include <limits>
 #include <optional>
 
-#include "host/ClassTable.h"
-#include "host/broker/Names.h"
 #include "host/broker/ObjectPath.h"
+#include "schema/ClassTable.h"
+#include "schema/Names.h"
 
 namespace Corvcim {
 namespace {

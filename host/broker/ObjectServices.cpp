@@ -1,6 +1,6 @@
-#include "host/ClassTable.h"
 #include "host/broker/BrokerTables.h"
 #include "host/broker/Call.h"
+#include "schema/ClassTable.h"
 
 namespace Corvcim {
 namespace {

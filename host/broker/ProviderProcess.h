@@ -7,9 +7,9 @@
 #include <memory>
 #include <string>
 
-#include "host/ClassTable.h"
 #include "host/broker/Channel.h"
 #include "host/broker/Operation.h"
+#include "schema/ClassTable.h"
 
 namespace Corvcim {
 

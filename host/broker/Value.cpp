@@ -6,8 +6,8 @@
 #include <ostream>
 
 #include "host/broker/Instance.h"
-#include "host/broker/Names.h"
 #include "host/broker/ObjectPath.h"
+#include "schema/Names.h"
 
 namespace Corvcim {
 namespace {

@@ -13,7 +13,7 @@
 #include <system_error>
 #include <utility>
 
-#include "platform/common/FileDescriptor.h"
+#include "platform/base/FileDescriptor.h"
 #include "platform/cvlog/Sink.h"
 
 namespace CVLog {

@@ -14,8 +14,8 @@
 #include <utility>
 #include <vector>
 
-#include "platform/common/ConfigurationFile.h"
-#include "platform/common/Environment.h"
+#include "platform/base/ConfigurationFile.h"
+#include "platform/base/Environment.h"
 #include "platform/cvlog/Settings.h"
 #include "platform/cvlog/Sink.h"
 

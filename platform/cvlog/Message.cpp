@@ -3,8 +3,8 @@
 #include <array>
 #include <cstdio>
 
-#include "platform/common/Ascii.h"
-#include "platform/common/Hex.h"
+#include "platform/base/Ascii.h"
+#include "platform/base/Hex.h"
 #include "platform/cvlog/Level.h"
 
 namespace CVLog {

@@ -4,7 +4,7 @@
 #include <limits>
 #include <utility>
 
-#include "platform/common/Ascii.h"
+#include "platform/base/Ascii.h"
 
 namespace CVLog {
 namespace {

@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/common/Configuration.h"
+#include "platform/base/Configuration.h"
 #include "platform/cvlog/Level.h"
 
 namespace CVLog {

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/common/Ascii.h"
+#include "platform/base/Ascii.h"
 
 namespace Tarn::Locale {
 namespace {

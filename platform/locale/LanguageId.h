@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-#include "platform/common/Configuration.h"
+#include "platform/base/Configuration.h"
 
 namespace Tarn::Locale {
 

@@ -6,10 +6,10 @@
 #include <optional>
 #include <string_view>
 
-#include "platform/common/Configuration.h"
-#include "platform/common/Environment.h"
-#include "platform/common/Report.h"
+#include "platform/base/Configuration.h"
+#include "platform/base/Environment.h"
 #include "platform/cvlog/Level.h"
+#include "platform/cvlog/Report.h"
 #include "platform/locale/LanguageId.h"
 #include "platform/locale/ResourceLibrary.h"
 

@@ -13,10 +13,10 @@
 #include "host/broker/Objects.h"
 #include "host/broker/ProviderLibrary.h"
 #include "host/broker/Request.h"
-#include "platform/instrumentation/tree/JsonTree.h"
-#include "platform/instrumentation/tree/PropertyTable.h"
-#include "platform/instrumentation/tree/TreeBuilder.h"
-#include "tests/host/cli/Program.h"
+#include "platform/inventory/tree/JsonTree.h"
+#include "platform/inventory/tree/PropertyTable.h"
+#include "platform/inventory/tree/TreeBuilder.h"
+#include "tests/host/corvcim/Program.h"
 #include "tests/support/UnionCopyingBroker.h"
 
 namespace Corvcim {

@@ -12,7 +12,7 @@
 #include <utility>
 #include <vector>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 #include "tests/library/LoadedLibrary.h"
 
 namespace {

@@ -3,7 +3,7 @@
 #include <cstdlib>
 #include <fstream>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 
 namespace Library {
 

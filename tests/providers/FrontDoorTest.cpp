@@ -2,8 +2,8 @@
 
 #include <algorithm>
 
-#include "host/ClassTable.h"
-#include "host/broker/Names.h"
+#include "schema/ClassTable.h"
+#include "schema/Names.h"
 #include "tests/providers/AssociationRows.h"
 
 namespace {

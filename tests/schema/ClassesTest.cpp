@@ -8,13 +8,13 @@
 #include <set>
 #include <string>
 
-#include "host/ClassTable.h"
-#include "host/DmtfClasses.h"
-#include "host/broker/Names.h"
 #include "host/broker/Value.h"
-#include "host/cli/ClassList.h"
-#include "host/cli/results/ValueNames.h"
+#include "host/corvcim/ClassList.h"
+#include "host/corvcim/results/ValueNames.h"
 #include "include/CPUClassNames.h"
+#include "schema/ClassTable.h"
+#include "schema/DmtfClasses.h"
+#include "schema/Names.h"
 #include "tests/schema/Mof.h"
 
 namespace Corvcim {

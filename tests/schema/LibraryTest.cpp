@@ -10,11 +10,11 @@
 #include <string>
 #include <vector>
 
-#include "host/ClassTable.h"
 #include "host/broker/Broker.h"
 #include "host/broker/Dispatcher.h"
-#include "host/broker/Names.h"
 #include "host/broker/ProviderLibrary.h"
+#include "schema/ClassTable.h"
+#include "schema/Names.h"
 #include "tests/schema/Mof.h"
 
 namespace Corvcim {

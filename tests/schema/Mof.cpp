@@ -6,7 +6,7 @@
 #include <iterator>
 #include <stdexcept>
 
-#include "host/broker/Names.h"
+#include "schema/Names.h"
 
 namespace Mof {
 namespace {

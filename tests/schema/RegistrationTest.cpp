@@ -10,7 +10,7 @@
 #include <set>
 #include <string>
 
-#include "host/ClassTable.h"
+#include "schema/ClassTable.h"
 
 namespace {
 

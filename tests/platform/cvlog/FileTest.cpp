@@ -18,7 +18,7 @@
 #include <thread>
 #include <vector>
 
-#include "platform/common/FileDescriptor.h"
+#include "platform/base/FileDescriptor.h"
 #include "tests/platform/cvlog/LogTest.h"
 
 namespace {

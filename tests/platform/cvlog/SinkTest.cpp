@@ -7,7 +7,7 @@
 #include <array>
 #include <csignal>
 
-#include "platform/common/FileDescriptor.h"
+#include "platform/base/FileDescriptor.h"
 #include "tests/platform/cvlog/LogTest.h"
 
 namespace {

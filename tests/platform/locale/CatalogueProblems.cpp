@@ -6,7 +6,7 @@
 #include <regex>
 #include <set>
 
-#include "platform/instrumentation/tree/Utf8.h"
+#include "platform/inventory/tree/Utf8.h"
 
 namespace {
 
