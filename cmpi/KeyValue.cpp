@@ -53,6 +53,12 @@ KeyValue reference(const CMPIObjectPath* path) {
   return path;
 }
 
+/// Types whose values show by themselves whether they are null. Some brokers deliver them in the state of a null value.
+bool isPointer(CMPIType type) {
+  return type == CMPI_string || type == CMPI_chars || type == CMPI_charsptr || type == CMPI_dateTime ||
+         type == CMPI_ref;
+}
+
 std::string quoted(std::string_view characters) {
   return '"' + std::string(characters) + '"';
 }
@@ -79,7 +85,7 @@ KeyValue keyValue(const CMPIData& data) {
   if ((data.state & (CMPI_badValue | CMPI_notFound)) != 0) {
     return NoKey{};
   }
-  if ((data.state & CMPI_nullValue) != 0) {
+  if ((data.state & CMPI_nullValue) != 0 && !isPointer(data.type)) {
     return NullValue{};
   }
   const CMPIValue& value = data.value;

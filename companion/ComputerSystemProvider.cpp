@@ -44,7 +44,7 @@ const char* keyText(const CMPIObjectPath* path, const char* name) {
   CMPIStatus status = {CMPI_RC_OK, nullptr};
   const CMPIData key = CMGetKey(path, name, &status);
   const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
-  return status.rc == CMPI_RC_OK && mayBeString && CPUProvider::hasValue(key)
+  return status.rc == CMPI_RC_OK && mayBeString && CPUProvider::isFound(key)
              ? CPUProvider::charsOrNull(key.value.string)
              : nullptr;
 }

@@ -24,11 +24,10 @@ bool isNull(const Object* object) {
   return object == nullptr || object->hdl == nullptr;
 }
 
-/// Whether a key or property has a value. Elements of an enumeration are tested by their pointer instead: some
-/// brokers deliver them in the state of a null value.
-inline bool hasValue(const CMPIData& data) {
-  constexpr CMPIValueState noValue = CMPI_nullValue | CMPI_notFound | CMPI_badValue;
-  return (data.state & noValue) == 0;
+/// Whether a key was found. It has a value if its pointer is not NULL: some brokers deliver values in the state of a
+/// null value.
+inline bool isFound(const CMPIData& key) {
+  return (key.state & (CMPI_notFound | CMPI_badValue)) == 0;
 }
 
 /// The text, or NULL when there is none. It lives as long as the string.

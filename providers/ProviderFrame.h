@@ -69,7 +69,7 @@ using CountRecords = unsigned short (CPUObjFactory::*)() const;
 inline CMPIString* stringKey(const CMPIObjectPath* path, const char* name, CMPIStatus* status = nullptr) {
   const CMPIData key = CMGetKey(path, name, status);
   const bool mayBeString = key.type == CMPI_string || key.type == CMPI_null;
-  return mayBeString && hasValue(key) && !isNull(key.value.string) ? key.value.string : nullptr;
+  return mayBeString && isFound(key) && !isNull(key.value.string) ? key.value.string : nullptr;
 }
 
 /// Results are counted in 16 bits.

@@ -147,6 +147,12 @@ TEST_F(ObjectPaths, TakeMissingValuesForNulls) {
   EXPECT_FALSE(equal(null, withKey(CMPI_string, {.string = broker_.string("")})));
 }
 
+TEST_F(ObjectPaths, CompareTextsAndReferencesInTheStateOfANullValue) {
+  Path& text = withKey(CMPI_string, {.string = broker_.string("a")}, CMPI_nullValue);
+  EXPECT_TRUE(equal(text, withKey(CMPI_string, {.string = broker_.string("a")})));
+  EXPECT_FALSE(equal(text, withKey(CMPI_string, {.string = broker_.string("b")}, CMPI_nullValue)));
+}
+
 TEST_F(ObjectPaths, WithAValueThatNoKeyCanHaveEqualNothing) {
   CMPIDateTime withoutTable{this, nullptr};
   for (Path* strange : {&withKey(CMPI_uint16A, {.array = nullptr}), &withKey(CMPI_instance, {.inst = nullptr}),

@@ -244,13 +244,14 @@ TEST_F(Companion, AKeyWithoutAStringIsMissing) {
   }
 }
 
-// Minimal brokers leave the type of a string open.
-TEST_F(Companion, AStringWithoutItsTypeIsAKey) {
+// Minimal brokers leave the type of a string open, others deliver it in the state of a null value.
+TEST_F(Companion, StringWithoutItsTypeInTheStateOfANullValueIsAKey) {
   Request request(broker_, "root/test");
   CMPIObjectPathFT table = objectPathOperations;
   table.getKey = [](const CMPIObjectPath* self, const char* name, CMPIStatus* status) {
     CMPIData key = objectPathOperations.getKey(self, name, status);
     key.type = CMPI_null;
+    key.state = CMPI_nullValue;
     return key;
   };
   CMPIObjectPath* path = request.objectPath(systemPath(Tarn::getSystemName()));

@@ -72,12 +72,16 @@ TEST_P(UnusualKeys, AStringWithoutItsTypeNamesItsInstance) {
 }
 
 TEST_P(UnusualKeys, WhatIsNotThereIsNoStringWithoutItsType) {
-  for (const CMPIValueState state :
-       std::initializer_list<CMPIValueState>{CMPI_nullValue, CMPI_notFound, CMPI_badValue}) {
+  for (const CMPIValueState state : std::initializer_list<CMPIValueState>{CMPI_notFound, CMPI_badValue}) {
     stateOfKeys = state;
     EXPECT_EQ(pathsOf(getInstanceReading(getKeyInState, path(row().identifiers[1]))), allPaths()) << state;
   }
   EXPECT_EQ(pathsOf(getInstanceReading(getKeyWithoutType, pathWithOtherKey())), allPaths());
+}
+
+TEST_P(UnusualKeys, StringInTheStateOfANullValueNamesItsInstance) {
+  stateOfKeys = CMPI_nullValue;
+  EXPECT_EQ(pathsOf(getInstanceReading(getKeyInState, path(row().identifiers[1]))), Paths{path(row().identifiers[1])});
 }
 
 TEST_P(UnusualKeys, AStringWithoutTextNamesNothing) {
