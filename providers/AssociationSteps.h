@@ -27,6 +27,20 @@ struct Association {
   mutable const char* filterKeys[3] = {first.name, second.name, nullptr};
 };
 
+/// A property that the associations of caches have beside their references, and the datum of the cache that it shows.
+struct CacheProperty {
+  const char* name;
+  CMPIUint16 CPUObjFactory::ProcCacheData::*datum;
+};
+
+inline constexpr CacheProperty cacheProperties[] = {
+    {"Level", &CPUObjFactory::ProcCacheData::level},
+    {"WritePolicy", &CPUObjFactory::ProcCacheData::writePolicy},
+    {"ReadPolicy", &CPUObjFactory::ProcCacheData::readPolicy},
+    {"CacheType", &CPUObjFactory::ProcCacheData::cacheType},
+    {"Associativity", &CPUObjFactory::ProcCacheData::associativity},
+};
+
 /// What is said of a failure: to the client, unless that is NULL, and in the log.
 struct FailureTexts {
   const char* status;

@@ -12,11 +12,9 @@ bool describeCache(const Association& association, CPUObjFactory* factory, CMPII
     association.events.message(LevelError, "Error retrieving CPU AssociatedCacheMemory data", line, function);
     return false;
   }
-  setProperty(instance, "Level", uint16Value, data.level);
-  setProperty(instance, "WritePolicy", uint16Value, data.writePolicy);
-  setProperty(instance, "ReadPolicy", uint16Value, data.readPolicy);
-  setProperty(instance, "CacheType", uint16Value, data.cacheType);
-  setProperty(instance, "Associativity", uint16Value, data.associativity);
+  for (const CacheProperty& property : cacheProperties) {
+    setProperty(instance, property.name, uint16Value, data.*property.datum);
+  }
   return true;
 }
 

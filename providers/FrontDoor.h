@@ -5,8 +5,8 @@
 
 #ifdef CORVANE_STANDARD_REQUESTS
 #include <algorithm>
+#include <initializer_list>
 #include <iterator>
-#include <span>
 #include <vector>
 #endif
 
@@ -41,6 +41,21 @@ inline bool admitsRole(const char* filter, const Reference& end) {
   return isAbsent(filter) || equalIgnoringCase(filter, end.name);
 }
 
+/// A property's name in the library's spelling; the name itself if it is none of these keys and no class has it.
+inline const char* spelledName(const char* name, std::initializer_list<const char*> keys) {
+  for (const char* key : keys) {
+    if (equalIgnoringCase(key, name)) {
+      return key;
+    }
+  }
+  for (const CacheProperty& property : cacheProperties) {
+    if (equalIgnoringCase(property.name, name)) {
+      return property.name;
+    }
+  }
+  return selectionName(name);
+}
+
 /// A property list in the library's spelling, with the keys that it leaves out. No list stays none.
 class PropertyList {
  public:
@@ -49,7 +64,7 @@ class PropertyList {
       return;
     }
     for (; *asked != nullptr; ++asked) {
-      names_.push_back(selectionName(*asked));
+      names_.push_back(spelledName(*asked, keys));
     }
     names_.insert(names_.end(), keys);
     names_.push_back(nullptr);

@@ -257,6 +257,25 @@ TEST_P(FrontDoor, EnumerationWithAPropertyListDeliversTheKeys) {
   }
 }
 
+TEST_P(FrontDoor, PropertyListReachesTheBrokerInTheSpellingOfTheLibrary) {
+  std::string names;
+  for (const Corvcim::PropertyDefinition& each : Corvcim::findClass(row().className)->properties) {
+    names += std::string(each.name) + ',';
+  }
+  Names asked;
+  for (const Corvcim::PropertyDefinition& each : Corvcim::findClass(row().className)->properties) {
+    asked.push_back(raised(std::string(each.name)));
+  }
+  const std::string expected = "properties {" + names + row().firstEnd + ',' + row().secondEnd + "} keys ";
+
+  broker.services().record(true);
+  enumerateInstances(row().className, asked);
+  const std::vector<std::string> filters = Support::detailsOf(broker.services().takeRecord(), "setPropertyFilter");
+
+  EXPECT_EQ(std::count(filters.begin(), filters.end(), expected + row().filterKeys),
+            static_cast<std::ptrdiff_t>(row().pairs().size()));
+}
+
 TEST_P(FrontDoor, GetInstanceWithAPropertyListFindsItsInstance) {
   for (const ObjectPath& path : allPaths()) {
     for (const Names& names : {Names(), Names{"NoSuchProperty"}}) {
