@@ -20,7 +20,7 @@ tracked() {
 check_hygiene() {
   local status=0 check
   cd "$root" || return
-  for check in check_texts check_versions check_keys check_documented_messages check_undocumented_messages; do
+  for check in check_texts check_versions check_keys check_folders check_documented_messages check_undocumented_messages; do
     $check || status=1
   done
   return $status
@@ -76,18 +76,32 @@ check_keys() {
     { echo "docs/logging.md describes other keys than platform/base/Configuration.cpp" && return 1; }
 }
 
+# Folders include each other in one direction. tsort names the folders of a circle.
+check_folders() {
+  local edges
+  edges=$(tracked '*.h' '*.cpp' | xargs -r grep -oE '^#include "[^"]+/[^"/]+"' /dev/null |
+    sed -E 's|/[^/:]*:#include "| |; s|/[^/]*"$||' | awk '$1 != $2' | sort -u)
+  tsort <<<"$edges" >/dev/null 2>&1 || {
+    echo "These folders include each other; the includes between them:"
+    tsort <<<"$edges" 2>&1 >/dev/null | sed -n 's/^tsort: //p' | grep -Fxf <(tr ' ' '\n' <<<"$edges") | sort -u >"$logs/circle"
+    grep -wFf "$logs/circle" <<<"$edges" | awk 'NR == FNR { circle[$0]; next } $1 in circle && $2 in circle' "$logs/circle" -
+    return 1
+  }
+}
+
 check_format() {
   cd "$root" || return
   tracked '*.h' '*.cpp' '*.c' | xargs -r clang-format --dry-run -Werror
 }
 
-# Every translation unit of the native build that is the repository's own; headers are seen through them.
+# Every translation unit of the native build that is the repository's own, each alone; headers are seen through them.
 # clang is told nothing that only GCC understands, its precompiled headers included.
 check_tidy() {
   local database=$root/build/tidy
   cd "$root" && mkdir -p "$database" || return
+  cmake --preset native -B build/native-each -DCMAKE_UNITY_BUILD=OFF -DCORVANE_TESTS=ON || return
   sed -E 's/ (-fno-gnu-unique|-Wno-restrict|-Winvalid-pch|-fpch-preprocess|-include [^ ]*cmake_pch\.hxx)//g' \
-    build/native/compile_commands.json >"$database/compile_commands.json"
+    build/native-each/compile_commands.json >"$database/compile_commands.json"
   tracked '*.cpp' | grep -Fxf <(sed -n "s|^ *\"file\": \"$root/\(.*\)\".*|\1|p" "$database/compile_commands.json") |
     xargs -r -P "$jobs" -n 1 clang-tidy --quiet -p "$database"
 }

@@ -17,7 +17,7 @@ messages() {
 # angle brackets or as an ellipsis; of words between slashes the message has one.
 check_documented_messages() {
   local sources texts words status=0
-  mapfile -t sources < <(tracked 'model/*' 'factory/*' 'providers/*' 'companion/*' 'platform/*.cpp' 'platform/*.h' \
+  mapfile -t sources < <(tracked 'model/*' 'factory/*' 'providers/*' 'companion/*' 'platform/*.cpp' 'platform/*.h' 'cmpi/*.cpp' \
     'host/*.cpp' 'host/*.h' 'packaging/register/*')
   texts=$(literals "${sources[@]}" | tr '"' "'")
   while IFS= read -r words; do

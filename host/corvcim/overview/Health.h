@@ -4,8 +4,8 @@
 #include <span>
 #include <string>
 
-#include "host/corvcim/overview/ProcessorState.h"
 #include "host/corvcim/options/Options.h"
+#include "host/corvcim/overview/ProcessorState.h"
 #include "host/corvcim/text/Outcome.h"
 
 namespace Corvcim {
