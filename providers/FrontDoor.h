@@ -5,7 +5,6 @@
 
 #ifdef CORVANE_STANDARD_REQUESTS
 #include <algorithm>
-#include <initializer_list>
 #include <iterator>
 #include <vector>
 #endif
@@ -41,32 +40,39 @@ inline bool admitsRole(const char* filter, const Reference& end) {
   return isAbsent(filter) || equalIgnoringCase(filter, end.name);
 }
 
-/// A property's name in the library's spelling; the name itself if it is none of these keys and no class has it.
-inline const char* spelledName(const char* name, std::initializer_list<const char*> keys) {
-  for (const char* key : keys) {
-    if (equalIgnoringCase(key, name)) {
-      return key;
+/// A property's name in the library's spelling; the name itself if neither the association nor any class of instances
+/// has that property.
+inline const char* spelledName(const char* name, const Association* association) {
+  if (association != nullptr) {
+    for (const Reference* end : {&association->first, &association->second}) {
+      if (equalIgnoringCase(end->name, name)) {
+        return end->name;
+      }
     }
-  }
-  for (const CacheProperty& property : cacheProperties) {
-    if (equalIgnoringCase(property.name, name)) {
-      return property.name;
+    for (const CacheProperty& property : cacheProperties) {
+      if (equalIgnoringCase(property.name, name)) {
+        return property.name;
+      }
     }
   }
   return selectionName(name);
 }
 
-/// A property list in the library's spelling, with the keys that it leaves out. No list stays none.
+/// A property list in the library's spelling. No list stays none.
 class PropertyList {
  public:
-  PropertyList(const char** asked, std::initializer_list<const char*> keys) : isGiven_(asked != nullptr) {
+  /// For instances of an association, its references are added if its filter does not let them pass as keys. The
+  /// factory's filters let the keys of all other instances pass.
+  explicit PropertyList(const char** asked, const Association* association = nullptr) : isGiven_(asked != nullptr) {
     if (!isGiven_) {
       return;
     }
     for (; *asked != nullptr; ++asked) {
-      names_.push_back(spelledName(*asked, keys));
+      names_.push_back(spelledName(*asked, association));
     }
-    names_.insert(names_.end(), keys);
+    if (association != nullptr && std::string_view(association->filterKeys[0]) != association->first.name) {
+      names_.insert(names_.end(), {association->first.name, association->second.name});
+    }
     names_.push_back(nullptr);
   }
 
@@ -77,15 +83,13 @@ class PropertyList {
   std::vector<const char*> names_;
 };
 
-/// The properties of instances of an association: its references are its keys.
 inline PropertyList ownProperties(const Association& association, const char** asked) {
-  return {asked, {association.first.name, association.second.name}};
+  return PropertyList(asked, &association);
 }
 
-/// The properties of instances whose keys the factory always sets.
 template <class Provider>
 PropertyList ownProperties(const Provider& /*provider*/, const char** asked) {
-  return {asked, {}};
+  return PropertyList(asked);
 }
 
 /// A request's source with its class in the library's spelling; the source itself if it is spelled so, or if the
@@ -128,7 +132,7 @@ struct AssociationFilter {
 template <class Perform>
 CMPIStatus performOrdinary(const Association& association, const CMPIResult* result, const CMPIObjectPath* source,
                            const AssociationFilter& filter, Perform perform) {
-  const std::string_view sourceClass = classNameOf(source);
+  const std::string_view sourceClass = isNull(source) ? "" : classNameOf(source);
   const bool startsAtFirst = equalIgnoringCase(sourceClass, association.first.objectClass);
   const bool startsAtSecond = equalIgnoringCase(sourceClass, association.second.objectClass);
   const Reference& near = startsAtFirst ? association.first : association.second;
@@ -172,7 +176,7 @@ struct Ordinary<Operation, Provider,
     return performOrdinary(Provider, result, source, {assocClass, resultClass, role, resultRole},
                            [&](const CMPIObjectPath* spelled, const char* farClass) {
                              return Operation(mi, context, result, spelled, Provider.className, farClass, role,
-                                              resultRole, PropertyList(properties, {}).names()...);
+                                              resultRole, PropertyList(properties).names()...);
                            });
   }
 };

@@ -36,11 +36,8 @@ constexpr Change changes[] = {
     {"SystemDevice.AnyOtherResultClassFindsNothing"},
     // The role is another.
     {"AssociationNavigation.RolesPlayNoPart"},
-    // A property list names the keys, too.
-    {"AssociationEnumeration.FiltersPropertiesByItsKeyList"},
-    {"AssociationNavigation.ReferencesAreFilteredByTheirKeyList", "HALDA_CPUAssociatedCacheMemory"},
-    {"AssociationNavigation.ReferencesAreFilteredByTheirKeyList", coreCaches},
-    {"AssociationNavigation.ReferencesAreFilteredByTheirKeyList", "HALDA_CPUConcreteComponent"},
+    // The key list does not name the keys, so a property list does.
+    {"AssociationEnumeration.FiltersPropertiesByItsKeyList", capabilities},
     {"AssociationEnumeration.PropertyListLeavesWhatItAndTheKeyListName", capabilities},
     {"AssociationGetInstance.PropertyListReachesTheInstance", capabilities},
     // This association logs the classes of a request, which the front door fills in.
