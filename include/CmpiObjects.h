@@ -65,6 +65,8 @@ struct ValueType {
   CMPIType code;
   Content CMPIValue::*member;
 };
+template <class Content>
+ValueType(CMPIType, Content CMPIValue::*) -> ValueType<Content>;  // clang before 17 needs this for an aggregate
 
 inline constexpr ValueType booleanValue{CMPI_boolean, &CMPIValue::boolean};
 inline constexpr ValueType uint16Value{CMPI_uint16, &CMPIValue::uint16};
