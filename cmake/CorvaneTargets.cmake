@@ -19,8 +19,14 @@ endif()
 # Nothing that is installed knows where it was built, and two builds of one commit are alike.
 target_compile_options(corvane_options INTERFACE
   -ffile-prefix-map=${PROJECT_BINARY_DIR}/= -ffile-prefix-map=${PROJECT_SOURCE_DIR}/=)
+# Sources are compiled in batches; the linker leaves out what a library does not call.
+target_compile_options(corvane_options INTERFACE -ffunction-sections -fdata-sections)
+target_link_options(corvane_options INTERFACE -Wl,--gc-sections)
 target_compile_definitions(corvane_options INTERFACE _FILE_OFFSET_BITS=64)
 target_include_directories(corvane_options INTERFACE ${PROJECT_SOURCE_DIR})
+
+# For code that runs once, or waits for the kernel: what counts there is how much of it a daemon maps.
+set(CORVANE_SMALL $<$<NOT:$<BOOL:${CORVANE_SANITIZE}>>:-Os>)
 
 if(CORVANE_SANITIZE)
   # Before every target's own options, so that these can take something back.

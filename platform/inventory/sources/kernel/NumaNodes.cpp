@@ -15,10 +15,14 @@ std::vector<NumaNode> readNumaNodes(Machine& machine) {
   machine.root().files().list(directory, names);
   std::vector<NumaNode> nodes;
   for (const std::string& name : names) {
-    const std::optional<unsigned int> number =
-        name.starts_with(prefix) ? Attributes::toNumber(std::string_view(name).substr(prefix.size())) : std::nullopt;
-    const bool isNode = number && name == "node" + std::to_string(*number);
-    std::optional<CpuSet> cpus = isNode ? machine.root().list(directory, "/node", *number, "/cpulist") : std::nullopt;
+    if (!name.starts_with(prefix)) {
+      continue;
+    }
+    const std::optional<unsigned int> number = Attributes::toNumber(std::string_view(name).substr(prefix.size()));
+    if (!number || name != "node" + std::to_string(*number)) {
+      continue;
+    }
+    std::optional<CpuSet> cpus = machine.root().list(directory, "/node", *number, "/cpulist");
     if (cpus && !cpus->empty()) {
       nodes.push_back({*number, *std::move(cpus)});
     }
