@@ -40,7 +40,7 @@ std::size_t countCores(const nlohmann::json& nodes) {
 
 std::vector<std::string> machines() {
   std::vector<std::string> names;
-  for (const auto& entry : std::filesystem::directory_iterator(CORVANE_SOURCE_DIR "/tests/fixtures")) {
+  for (const auto& entry : std::filesystem::directory_iterator(Library::fixtures)) {
     std::ifstream file(entry.path() / "tree.json");
     if (!file) {
       continue;

@@ -66,7 +66,7 @@ Environment::Variables quietly(const std::string& inventory) {
 }
 
 std::string fixture(const std::string& machine) {
-  return "json:" CORVANE_SOURCE_DIR "/tests/fixtures/" + machine + "/tree.json";
+  return "json:" + fixtures + machine + "/tree.json";
 }
 
 LoadedLibrary::LoadedLibrary(Corvcim::LoadScope scope) : library_(file, scope) {

@@ -33,7 +33,10 @@ class Environment {
 /// What the library reads its inventory from; it logs nowhere and reads no configuration of the machine.
 Environment::Variables quietly(const std::string& inventory);
 
-/// "json:" and the tree of one of the machines in tests/fixtures.
+/// The machines of tests/fixtures, with the generated ones.
+inline const std::string fixtures = CORVANE_BINARY_DIR "/tests/fixtures/";
+
+/// "json:" and the tree of one of these machines.
 std::string fixture(const std::string& machine);
 
 /// The library, loaded, with a broker that knows one computer system.

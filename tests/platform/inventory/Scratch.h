@@ -6,8 +6,8 @@
 
 namespace Tarn::Inventory {
 
-/// The captured machines of the tests.
-inline const std::string fixtures = CORVANE_SOURCE_DIR "/tests/fixtures/";
+/// The machines of tests/fixtures, with the generated ones.
+inline const std::string fixtures = CORVANE_BINARY_DIR "/tests/fixtures/";
 
 /// A directory that is gone after the test.
 class ScratchDirectory {
