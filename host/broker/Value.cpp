@@ -30,6 +30,8 @@ template <class... Ts>
 struct Overloaded : Ts... {
   using Ts::operator()...;
 };
+template <class... Functions>
+Overloaded(Functions...) -> Overloaded<Functions...>;  // clang before 17 needs this for an aggregate
 
 std::string realText(double value) {
   std::array<char, 32> buffer{};

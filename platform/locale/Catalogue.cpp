@@ -1,7 +1,7 @@
 #include "platform/locale/Catalogue.h"
 
+#include <algorithm>
 #include <iterator>
-#include <ranges>
 
 #include "platform/locale/LanguageId.h"
 
@@ -58,12 +58,11 @@ std::vector<std::string> translatedLanguages() {
   std::vector<std::string> languages;
   for (const Catalogue& catalogue : catalogues()) {
     // Language ids are ASCII.
-    const auto narrow =
-        std::views::transform(catalogue.language, [](wchar_t letter) { return static_cast<char>(letter); });
-    languages.emplace_back(narrow.begin(), narrow.end());
+    std::ranges::transform(catalogue.language, std::back_inserter(languages.emplace_back()),
+                           [](wchar_t letter) { return static_cast<char>(letter); });
   }
   std::ranges::sort(languages);
-  languages.erase(std::ranges::unique(languages).begin(), languages.end());
+  languages.erase(std::unique(languages.begin(), languages.end()), languages.end());
   return languages;
 }
 
