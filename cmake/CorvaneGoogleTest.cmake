@@ -12,15 +12,15 @@ foreach(library gtest gmock gtest_main gmock_main)
 endforeach()
 include(GoogleTest)
 
-# Tests are compiled to be built soon, not to be fast, and share one precompiled header: most of a
-# test's compile time is GoogleTest's own headers.
+# Tests are compiled for a short build time and share one precompiled header: GoogleTest's headers take most of a
+# test's compile time.
 add_library(corvane_test_options INTERFACE)
 target_compile_options(corvane_test_options INTERFACE -O0 $<$<COMPILE_LANGUAGE:CXX>:-fpch-preprocess>
-  # In a unity build, GCC takes fixtures in unnamed namespaces for something that two sources share.
+  # In a unity build, GCC warns as if several sources shared the fixtures in unnamed namespaces.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-subobject-linkage>)
 if(CORVANE_SANITIZE MATCHES undefined)
-  # The sources under test are checked for undefined behaviour, the tests' own only for invalid accesses: GoogleTest's
-  # templates take twice the compile time otherwise.
+  # The undefined-behaviour sanitizer checks the sources under test, not those of the tests: it doubles the compile time
+  # of GoogleTest's templates.
   target_compile_options(corvane_test_options INTERFACE -fno-sanitize=undefined)
 endif()
 target_link_libraries(corvane_test_options INTERFACE corvane_options gmock gtest_main)
@@ -33,13 +33,13 @@ target_link_libraries(corvane_test_headers PRIVATE corvane_test_options)
 target_precompile_headers(corvane_test_headers PRIVATE $<$<COMPILE_LANGUAGE:CXX>:<gmock/gmock.h$<ANGLE-R>>)
 
 # corvane_test(NAME SOURCES file... [LINK target...] [ISOLATED])
-# One executable with GoogleTest's main. ISOLATED runs each test in a process of its own, for what
-# depends on the state of a fresh process.
+# One executable with GoogleTest's main. ISOLATED runs each test in a separate process, for tests
+# that need a fresh one.
 function(corvane_test name)
   cmake_parse_arguments(ARG "ISOLATED" "" "SOURCES;LINK" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
   target_link_libraries(${name} PRIVATE corvane_test_options ${ARG_LINK})
-  if(NOT ARG_SOURCES MATCHES "\\.c(;|$)")  # the precompiled header is for C++ alone
+  if(NOT ARG_SOURCES MATCHES "\\.c(;|$)")  # the precompiled header is C++ only
     target_precompile_headers(${name} REUSE_FROM corvane_test_headers)
   endif()
   if(ARG_ISOLATED)

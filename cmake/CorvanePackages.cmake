@@ -15,15 +15,15 @@ set(CPACK_PACKAGE_CONTACT "Corvane maintainers <maintainers@corvane.example>")
 set(CPACK_PACKAGE_DIRECTORY ${PROJECT_BINARY_DIR}/packages)
 set(CPACK_VERBATIM_VARIABLES ON)
 set(CPACK_STRIP_FILES ON)
-# The configuration lies in /etc whatever the prefix is, so files are staged below a root of their own.
+# The configuration is in /etc for every prefix, so files are staged below a separate root.
 set(CPACK_SET_DESTDIR ON)
 
 set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_COMPONENTS_ALL provider tools)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
 set(CPACK_DEBIAN_PACKAGE_SECTION admin)
-# Spelled out, because dpkg-shlibdeps names Debian's 32-bit libraries for 64-bit systems when it
-# looks at a 32-bit build there. scripts/check-packages compares them with what the files need.
+# A fixed list, because on a 64-bit system dpkg-shlibdeps names the 64-bit system's 32-bit libraries for a 32-bit build.
+# scripts/check-packages compares the list with the libraries that the files need.
 set(CPACK_DEBIAN_PACKAGE_DEPENDS "libc6 (>= 2.34), libgcc-s1 (>= 3.3.1), libstdc++6 (>= 12)")
 
 set(CPACK_DEBIAN_PROVIDER_PACKAGE_NAME corvane-cpu-provider)
@@ -37,8 +37,8 @@ if(CORVANE_HWLOC AND CORVANE_HWLOC_USABLE)
   set(CPACK_DEBIAN_TOOLS_PACKAGE_RECOMMENDS "libhwloc15 (>= 2.4.0)")
 endif()
 
-# What CPack does not know: Multi-Arch, a description for each package, compressed manual pages, a
-# reproducible archive.
+# Adds what CPack cannot write: Multi-Arch, a description for each package, compressed manual pages, a reproducible
+# archive.
 set(CPACK_POST_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/packaging/debian/FinishPackages.cmake)
 
 include(CPack)

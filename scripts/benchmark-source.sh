@@ -1,13 +1,12 @@
 # Google Benchmark's source for scripts/bench. Sourced after common.sh.
 # shellcheck shell=bash disable=SC2154
 #
-# Debian has the library for one ABI at a time; its source package serves both. apt fetches that with
-# a configuration of its own, made from the repositories the system already uses: no file of the
-# system changes.
+# Debian's binary packages serve one ABI at a time, the source package both. apt fetches it with a separate
+# configuration, made from the system's repositories; no file of the system changes.
 
 benchmark_source=$root/build/downloads/benchmark
 
-# One deb-src line for the release's main repository, in apt's own reading of the system's sources.
+# One deb-src line for the release's main repository, from the sources as apt reads them.
 source_lines() {
   local codename
   # shellcheck source=/dev/null

@@ -1,4 +1,4 @@
-# Checks of the sources themselves, for scripts/test. Sourced after common.sh.
+# Checks of the sources, for scripts/test. Sourced after common.sh.
 # shellcheck shell=bash disable=SC2154
 
 longest_source=500
@@ -8,7 +8,7 @@ tracked() {
   cd "$root" || return
   # The tree may belong to another user (a mounted checkout in a container); reading it is harmless.
   if git -c safe.directory='*' rev-parse --git-dir >/dev/null 2>&1; then
-    # A file that was deleted but not yet committed is still listed.
+    # git lists a deleted file until the deletion is committed.
     git -c safe.directory='*' ls-files -- "$@" | while read -r file; do [[ ! -e $file ]] || echo "$file"; done
   else
     local pattern names=(-false)
@@ -26,7 +26,7 @@ check_hygiene() {
   return $status
 }
 
-# Captures under tests/fixtures are kept as the machine wrote them.
+# Captures in tests/fixtures stay as the machine wrote them.
 check_texts() {
   local texts sources file lines status=0
   mapfile -t texts < <(tracked | grep -v '^tests/fixtures/' | xargs -r -d '\n' grep -lI .)
@@ -43,14 +43,14 @@ check_texts() {
   return $status
 }
 
-# same_version VERSION FILE SED-COMMAND: whether the versions that the command prints are all this one.
+# same_version VERSION FILE SED-COMMAND: whether the command prints only this version.
 same_version() {
   local found
   found=$(sed -En "$3" "$2" | sort -u | xargs)
   [[ $found == "$1" ]] || { echo "$2: version ${found:-missing}, but $1 in CMakeLists.txt" && return 1; }
 }
 
-# The build takes the version from CMakeLists.txt; these places cannot, and have it once more.
+# The build takes the version from CMakeLists.txt; these files repeat it.
 check_versions() {
   local version number='([0-9]+(\.[0-9]+)+)' status=0 file
   version=$(sed -En "s/^project\(.* VERSION $number.*/\1/p" CMakeLists.txt)
@@ -64,7 +64,7 @@ check_versions() {
   return $status
 }
 
-# The keys of the configuration: those that the library reads, those of the file, those that are described.
+# The keys of the configuration: in the library, in the installed file and in the documentation.
 check_keys() {
   local keys
   keys=$(sed -n '/eys = {/,/};/p' platform/base/Configuration.cpp | grep -o '"[a-z.]*"' | tr -d '"' | sort)
@@ -76,7 +76,7 @@ check_keys() {
     { echo "docs/logging.md describes other keys than platform/base/Configuration.cpp" && return 1; }
 }
 
-# Folders include each other in one direction. tsort names the folders of a circle.
+# Folders include each other in one direction. tsort lists the folders of a cycle.
 check_folders() {
   local edges
   edges=$(tracked '*.h' '*.cpp' | xargs -r grep -oE '^#include "[^"]+/[^"/]+"' /dev/null |
@@ -94,8 +94,8 @@ check_format() {
   tracked '*.h' '*.cpp' '*.c' | xargs -r clang-format --dry-run -Werror
 }
 
-# Every translation unit of the native build that is the repository's own, each alone; headers are seen through them.
-# clang is told nothing that only GCC understands, its precompiled headers included.
+# Each source of the native build that belongs to the repository, alone; clang-tidy checks headers through them.
+# Options that only GCC understands are removed, including its precompiled headers.
 check_tidy() {
   local database=$root/build/tidy
   cd "$root" && mkdir -p "$database" || return

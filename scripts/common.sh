@@ -1,4 +1,4 @@
-# What the scripts of this directory share. Sourced, not run.
+# Shared by the scripts of this directory. Sourced, not run.
 # shellcheck shell=bash disable=SC2034
 
 set -euo pipefail
@@ -8,18 +8,18 @@ logs=$root/build/logs
 jobs=$(nproc)
 failures=0
 
-# Overrides of the product that a user may have exported must not leak into what the scripts run.
+# A user's exported overrides of the product must not change the results of the scripts.
 unset "${!CORVANE_@}"
 
-# CMake takes the launcher from here when it configures a build directory for the first time.
+# CMake reads the launcher when it configures a build directory for the first time.
 if [[ -z ${CMAKE_CXX_COMPILER_LAUNCHER:-} ]] && command -v ccache >/dev/null; then
   export CMAKE_CXX_COMPILER_LAUNCHER=ccache
 fi
-export CCACHE_SLOPPINESS=pch_defines,time_macros # what it takes to cache with precompiled headers
+export CCACHE_SLOPPINESS=pch_defines,time_macros # required to cache with precompiled headers
 
-# Debian packages, by what they are needed for; docs/dependencies.md says why each is there.
+# Debian packages by purpose; docs/dependencies.md gives the reason for each.
 build_packages=(cmake g++ g++-multilib ninja-build nlohmann-json3-dev)
-hwloc_packages=(libhwloc-dev) # corvcim builds without it, and then says so
+hwloc_packages=(libhwloc-dev) # optional
 test_packages=(googletest)
 check_packages=(clang-format)
 tidy_packages=(clang-tidy)
@@ -30,11 +30,11 @@ die() {
   exit 1
 }
 
-# The usage text of a script is its own leading comment.
+# The usage text of a script is its leading comment.
 usage() { sed -n '2,/^$/{s/^# \{0,1\}//p;}' "$0"; }
 
-# step NAME COMMAND...: runs a command with its output in a log. One line when it succeeds, the whole
-# log when it fails; the caller decides whether to go on.
+# step NAME COMMAND...: runs a command with its output in a log. Prints one line on success, the whole
+# log on failure; the caller decides whether to continue.
 step() {
   local name=$1 log start=$SECONDS
   shift
@@ -53,7 +53,7 @@ step() {
   return 1
 }
 
-# installed PACKAGE: whether dpkg has it.
+# installed PACKAGE: whether it is installed.
 installed() { dpkg-query -W -f '${db:Status-Status}\n' "$1" 2>/dev/null | grep -qx installed; }
 
 apt_install() {
@@ -64,7 +64,7 @@ apt_install() {
       apt-get -o DPkg::Lock::Timeout=300 -y --no-install-recommends install "$@"
 }
 
-# need PACKAGE...: installs the Debian packages that are missing; no apt call when none is.
+# need PACKAGE...: installs the missing ones; without any, apt is not called.
 need() {
   local missing=() package
   command -v dpkg-query >/dev/null || die "no dpkg on this system; install the counterparts of: $*"

@@ -1,20 +1,21 @@
 # Compares the messages in docs/operations.md with those of the sources. Sourced after checks.sh.
 # shellcheck shell=bash disable=SC2154
 
-# literals FILE...: sources with each text in one piece, runs of blanks as one, quotes in texts as apostrophes.
+# literals FILE...: the sources, with adjacent string literals joined, runs of blanks as one, and quotes in texts as
+# apostrophes.
 literals() {
   sed "s|^ *//.*||; s|  // .*||; s/'\"'//g" "$@" | tr -s '[:space:]' ' ' | sed "s/\" \"//g; s/\\\\\"/'/g"
 }
 
-# messages TITLE: what stands in backticks in the first column of tables, from that section on.
+# messages TITLE: the texts in backticks in the first column of tables, from that section on.
 messages() {
   # shellcheck disable=SC2016
   sed -n "/^## $1/,\$p" docs/operations.md | sed -n 's/^| \(`.*`[^|]*\) | .*/\1/p' | grep -o '`[^`]*`' |
     tr -d '\`' | tr '"' "'" | tr -s ' '
 }
 
-# A documented message whose fixed words no source has was changed or removed. What varies in it stands in
-# angle brackets or as an ellipsis; of words between slashes the message has one.
+# The fixed words of each documented message must be in a source. Angle brackets and ellipses stand for variable parts;
+# of words between slashes the message has one.
 check_documented_messages() {
   local sources texts words status=0
   mapfile -t sources < <(tracked 'model/*' 'factory/*' 'providers/*' 'companion/*' 'platform/*.cpp' 'platform/*.h' 'cmpi/*.cpp' \
@@ -27,7 +28,7 @@ check_documented_messages() {
   return $status
 }
 
-# What the product and the companion say of a failure is one text each, so each must have its row.
+# Each error text of the product and the companion must have a row.
 check_undocumented_messages() {
   local sources patterns text pattern status=0
   mapfile -t sources < <(tracked 'model/*' 'factory/*' 'providers/*' 'companion/*.cpp' 'companion/*.h')

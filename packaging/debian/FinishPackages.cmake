@@ -1,4 +1,4 @@
-# Run by CPack on the packages that it made: brings them into the form that Debian's policy asks for.
+# CPack runs this on its packages: it brings them into the form that Debian's policy requires.
 
 set(finish "${CMAKE_CURRENT_LIST_DIR}/finish-package")
 foreach(package IN LISTS CPACK_PACKAGE_FILES)
