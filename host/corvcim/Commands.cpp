@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <exception>
 #include <iterator>
 #include <memory>
 #include <optional>
@@ -150,6 +151,19 @@ Outcome runWithInventory(const Options& options, std::size_t width) {
   return outcome;
 }
 
+/// Monitoring takes the exit status of any other failure for a degraded processor.
+Outcome runOnSource(const Options& options, std::size_t width) {
+  try {
+    setInventory(options);
+    return runWithInventory(options, width);
+  } catch (const std::exception& error) {
+    if (options.verb->verb != Verb::Health) {
+      throw;
+    }
+    return unknownHealth(error.what());
+  }
+}
+
 }  // namespace
 
 Outcome runCommand(const Options& options, std::size_t width) {
@@ -162,8 +176,7 @@ Outcome runCommand(const Options& options, std::size_t width) {
   if (options.verb->verb == Verb::Diff) {
     outcome = diffInventories(options);
   } else {
-    setInventory(options);
-    outcome = runWithInventory(options, width);
+    outcome = runOnSource(options, width);
   }
   outcome.remarks.insert(outcome.remarks.begin(), std::make_move_iterator(remarks.begin()),
                          std::make_move_iterator(remarks.end()));

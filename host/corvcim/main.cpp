@@ -72,8 +72,9 @@ int wrongUsage(std::span<const char* const> arguments, const std::string& what) 
   if (std::ranges::find(arguments, std::string_view("health")) == arguments.end()) {
     return WrongUsage;
   }
-  Corvcim::writeOutput(Corvcim::unknownHealth(what));
-  return Corvcim::healthStatus(Corvcim::Severity::Unknown);
+  const Corvcim::Outcome unknown = Corvcim::unknownHealth(what);
+  Corvcim::writeOutput(unknown.output);
+  return *unknown.status;
 }
 
 }  // namespace

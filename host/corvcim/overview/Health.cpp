@@ -7,6 +7,7 @@
 #include "host/broker/Dispatcher.h"
 #include "host/corvcim/operations/Libraries.h"
 #include "host/corvcim/operations/Operations.h"
+#include "host/corvcim/options/SourceArgument.h"
 #include "host/corvcim/overview/OverviewData.h"
 #include "host/corvcim/text/Text.h"
 #include "platform/inventory/ProcessTree.h"
@@ -26,22 +27,29 @@ std::string lineOf(const ProcessorState& state) {
          '\n';
 }
 
-Outcome unknown(const std::string& reason) {
+int healthStatus(Severity worst) {
+  constexpr std::array<int, 4> statuses = {0, 1, 3, 2};
+  return statuses[static_cast<std::size_t>(worst)];
+}
+
+}  // namespace
+
+Outcome unknownHealth(const std::string& reason) {
   Outcome outcome;
-  outcome.output = unknownHealth(reason);
+  outcome.output = std::string(severityName(Severity::Unknown)) + ": " + toPrintable(withGivenNames(reason)) + '\n';
   outcome.status = healthStatus(Severity::Unknown);
   return outcome;
 }
 
-Outcome askHealth(const Options& options) {
+Outcome checkHealth(const Options& options) {
   Dispatcher dispatcher(libraryFiles(options));
   const Answer answer = dispatcher.enumerateInstances({{}, options.nameSpace, "HALDA_CPUProcessor", {}});
   const Response& response = answer.response;
   if (!response.ok() || response.instances.empty()) {
     const std::optional<std::string> error = inventoryError();
-    return unknown(error           ? *error
-                   : response.ok() ? "no processors"
-                                   : "HALDA_CPUProcessor: " + describeStatus(response.rc, response.message));
+    return unknownHealth(error           ? *error
+                         : response.ok() ? "no processors"
+                                         : "HALDA_CPUProcessor: " + describeStatus(response.rc, response.message));
   }
   const auto tree = Tarn::Inventory::processTree();
   std::vector<ProcessorState> states;
@@ -50,17 +58,6 @@ Outcome askHealth(const Options& options) {
   }
   const auto others = unreported(states, *tree);
   return writeHealth(std::move(states), others);
-}
-
-}  // namespace
-
-int healthStatus(Severity worst) {
-  constexpr std::array<int, 4> statuses = {0, 1, 3, 2};
-  return statuses[static_cast<std::size_t>(worst)];
-}
-
-std::string unknownHealth(const std::string& reason) {
-  return std::string(severityName(Severity::Unknown)) + ": " + toPrintable(reason) + '\n';
 }
 
 Outcome writeHealth(std::vector<ProcessorState> states, std::span<const Tarn::Inventory::Node* const> unreported) {
@@ -74,7 +71,7 @@ Outcome writeHealth(std::vector<ProcessorState> states, std::span<const Tarn::In
     }
   }
   if (states.empty()) {
-    return unknown("no processors");
+    return unknownHealth("no processors");
   }
   std::ranges::stable_sort(states, std::greater(), &ProcessorState::severity);
   Outcome outcome;
@@ -83,14 +80,6 @@ Outcome writeHealth(std::vector<ProcessorState> states, std::span<const Tarn::In
   }
   outcome.status = healthStatus(states.front().severity);
   return outcome;
-}
-
-Outcome checkHealth(const Options& options) {
-  try {
-    return askHealth(options);
-  } catch (const std::exception& error) {
-    return unknown(error.what());
-  }
 }
 
 }  // namespace Corvcim

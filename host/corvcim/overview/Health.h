@@ -10,17 +10,14 @@
 
 namespace Corvcim {
 
-/// The exit status of `corvcim health` when this is the worst.
-int healthStatus(Severity worst);
-
-/// A line about something that makes the health unknown: "UNKNOWN: no processors".
-std::string unknownHealth(const std::string& reason);
+/// The exit status and a line for anything that makes the health unknown: "UNKNOWN: no processors".
+Outcome unknownHealth(const std::string& reason);
 
 /// A line for each processor, the worst first, with the exit status for monitoring. `unreported` are the other
 /// processors of the inventory; those that are no empty sockets are unknown.
 Outcome writeHealth(std::vector<ProcessorState> states, std::span<const Tarn::Inventory::Node* const> unreported);
 
-/// Asks the library and the inventory. What goes wrong is a line, too.
+/// Asks the library and the inventory. Failures of either are unknown health.
 Outcome checkHealth(const Options& options);
 
 }  // namespace Corvcim

@@ -262,6 +262,22 @@ TEST(Corvcim, HealthIsALineForEachProcessorAndAStatus) {
             (Finished{2, "FAILED P1: failed; health Critical Failure\nOK P0\n", ""}));
 }
 
+TEST(Corvcim, HealthIsUnknownIfItsSourceCannotBeRead) {
+  EXPECT_EQ(corvcim({"-i", "hwloc:/nowhere.xml", "health"}).status, 3);
+  EXPECT_EQ(shell("\"$corvcim\" health -i - </dev/null"),
+            (Finished{3,
+                      "UNKNOWN: cannot read the inventory: /dev/stdin: it is empty; name a file that holds an "
+                      "inventory\n",
+                      ""}));
+  const Directory directory;
+  const std::string pipe = directory.file("pipe");
+  EXPECT_EQ(shell("mkfifo " + pipe + "; echo '{}' > " + pipe + " & \"$corvcim\" health -i " + pipe),
+            (Finished{3,
+                      "UNKNOWN: cannot read the inventory: " + pipe +
+                          ", /format: is missing; correct the file; the format is described in docs/inventory.md\n",
+                      ""}));
+}
+
 TEST(Corvcim, HealthIsUnknownWhereTheProgramFails) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"health", "-l", "/nowhere/provider.so"}),
             (Finished{3,
