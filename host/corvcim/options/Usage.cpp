@@ -20,8 +20,8 @@ constexpr std::string_view introduction =
 constexpr std::string_view ending =
     "\n"
     "Exit status: 0 success, 1 an operation failed, 2 the command line is wrong;\n"
-    "of diff: 0 no differences, 1 differences, 2 trouble; of health: 0 OK, 1 degraded,\n"
-    "2 failed, 3 unknown.\n"
+    "of diff: 0 no differences, 1 differences, 2 trouble; of health: 0 OK,\n"
+    "1 degraded, 2 failed, 3 unknown.\n"
     "\n"
     "Examples:\n"
     "  corvcim ei HALDA_CPUProcessor DeviceID,Name,MaxClockSpeed\n"
@@ -68,9 +68,10 @@ std::string optionHelp(std::string_view heading, Belongs belongs) {
 }  // namespace
 
 std::string programHelp() {
+  constexpr std::size_t summaryColumn = 29;
   std::string text(introduction);
   for (const VerbSyntax& verb : verbs()) {
-    text += "  " + padRight(callOf(verb), 27) + std::string(verb.summary) + '\n';
+    text += "  " + padRight(callOf(verb), summaryColumn - 2) + wrapped(verb.summary, summaryColumn) + '\n';
   }
   text += optionHelp("Options", [](const OptionSyntax& option) { return !option.longName.empty(); });
   text +=

@@ -16,7 +16,8 @@ constexpr std::string_view pathDetails =
     "as ein prints it; the namespace may be left out.\n";
 
 constexpr std::string_view classDetails =
-    "CLASS is a class name, with or without a namespace before it (root/cimv2:HALDA_CPUMemory).\n";
+    "CLASS is a class name, with or without a namespace before it\n"
+    "(root/cimv2:HALDA_CPUMemory).\n";
 
 constexpr std::string_view associatorDetails =
     "PATH is an object path as ein prints it; the namespace may be left out.\n"
@@ -24,7 +25,8 @@ constexpr std::string_view associatorDetails =
 
 constexpr std::string_view referenceDetails =
     "PATH is an object path as ein prints it; the namespace may be left out.\n"
-    "Without -arc (or -ac) every association class that PATH's class takes part in is asked.\n";
+    "Without -arc (or -ac) every association class that PATH's class takes part in\n"
+    "is asked.\n";
 
 constexpr std::string_view inventoryDetails =
     "--from converts what hwloc describes, so that the library can be tried on it:\n"
@@ -42,7 +44,8 @@ constexpr std::string_view diffDetails =
 
 constexpr std::string_view explainDetails =
     "PART is a path of the inventory (P0, P0.L2.0), an object path as ein prints it,\n"
-    "CLASS.KEY (HALDA_CPUMemory.P0.L2.0) or CLASS. Without it: every processor, short.\n"
+    "CLASS.KEY (HALDA_CPUMemory.P0.L2.0) or CLASS. Without it: every processor in\n"
+    "short.\n"
     "PROPERTY is one or more names with commas between them.\n"
     "Of each property: the raw datum and the file or table it stands in, the\n"
     "inventory's value and the rule that made it, what the library does with it,\n"

@@ -171,7 +171,7 @@ TEST(Corvcim, ShowsVersionAndHelp) {
                     "Shows the paths of every instance.\n"
                     "Output: text, table, csv, mof or json.\n"
                     "\n"
-                    "CLASS is a class name, with or without a namespace before it "
+                    "CLASS is a class name, with or without a namespace before it\n"
                     "(root/cimv2:HALDA_CPUMemory).\n"
                     "\n"
                     "Options:\n"

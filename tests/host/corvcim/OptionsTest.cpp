@@ -3,7 +3,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <sstream>
+#include <string>
 #include <vector>
+
+#include "host/corvcim/options/Usage.h"
 
 namespace Corvcim {
 namespace {
@@ -235,6 +239,17 @@ TEST(Options, OptionsOfOneVerbAreRefusedByTheOthers) {
 TEST(Options, LanguagesBelongToText) {
   EXPECT_EQ(complaint({"ei", "A", "--language", "de", "-o", "json"}),
             "'--language' is for text: csv, mof and json are the same in every language; see 'corvcim --help'");
+}
+
+TEST(Options, HelpFitsInEightyColumns) {
+  std::string help = programHelp();
+  for (const VerbSyntax& syntax : verbs()) {
+    help += verbHelp(syntax);
+  }
+  std::istringstream lines(help);
+  for (std::string line; std::getline(lines, line);) {
+    EXPECT_LE(line.size(), 80U) << line;
+  }
 }
 
 TEST(Options, EveryVerbIsFoundByItsName) {
