@@ -182,6 +182,20 @@ Outcome performAsTyped(const LibraryFiles& files, const Options& options) {
   return outcome;
 }
 
+/// Providers of associations answer for a path that names nothing as for an element without links.
+std::vector<std::string> describeMissingSource(const LibraryFiles& files, const Operation& operation,
+                                               const Response& response) {
+  if (!isAssociationOperation(operation.kind) || !isEmpty(response)) {
+    return {};
+  }
+  Operation request;
+  request.kind = OperationKind::GetInstance;
+  request.path = operation.path;
+  const Response source = Dispatcher(files).perform(request).response;
+  return source.rc == CMPI_RC_ERR_NOT_FOUND ? std::vector{describeStatus(source.rc, source.message)}
+                                            : std::vector<std::string>();
+}
+
 Outcome performAsBroker(const LibraryFiles& files, const Options& options) {
   const Operation operation = withoutEmptyFilters(operationOf(options));
   checkRequest(operation);
@@ -196,6 +210,7 @@ Outcome performAsBroker(const LibraryFiles& files, const Options& options) {
     outcome.errors.push_back(*unreadable);
   } else if (answer.response.ok()) {
     std::ranges::move(describeMissingResults(operation, answer.response), std::back_inserter(outcome.errors));
+    std::ranges::move(describeMissingSource(files, operation, answer.response), std::back_inserter(outcome.errors));
   }
   return outcome;
 }

@@ -23,6 +23,16 @@ TEST(CorvcimErrors, WhatIsNotThereIsNotFound) {
                    "root/cimv2:HALDA_CPUProcessorCore.InstanceID=\"P0.C9\""));
 }
 
+TEST(CorvcimErrors, AssociationsOfAMissingInstanceAreNotFound) {
+  const std::string core = "HALDA_CPUProcessorCore.InstanceID=\"P0.C9\"";
+  for (const std::string verb : {"ai", "ain", "ri", "rin"}) {
+    EXPECT_EQ(corvcimOn(twoCoreMachine(), {verb, core}).errors,
+              failed(verb + ' ' + core + ": CIM_ERR_NOT_FOUND: there is no instance root/cimv2:" + core).errors);
+    EXPECT_EQ(corvcimOn(twoCoreMachine(), {verb, corePath("P0.C0"), "-ar", "Antecedent"}), success(""))
+        << "the instance is there, and has no such role";
+  }
+}
+
 TEST(CorvcimErrors, ClassAndPathAreNotMistakenForEachOther) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"gi", "HALDA_CPUMemory"}),
             failed("gi HALDA_CPUMemory: this is a class, and gi takes the path of an instance; ein lists the paths of "
