@@ -36,7 +36,7 @@ void describeMasks(std::string& text, const std::vector<std::string>& masks) {
     comment(text, "Masked: nothing; no identifier of this machine was read.");
     return;
   }
-  comment(text, "Masked, at equal length, is what tells this machine from others of its kind:");
+  comment(text, "Masked at equal length, because it identifies this machine:");
   for (const std::string& mask : masks) {
     comment(text, "  " + mask);
   }

@@ -105,7 +105,7 @@ TEST_F(SnapshotCommand, IsTakenOfWhatGivesNoInventory) {
 
   EXPECT_EQ(run.status, 1);
   EXPECT_THAT(run.output, testing::EndsWith("[proc]\ncpuinfo! EIO\n"));
-  EXPECT_THAT(run.errors, testing::HasSubstr("tells of a processor"));
+  EXPECT_THAT(run.errors, testing::HasSubstr("lists a processor"));
 }
 
 TEST_F(SnapshotCommand, SaysWhatItCanNotDo) {

@@ -16,8 +16,7 @@ namespace {
 
 using namespace NodeLexicon;
 
-constexpr const char* withoutTables =
-    "it is there on machines whose firmware has SMBIOS tables; they tell of sockets, their state and their clocks";
+constexpr const char* withoutTables = "needs firmware with SMBIOS tables, which list sockets, their states and clocks";
 // Nothing is wrong then: nobody but root may read the tables, as serial numbers stand in them.
 constexpr const char* forRoot = "run as root to see the sockets, their state and their clocks as well";
 constexpr const char* brokenTables = "what is sound in the table counts; newer firmware may mend it";

@@ -72,7 +72,7 @@ class CacheReader {
       if (index == 0 && topology_.online.contains(cpu)) {
         machine_.noteUnreadOfCpu(cpu, "cache",
                                  "mount sysfs on /sys; "
-                                 "some virtual machines have no such directory");
+                                 "some kernels and virtual machines report no caches");
       }
     }
     dropUnplaced();

@@ -16,6 +16,9 @@ std::string reasonOf(FileError error) {
 }
 
 std::string remedyOf(FileError error, const std::string& otherwise) {
+  if (error == 0) {
+    return "correct the file if it was captured; on a running machine the kernel is at fault";
+  }
   return error == EACCES || error == EPERM ? "run as root, or let this process read it" : otherwise;
 }
 

@@ -99,7 +99,7 @@ Found systemModel(Machine& machine, const Facts* firmware) {
   }
   // Beside tables that are there, the kernel's file is not missed.
   if (error != 0 && !(error == ENOENT && firmware != nullptr)) {
-    machine.noteUnread(file, error, "it is there on machines whose firmware has DMI tables");
+    machine.noteUnread(file, error, "needs firmware with DMI tables");
   }
   return hypervisorModel(machine);
 }

@@ -197,7 +197,7 @@ class TopologyReader {
       } else if (Package* package = packageBySiblings(cpu)) {
         addToCore(cpu, place, *package);
       } else {
-        machine_.noteUnreadOfCpu(cpu, "topology", "nothing tells which processor the CPU belongs to", mountSys);
+        machine_.noteUnreadOfCpu(cpu, "topology", "no file names the CPU's processor", mountSys);
       }
     }
   }

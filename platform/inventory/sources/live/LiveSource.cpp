@@ -176,8 +176,8 @@ Tree readLiveInventory(FileSystem& root, Detail detail) {
   reader.readFirmware();
   if (!reader.knowsProcessors()) {
     throw InventoryError("cannot read the inventory", root.nameOf(kernelCpuDirectory),
-                         "neither this directory nor /proc/cpuinfo tells of a processor",
-                         "mount sysfs on /sys and proc on /proc");
+                         "neither this directory nor /proc/cpuinfo lists a processor",
+                         "mount sysfs on /sys and proc on /proc; a captured root holds both as sys and proc");
   }
   return reader.read();
 }
@@ -189,7 +189,7 @@ Tree readFirmwareInventory(FileSystem& root, Detail detail) {
   if (!reader.knowsProcessors()) {
     const std::vector<Unread> unread = reader.unread();
     throw InventoryError("cannot read the inventory", root.nameOf(tableFile),
-                         unread.empty() ? "its tables tell of no processor socket" : unread.front().reason,
+                         unread.empty() ? "its tables list no processor socket" : unread.front().reason,
                          "name a dump of a machine's SMBIOS tables, or join it with another source: smbios:FILE+live");
   }
   return reader.read();

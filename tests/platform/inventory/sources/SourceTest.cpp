@@ -178,7 +178,7 @@ TEST(Source, RefusesADumpWithoutSockets) {
 
   EXPECT_EQ(refusalOf("smbios:" + file),
             "cannot read the inventory: " + file +
-                ": its tables tell of no processor socket; name a dump of a machine's SMBIOS tables, or join it with "
+                ": its tables list no processor socket; name a dump of a machine's SMBIOS tables, or join it with "
                 "another source: smbios:FILE+live");
 }
 
@@ -197,8 +197,8 @@ TEST(Source, RefusesARootWithoutAnyProcessor) {
   const ScratchDirectory directory;
   EXPECT_EQ(refusalOf("root:" + directory.name()),
             "cannot read the inventory: " + directory.name() +
-                "/sys/devices/system/cpu: neither this directory nor /proc/cpuinfo tells of a processor; mount sysfs "
-                "on /sys and proc on /proc");
+                "/sys/devices/system/cpu: neither this directory nor /proc/cpuinfo lists a processor; mount sysfs "
+                "on /sys and proc on /proc; a captured root holds both as sys and proc");
 }
 
 TEST(Source, RefusesAFileThatHoldsNoCapture) {

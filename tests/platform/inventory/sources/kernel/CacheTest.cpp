@@ -287,8 +287,9 @@ TEST(Cache, NoneAtAllIsTold) {
   const Tree tree = cores(3).tree();
 
   EXPECT_TRUE(tree.ofType(NodeCacheMemory).empty());
-  EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/devices/system/cpu/cpu{0-2}/cache", "no such file or directory",
-                                             "mount sysfs on /sys; some virtual machines have no such directory"}));
+  EXPECT_THAT(tree.unread(),
+              Contains(Unread{"/sys/devices/system/cpu/cpu{0-2}/cache", "no such file or directory",
+                              "mount sysfs on /sys; some kernels and virtual machines report no caches"}));
 }
 
 }  // namespace

@@ -91,7 +91,7 @@ TEST(SystemModel, IsAbsentWhereNothingTellsIt) {
   EXPECT_EQ(textAt(tree, "system", PropSystemModel), std::nullopt);
   ASSERT_EQ(tree.unread().size(), 2U);
   EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/class/dmi/id/product_name", "no such file or directory",
-                                             "it is there on machines whose firmware has DMI tables"}));
+                                             "needs firmware with DMI tables"}));
 }
 
 TEST(SystemModel, ThatMayNotBeReadIsTold) {

@@ -224,9 +224,8 @@ TEST(Topology, APackageThatCannotBeReadNeverMakesAProcessor) {
 
   EXPECT_EQ(pathsOf(tree, NodeProcessor), Paths{"P3"});
   EXPECT_EQ(nodeAt(tree, "P3").cpus, CpuSet{1});
-  EXPECT_THAT(tree.unread(),
-              Contains(Unread{"/sys/devices/system/cpu/cpu0/topology",
-                              "nothing tells which processor the CPU belongs to", "mount sysfs on /sys"}));
+  EXPECT_THAT(tree.unread(), Contains(Unread{"/sys/devices/system/cpu/cpu0/topology",
+                                             "no file names the CPU's processor", "mount sysfs on /sys"}));
 
   files.file("proc/cpuinfo", "processor\t: 0\ncpu family\t: 6\nphysical id\t: 3\n");
   EXPECT_EQ(nodeAt(files.tree(), "P3").cpus, (CpuSet{0, 1})) << "unless /proc/cpuinfo tells it";
@@ -323,7 +322,8 @@ TEST(Topology, ListsWithNonsenseAreTold) {
 
   EXPECT_EQ(pathsOf(tree, NodeProcessorCore), Paths{"P0.C0"});
   EXPECT_THAT(tree.unread(),
-              Contains(Unread{"/sys/devices/system/cpu/present", "it holds no usable value", "mount sysfs on /sys"}));
+              Contains(Unread{"/sys/devices/system/cpu/present", "it holds no usable value",
+                              "correct the file if it was captured; on a running machine the kernel is at fault"}));
 }
 
 TEST(Topology, OnlineCpusCountAsPresent) {

@@ -72,8 +72,8 @@ TEST(Firmware, ThatIsNotThereIsReported) {
   const Tree tree = packages(1).remove("sys/firmware/dmi/tables/DMI").tree();
 
   EXPECT_THAT(tree.unread(), ElementsAre(Unread{"/sys/firmware/dmi/tables/DMI", "no such file or directory",
-                                                "it is there on machines whose firmware has SMBIOS tables; they tell "
-                                                "of sockets, their state and their clocks"}));
+                                                "needs firmware with SMBIOS tables, which list sockets, their states "
+                                                "and clocks"}));
 }
 
 TEST(Firmware, ThatIsBrokenIsReportedAndTheRestIsUsed) {

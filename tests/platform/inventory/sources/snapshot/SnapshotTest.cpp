@@ -117,8 +117,7 @@ TEST(Snapshot, SaysInItsHeadWhatIsMasked) {
   EXPECT_THAT(masked, testing::StartsWith("# corvane-snapshot 1\n"
                                           "# The files that corvcim 9 read for the inventory; source: root\n"
                                           "# To read the same inventory anywhere: corvcim --inventory snapshot:FILE\n"
-                                          "# Masked, at equal length, is what tells this machine from others of its "
-                                          "kind:\n"
+                                          "# Masked at equal length, because it identifies this machine:\n"
                                           "#   proc/cpuinfo: Serial\n"));
   EXPECT_THAT(masked, testing::Not(testing::HasSubstr("a1b2c3d4")));
   EXPECT_THAT(kept, testing::StartsWith("# corvane-snapshot 1\n"
@@ -141,7 +140,7 @@ TEST(Snapshot, OfWhatGivesNoInventoryIsTakenAllTheSame) {
   const Snapshot snapshot = takeSnapshot("root:" + root, Identifiers::Masked, "test");
   const std::string file = directory.write("snapshot", snapshot.text);
 
-  EXPECT_THAT(snapshot.error, testing::HasSubstr("neither this directory nor /proc/cpuinfo tells of a processor"));
+  EXPECT_THAT(snapshot.error, testing::HasSubstr("neither this directory nor /proc/cpuinfo lists a processor"));
   EXPECT_THAT(snapshot.text,
               testing::HasSubstr("\n# No inventory came of it; reading this file as a source says why.\n"));
   EXPECT_THAT(snapshot.text, testing::Not(testing::HasSubstr("neither"))) << "the error names directories";
