@@ -21,12 +21,21 @@ namespace {
 
 enum ExitStatus { Success = 0, Failed = 1, WrongUsage = 2 };
 
-/// Comparisons say with 1 that something differs, as diff(1) does, so that their failures are 2.
+/// The status 1 of comparisons means that something differs, as that of diff(1), so their failures are 2.
 constexpr int Differs = 1;
 constexpr int ComparisonFailed = 2;
+/// The statuses 1 and 2 of health are those of processors.
+constexpr int HealthUnknown = 3;
 
 int failureStatus(const Corvcim::Options& options) {
-  return options.verb->verb == Corvcim::Verb::Diff ? ComparisonFailed : Failed;
+  switch (options.verb->verb) {
+    case Corvcim::Verb::Diff:
+      return ComparisonFailed;
+    case Corvcim::Verb::Health:
+      return HealthUnknown;
+    default:
+      return Failed;
+  }
 }
 
 /// What the user's terminal shows. Widths of characters follow the same locale.

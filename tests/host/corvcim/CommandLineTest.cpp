@@ -278,6 +278,11 @@ TEST(Corvcim, HealthIsUnknownIfItsSourceCannotBeRead) {
                       ""}));
 }
 
+TEST(Corvcim, HealthThatCannotBeWrittenIsUnknown) {
+  EXPECT_EQ(shell("\"$corvcim\" health >/dev/full"),
+            (Finished{3, "", "corvcim: standard output: No space left on device\n"}));
+}
+
 TEST(Corvcim, HealthIsUnknownWhereTheProgramFails) {
   EXPECT_EQ(corvcimOn(twoCoreMachine(), {"health", "-l", "/nowhere/provider.so"}),
             (Finished{3,
