@@ -26,7 +26,9 @@ target_compile_definitions(corvane_options INTERFACE _FILE_OFFSET_BITS=64)
 target_include_directories(corvane_options INTERFACE ${PROJECT_SOURCE_DIR})
 
 # For code that runs once or waits for the kernel: its size in a daemon matters more than its speed.
-set(CORVANE_SMALL $<$<NOT:$<BOOL:${CORVANE_SANITIZE}>>:-Os>)
+if(NOT CORVANE_SANITIZE)
+  set(CORVANE_SMALL -Os)
+endif()
 
 if(CORVANE_SANITIZE)
   # In front of each target's own options, which can override them.

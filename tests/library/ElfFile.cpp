@@ -16,7 +16,7 @@ namespace {
 class Bytes {
  public:
   explicit Bytes(const std::string& path) {
-    bytes_.resize(std::filesystem::file_size(path));
+    bytes_.resize(static_cast<std::size_t>(std::filesystem::file_size(path)));
     std::ifstream(path, std::ios::binary).read(bytes_.data(), static_cast<std::streamsize>(bytes_.size()));
   }
 
