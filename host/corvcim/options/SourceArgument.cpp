@@ -33,7 +33,7 @@ constexpr std::string_view standardInput = "/dev/stdin";
 constexpr std::string_view hwlocFile = "hwloc:";
 constexpr std::string_view hwlocText = "hwloc-synthetic:";
 
-/// What is kept in memory until the program ends: its name there, and the one that the user gave.
+/// A one-time source in memory, kept until the program ends, with the name that the user gave.
 struct KeptFile {
   FileDescriptor file;
   std::string name;
@@ -97,7 +97,7 @@ FileDescriptor fileInMemory(std::string_view contents, const std::string& name) 
   return file;
 }
 
-/// Keeps the contents and returns their source, which the scheme stands in front of.
+/// Keeps the contents and returns the source that names them, beginning with the scheme.
 std::string keep(std::string_view scheme, std::string_view contents, const std::string& given) {
   FileDescriptor file = fileInMemory(contents, given);
   std::string name = std::string(scheme) + "/dev/fd/" + std::to_string(file.number());

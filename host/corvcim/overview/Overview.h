@@ -19,7 +19,7 @@ Outcome showOverview(Dispatcher& dispatcher, const Options& options);
 /// the kernel reports of a virtual machine's processors, and what could not be read.
 std::string writeOverview(const OverviewData& data, const Tarn::Inventory::Tree& tree);
 
-/// The same for programs, each processor by itself: codes and numbers in base units, null for what is not known.
+/// The overview as JSON: each processor separately, codes and numbers in base units, null for unknown values.
 std::string writeOverviewAsJson(const OverviewData& data, const Tarn::Inventory::Tree& tree);
 
 /// A row for each processor, with the same properties for all.

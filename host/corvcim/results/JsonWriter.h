@@ -10,9 +10,8 @@
 
 namespace Corvcim {
 
-/// For programs. Each instance is an object with "class", "namespace", "path" and "properties"; codes
-/// and numbers stand as they are, references as paths. Properties of the class that were selected and
-/// have no value are null.
+/// Each instance is an object with "class", "namespace", "path" and "properties"; codes and numbers are
+/// numbers, references are paths. Properties of the class that were selected and have no value are null.
 std::string instancesAsJson(std::span<const Instance> instances, const PropertyList& selection);
 std::string instanceAsJson(const Instance& instance, const PropertyList& selection);
 

@@ -23,12 +23,12 @@ std::vector<Instance> keysOf(std::span<const ObjectPath> paths);
 // One row for each instance, under a row with the names of the columns. An empty list of columns means the keys.
 // Without a list, the columns are all properties of the classes, after the column Class if there are several.
 
-/// For people: columns aligned, values as instancesAsText shows them, "-" for what is not known.
+/// Aligned columns; values as instancesAsText shows them, "-" for unknown values.
 std::string rowsAsTable(std::span<const Instance> rows, const ColumnList& columns);
 
-/// For programs, as RFC 4180 has it: fields with commas, quotes or line ends stand in quotes, lines end with CRLF.
-/// Codes and numbers stand as they are, references as paths, lists as JSON writes them. What is not known is an empty
-/// field, an empty text is "".
+/// Rows as RFC 4180 defines them: fields with commas, quotes or line ends are quoted, lines end with CRLF. Codes and
+/// numbers are written as numbers, references as paths, lists as JSON. An unknown value is an empty field, an empty
+/// text is "".
 std::string rowsAsCsv(std::span<const Instance> rows, const ColumnList& columns);
 
 /// As one of them: the format is Table or Csv.
